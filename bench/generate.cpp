@@ -1,0 +1,41 @@
+// Writes a command file of a chosen kind and size to standard output.
+
+#include <iostream>
+
+#include <CLI/CLI.hpp>
+
+#include "bench/kinds.h"
+
+int main(int argc, char **argv) {
+    CLI::App app("Writes a command file that declares, connects and writes a design.",
+                 "vesk_hdl_generate");
+    std::string kindName;
+    long n = 0;
+    std::string vhdlFile;
+    std::string verilogFile;
+    app.add_option("KIND", kindName, "What the design is like")->required();
+    app.add_option("N", n, "How large it is")->required()->check(CLI::NonNegativeNumber);
+    app.add_option("--vhdl", vhdlFile, "End with a line that writes this VHDL file");
+    app.add_option("--verilog", verilogFile, "End with a line that writes this Verilog file");
+    std::string footer = "Kinds:\n";
+    for (Kind const &kind : GetKinds())
+        footer.append("  ")
+            .append(kind.name)
+            .append(": ")
+            .append(kind.shape)
+            .append("; N counts ")
+            .append(kind.counts)
+            .append("\n");
+    app.footer(footer);
+    CLI11_PARSE(app, argc, argv);
+
+    Kind const *const kind = FindKind(kindName);
+    if (!kind) {
+        std::cerr << kindName << ": no such kind\n" << footer;
+        return 2;
+    }
+    std::ios::sync_with_stdio(false);
+    WriteDesign(std::cout, *kind, n, vhdlFile, verilogFile);
+    std::cout.flush();
+    return std::cout ? 0 : 1;
+}

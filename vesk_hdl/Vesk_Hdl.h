@@ -1,0 +1,28 @@
+#pragma once
+
+// The whole exported interface and the types of the base layer that it uses. Begin with Engine.
+
+#include "vesk_hdl/engine/HdlCmd.h"
+#include "vesk_hdl/engine/HdlEngine.h"
+#include "vesk_hdl/hdl/HdlUtilities.h"
+#include "vesk_hdl/hdl/NetlistHeader.h"
+#include "vesk_hdl/hdl/VerilogNetlister.h"
+#include "vesk_hdl/hdl/VerilogStatements.h"
+#include "vesk_hdl/hdl/VhdlNetlister.h"
+#include "vesk_hdl/hdl/VhdlStatements.h"
+#include "vesk_hdl/model/HdlModel.h"
+#include "vesk_hdl/model/HdlOptions.h"
+#include "vesk_hdl/netlist/Attribute.h"
+#include "vesk_hdl/netlist/Netlist.h"
+#include "vesk_hdl/netlist/NetlistFwd.h"
+#include "vesk_hdl/netlist/Object.h"
+#include "vesk_hdl/netlist/Pin.h"
+#include "vesk_hdl/netlist/Signal.h"
+#include "vesk_hdl/netlist/Values.h"
+#include "vesk_hdl/text/Exception.h"
+#include "vesk_hdl/text/IStringPtrMap.h"
+#include "vesk_hdl/text/OutStream.h"
+#include "vesk_hdl/text/PtrArray.h"
+#include "vesk_hdl/text/StringArray.h"
+#include "vesk_hdl/text/StringSet.h"
+#include "vesk_hdl/text/basis/Basis.h"

@@ -1,0 +1,415 @@
+#include "vesk_hdl/hdl/VerilogNetlister.h"
+
+#include <string>
+
+#include "vesk_hdl/hdl/HdlUtilities.h"
+#include "vesk_hdl/hdl/Pieces.h"
+#include "vesk_hdl/hdl/Translate.h"
+#include "vesk_hdl/hdl/VerilogStatements.h"
+#include "vesk_hdl/netlist/Netlist.h"
+#include "vesk_hdl/text/basis/Functions.h"
+
+using namespace Vesk_Hdl;
+using Text = Basis::StringBase<char>;
+
+namespace {
+
+using VerilogOption = HdlOptions::VerilogOption;
+
+/// Separates the items of a list: on one line, or each under the first one.
+class ListSeparator {
+public:
+    ListSeparator(OutStream &out, bool onePerLine, std::size_t column)
+        : stream(out), isOnePerLine(onePerLine), padding(onePerLine ? column : 0, ' ') {}
+    void Next() {
+        if (!first)
+            stream << ", ";
+        if (!first && isOnePerLine)
+            Put(stream, EOL, padding.c_str());
+        first = false;
+    }
+
+private:
+    OutStream &stream;
+    bool isOnePerLine;
+    std::string padding;
+    bool first = true;
+};
+
+/// Writes the signal side of a pin connection.
+class WriteSignalVisitor : public SignalVisitor {
+public:
+    WriteSignalVisitor(OutStream &out, VerilogStatements const &verilog)
+        : stream(out), statements(verilog) {}
+
+    void VisitScalarSignal(ScalarSignal *signal) override {
+        if (!IsOpen(*signal))
+            stream << signal->GetNameRef();
+    }
+    void VisitBus(Bus *bus) override {
+        Text name = bus->GetName();
+        if (bus->GetWidth() == 1 && Bus::IsBusName(name))
+            name = Bus::GetBusSliceName(name, 0, 1);
+        WriteBracketed(*bus, name);
+    }
+    void VisitBusSlice(BusSlice *slice) override { WriteBracketed(*slice, slice->GetName()); }
+    void VisitBusIndex(BusIndex *index) override { WriteBracketed(*index, index->GetName()); }
+    void VisitCompoundBus(CompoundBus *compound) override {
+        if (compound->GetSize() == 0)
+            return;
+        stream << "{";
+        char const *separator = "";
+        ForEach(compound->GetBusMemberIterator(), [&](Signal *member) {
+            stream << separator;
+            member->AcceptSignal(*this);
+            separator = ", ";
+        });
+        stream << "}";
+    }
+
+private:
+    static bool IsOpen(Signal const &signal) {
+        return signal.GetNameRef().IsEmpty() || Basis::stricmp(signal.GetNameRef(), "open") == 0;
+    }
+
+    void WriteBracketed(Signal const &signal, Text name) {
+        if (IsOpen(signal))
+            return;
+        statements.NormalizeBusName(name);
+        stream << name;
+    }
+
+    OutStream &stream;
+    VerilogStatements const &statements;
+};
+
+bool IsDeclaredPort(Signal const &signal) { return signal.IsPort() && signal.IsNeededToDeclared(); }
+bool IsDeclaredWire(Signal const &signal) {
+    return !signal.IsPort() && signal.IsNeededToDeclared();
+}
+
+} // namespace
+
+namespace Vesk_Hdl {
+
+VerilogNetlister::VerilogNetlister(OutStream &out)
+    : statements(std::make_unique<VerilogStatements>(out)), stream(&out) {}
+VerilogNetlister::~VerilogNetlister() = default;
+
+void VerilogNetlister::WriteNetlist(Netlist *netlist, HdlOptions const &options) {
+    if (!netlist)
+        return;
+    netlist->SortNetlist();
+    netlist->CreateVhdlDummySignals(); // the VHDL pass, so that both languages get one structure
+    SetNameCase(netlist, options);
+
+    Text const name = netlist->GetName();
+    auto const holds = [&name](char const *text) {
+        return name.GetIndexOfString(text, Text::COMPARE_EXACT) != Basis::NOT_FOUND;
+    };
+    options.macroNetlist = (holds("MORVANE") || holds("HORVANE")) && InitDefined(netlist);
+
+    if (options.writeHeader)
+        HdlUtilities::WriteHeader(name, false, options, *stream);
+    statements->WriteComment(netlist);
+    statements->WriteIncludePath(options.verilogOption.includes);
+    statements->WriteTimeScale("1ns", "1ps");
+    *stream << EOL;
+    Iterator<Signal *> const signals = netlist->GetSignalIterator();
+    WriteModulelAndPorts(name, signals, options);
+    stream->Indent();
+    WriteParameters(netlist);
+    WritePortDeclarations(signals, options);
+    WriteSignalDeclarations(signals, options);
+    WriteSignalAssignments(signals);
+    WriteInstances(netlist->GetInstanceIterator(), options);
+    stream->Unindent();
+    Put(*stream, "endmodule", EOL);
+}
+
+/// Only the names of signals, components and instances are touched.
+void VerilogNetlister::SetNameCase(Netlist *netlist, HdlOptions const &options) {
+    auto const setCase = [this](auto objects, VerilogOption::CaseType type) {
+        if (type != VerilogOption::CASE_DEFAULT)
+            ForEach(objects, [this, type](Object *object) {
+                SetNameCase(object, type == VerilogOption::CASE_UPPER);
+            });
+    };
+    setCase(netlist->GetSignalIterator(), options.verilogOption.signalCase);
+    setCase(netlist->GetComponentIterator(), options.verilogOption.componentCase);
+    setCase(netlist->GetInstanceIterator(), options.verilogOption.instanceCase);
+}
+
+void VerilogNetlister::SetNameCase(Object *object, bool upper) {
+    Text name = object->GetName();
+    if (upper)
+        name.MakeUpper();
+    else
+        name.MakeLower();
+    object->SetName(name);
+}
+
+/// Whether the macro takes INIT as a parameter of its own. Unlike in VHDL, one of option "NOSYN"
+/// does not count: meant so.
+bool VerilogNetlister::InitDefined(Netlist const *netlist) {
+    bool defined = false;
+    if (netlist && netlist->HasAttrs())
+        ForEach(netlist->GetAttrIterator(), [&defined](Attribute const *attr) {
+            defined |= attr->IsGenericSyn() && attr->GetNameRef() == "INIT";
+        });
+    return defined;
+}
+
+void VerilogNetlister::GetGenericAttrs(Iterator<Attribute *> &attrs, PtrArray<Attribute *> &syn,
+                                       PtrArray<Attribute *> &nosyn) {
+    attrs.Rewind();
+    ForEach(attrs, [&](Attribute *attr) {
+        if (attr->IsGenericSyn())
+            syn.Add(attr);
+        else if (attr->IsGenericNoSyn())
+            nosyn.Add(attr);
+    });
+}
+
+void VerilogNetlister::WriteModulelAndPorts(Text const &name, Iterator<Signal *> const &signals,
+                                            HdlOptions const &options) {
+    Put(*stream, "module", " ", name, "(");
+    ListSeparator separator(*stream, options.portOnePerLine, name.GetLength() + 8);
+    ForEach(signals, [&](Signal const *signal) {
+        if (!IsDeclaredPort(*signal))
+            return;
+        separator.Next();
+        bool const isBus = signal->GetSignalType() == Signal::SIGNAL_BUS;
+        *stream << (isBus ? Object::GetBaseName(signal->GetNameRef()) : signal->GetName());
+    });
+    Put(*stream, ");", EOL, EOL);
+}
+
+/// Writes items as lines, those for simulation only between translate marks.
+template <class WriteItem>
+void VerilogNetlister::WriteGenerics(PtrArray<Attribute *> const &syn,
+                                     PtrArray<Attribute *> const &nosyn, WriteItem writeItem) {
+    auto const writeLine = [this, &writeItem](Attribute const *attr) {
+        writeItem(attr);
+        Put(*stream, ";", EOL);
+    };
+    ForEach(syn, writeLine);
+    if (nosyn.IsEmpty())
+        return;
+    Put(*stream, Translate::VERILOG_OFF, EOL);
+    ForEach(nosyn, writeLine);
+    Put(*stream, Translate::VERILOG_ON, EOL);
+}
+
+void VerilogNetlister::WriteParameters(Netlist const *netlist) {
+    if (!netlist || !netlist->HasAttrs())
+        return;
+    PtrArray<Attribute *> syn;
+    PtrArray<Attribute *> nosyn;
+    Iterator<Attribute *> attrs = netlist->GetAttrIterator();
+    GetGenericAttrs(attrs, syn, nosyn);
+    WriteGenerics(syn, nosyn,
+                  [this](Attribute const *attr) { statements->WriteParameterStatement(attr); });
+    if (!syn.IsEmpty() || !nosyn.IsEmpty())
+        *stream << EOL;
+}
+
+/// Ends a statement, with its attributes inside it or behind it.
+template <class WriteAttrs>
+void VerilogNetlister::EndWithAttrs(HdlOptions const &options, WriteAttrs writeAttrs) {
+    bool const before = options.verilogOption.IsSemiColonWrittenBeforeAttr();
+    if (before)
+        Put(*stream, ";", EOL);
+    writeAttrs();
+    if (!before)
+        Put(*stream, ";", EOL);
+}
+
+void VerilogNetlister::WritePortDeclarations(Iterator<Signal *> const &signals,
+                                             HdlOptions const &options) {
+    ForEach(signals, [&](Signal const *signal) {
+        if (WritePortDeclaration(signal))
+            EndWithAttrs(options, [&] { WriteSynthesisAttr(signal, options); });
+    });
+    *stream << EOL;
+}
+
+bool VerilogNetlister::WritePortDeclaration(Signal const *signal) {
+    if (!signal || !IsDeclaredPort(*signal))
+        return false;
+    statements->WriteComment(signal);
+    statements->WritePortDeclaration(signal->GetNameRef(), signal->GetPortPolarity());
+    return true;
+}
+
+void VerilogNetlister::WriteSignalDeclarations(Iterator<Signal *> const &signals,
+                                               HdlOptions const &options) {
+    ForEach(signals, [&](Signal const *signal) {
+        if (WriteSignalDeclaration(signal))
+            EndWithAttrs(options, [&] { WriteSynthesisAttr(signal, options); });
+    });
+    *stream << EOL;
+}
+
+bool VerilogNetlister::WriteSignalDeclaration(Signal const *signal) {
+    if (!signal || !IsDeclaredWire(*signal))
+        return false;
+    statements->WriteComment(signal);
+    statements->WriteSignalDeclaration(signal->GetNameRef());
+    return true;
+}
+
+/// Constants first, then what is assigned from another signal.
+void VerilogNetlister::WriteSignalAssignments(Iterator<Signal *> const &signals) {
+    ForEach(signals, [this](Signal const *signal) {
+        if (!signal->HasConstantValue())
+            return;
+        Signal::SignalType const type = signal->GetSignalType();
+        bool const isScalar = type == Signal::SIGNAL_SCALAR || type == Signal::SIGNAL_BUS_INDEX;
+        statements->WriteConstantSignalAssignment(signal->GetNameRef(), isScalar,
+                                                  signal->GetConstantValue());
+        Put(*stream, ";", EOL);
+    });
+    ForEach(signals, [this](Signal const *target) {
+        ForEach(target->GetSignalIterator(), [this, target](Signal const *source) {
+            statements->WriteSignalAssignment(target->GetNameRef(), source->GetNameRef());
+            Put(*stream, ";", EOL);
+        });
+    });
+}
+
+void VerilogNetlister::WriteInstances(Iterator<Instance *> const &instances,
+                                      HdlOptions const &options) {
+    ForEach(instances, [&](Instance const *instance) {
+        if (!WriteInstance(instance, options))
+            return;
+        EndWithAttrs(options, [&] { WriteSynthesisAttr(instance, options); });
+        WriteDefParam(instance, options);
+    });
+}
+
+/// The component's comment is repeated at each instance.
+bool VerilogNetlister::WriteInstance(Instance const *instance, HdlOptions const &options) {
+    if (!instance)
+        return false;
+    Text const componentName = instance->GetComponentName();
+    Text const &instanceName = instance->GetNameRef();
+    statements->WriteComment(instance->GetComponent());
+    statements->WriteComment(instance);
+    Put(*stream, componentName, " ", instanceName, " ", "(");
+    ListSeparator separator(*stream, options.portOnePerLine,
+                            componentName.GetLength() + instanceName.GetLength() + 3);
+    WriteSignalVisitor visitor(*stream, *statements);
+    ForEach(instance->GetPinIterator(), [&](Pin const *pin) {
+        separator.Next();
+        Put(*stream, ".", pin->GetBaseName(), "(");
+        if (Signal *const signal = pin->GetSignal())
+            signal->AcceptSignal(visitor);
+        *stream << ")";
+    });
+    *stream << ")";
+    return true;
+}
+
+void VerilogNetlister::WriteSynthesisAttr(Signal const *signal, HdlOptions const &options) {
+    if (signal->HasAttrs())
+        WriteSynthesisAttr(signal->GetAttrIterator(), Object::GetBaseName(signal->GetNameRef()),
+                           options);
+}
+
+/// The instance's attributes, then those of its component that it does not have itself.
+void VerilogNetlister::WriteSynthesisAttr(Instance const *instance, HdlOptions const &options) {
+    if (!instance)
+        return;
+    PtrArray<Attribute *> merged;
+    IStringPtrMap<Attribute *> names;
+    auto const add = [&](Attribute *attr) {
+        merged.Add(attr);
+        names.Add(attr->GetNameRef(), attr);
+    };
+    if (instance->HasAttrs())
+        ForEach(instance->GetAttrIterator(), add);
+    Component const *const component = instance->GetComponent();
+    if (component && component->HasAttrs())
+        ForEach(component->GetAttrIterator(), [&](Attribute *attr) {
+            if (!names.Contains(attr->GetNameRef()))
+                add(attr);
+        });
+    if (!merged.IsEmpty())
+        WriteSynthesisAttr(Iterator<Attribute *>(&merged), instance->GetNameRef(), options);
+}
+
+void VerilogNetlister::WriteSynthesisAttr(Iterator<Attribute *> const &attrs, char const *target,
+                                          HdlOptions const &options) {
+    switch (options.verilogOption.synthesisType) {
+    case VerilogOption::SYNTHESIS_QRT:
+        return statements->WriteQRTAttr(attrs, target);
+    case VerilogOption::SYNTHESIS_EXEMPLAR:
+        return statements->WriteExemplarAttr(attrs, target);
+    case VerilogOption::SYNTHESIS_SYNPLICITY:
+        return statements->WriteSynplicityAttr(attrs);
+    case VerilogOption::SYNTHESIS_SYNOPSYS:
+        return statements->WriteSynopsysAttr(attrs);
+    case VerilogOption::SYNTHESIS_VERILOG2001:
+        return; // this tool gets no attributes
+    case VerilogOption::SYNTHESIS_PRECISION:
+        return statements->WritePrecisionAttr(attrs, target);
+    }
+}
+
+/// The instance's generics, then those of its component that it does not have itself. In a macro
+/// INIT is handed on instead of set. It is left out of the lines for synthesis but not of those
+/// between the translate marks: meant so.
+void VerilogNetlister::WriteDefParam(Instance const *instance, HdlOptions const &options) {
+    if (!instance)
+        return;
+    bool const macro = options.macroNetlist;
+    Attribute const *init = nullptr;
+    PtrArray<Attribute *> syn;
+    PtrArray<Attribute *> nosyn;
+    IStringPtrMap<Attribute *> names;
+
+    /// Whether the attribute is the macro's INIT, now or before.
+    auto const isInit = [&](Attribute const *attr) {
+        bool const named = attr->GetNameRef() == "INIT";
+        if (macro && named && !init)
+            init = attr;
+        return named && init;
+    };
+    if (instance->HasAttrs()) {
+        Iterator<Attribute *> attrs = instance->GetAttrIterator();
+        GetGenericAttrs(attrs, syn, nosyn);
+        ForEach(attrs, [&](Attribute *attr) {
+            if (!isInit(attr))
+                names.Add(attr->GetNameRef(), attr);
+        });
+    }
+    Component const *const component = instance->GetComponent();
+    if (component && component->HasAttrs()) {
+        PtrArray<Attribute *> kept;
+        ForEach(component->GetAttrIterator(), [&](Attribute *attr) {
+            if (!names.Contains(attr->GetNameRef()) && !isInit(attr))
+                kept.Add(attr);
+        });
+        Iterator<Attribute *> attrs(&kept);
+        GetGenericAttrs(attrs, syn, nosyn);
+    }
+
+    Text const &name = instance->GetNameRef();
+    if (init) {
+        statements->WriteDefParamInitStatement(init, name);
+        Put(*stream, ";", EOL);
+        PtrArray<Attribute *> others;
+        ForEach(syn, [&](Attribute *attr) {
+            if (attr != init)
+                others.Add(attr);
+        });
+        return WriteGenerics(others, nosyn, [&](Attribute const *attr) {
+            statements->WriteDefParamStatement(attr, name);
+        });
+    }
+    WriteGenerics(syn, nosyn,
+                  [&](Attribute const *attr) { statements->WriteDefParamStatement(attr, name); });
+}
+
+} // namespace Vesk_Hdl

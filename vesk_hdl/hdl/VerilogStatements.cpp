@@ -1,0 +1,246 @@
+#include "vesk_hdl/hdl/VerilogStatements.h"
+
+#include "vesk_hdl/hdl/HdlUtilities.h"
+#include "vesk_hdl/hdl/Pieces.h"
+#include "vesk_hdl/hdl/ScalarDigit.h"
+#include "vesk_hdl/netlist/Signal.h"
+
+using namespace Vesk_Hdl;
+using Text = Basis::StringBase<char>;
+
+namespace {
+
+/// Under the first name of a Synopsys comment; the Synplicity comment keeps to the same column,
+/// although its opening is shorter.
+constexpr char const *ATTR_COLUMN = "                      ";
+
+/// The size and base of a literal, if the value was given with them.
+void WriteSize(OutStream &stream, BitVectorValue const &value) {
+    if (value.HasBaseAndLength())
+        Put(stream, value.GetLength(), "'", HdlUtilities::ConvertVerilogBase(value.GetBase()));
+}
+
+/// An attribute's value as a Verilog literal. Booleans and user values are strings.
+class WriteVerilogAttrValueVisitor : public AttributeVisitor {
+public:
+    explicit WriteVerilogAttrValueVisitor(OutStream &out) : stream(out) {}
+
+    void VisitAttributeString(AttributeString *attr) override {
+        WriteQuoted(HdlUtilities::RemoveQuotes(attr->GetValueString()));
+    }
+    void VisitAttributeInteger(AttributeInteger *attr) override {
+        stream << attr->GetValueString();
+    }
+    void VisitAttributeFloat(AttributeFloat *attr) override { stream << attr->GetValueString(); }
+    void VisitAttributeBit(AttributeBit *attr) override {
+        Put(stream, "1'b", attr->GetValueString());
+    }
+    void VisitAttributeBitVector(AttributeBitVector *attr) override {
+        WriteSize(stream, attr->GetBitVectorValue());
+        stream << attr->GetValue();
+    }
+    void VisitAttributeBoolean(AttributeBoolean *attr) override {
+        WriteQuoted(attr->GetValueString());
+    }
+    void VisitAttributeUser(AttributeUser *attr) override { WriteQuoted(attr->GetValueString()); }
+
+private:
+    void WriteQuoted(Text const &text) { Put(stream, "\"", text, "\""); }
+
+    OutStream &stream;
+};
+
+void WriteValue(OutStream &stream, Attribute const *attr) {
+    WriteVerilogAttrValueVisitor visitor(stream);
+    const_cast<Attribute *>(attr)->AcceptAttribute(visitor); // a visitor that only reads
+}
+
+/// Calls `write` with name and bare value of each attribute that is to be written.
+template <class Write> void ForEachSynAttr(Iterator<Attribute *> const &attrs, Write write) {
+    ForEach(attrs, [&write](Attribute const *attr) {
+        if (attr->IsSynAssigned())
+            write(attr->GetNameRef(), HdlUtilities::RemoveQuotes(attr->GetValueString()));
+    });
+}
+
+} // namespace
+
+namespace Vesk_Hdl {
+
+VerilogStatements::VerilogStatements(OutStream &out) : stream(out) {}
+VerilogStatements::~VerilogStatements() = default;
+
+void VerilogStatements::WriteTimeScale(char const *unit, char const *precision) {
+    Put(stream, "`timescale", " ", unit, " / ", precision, EOL);
+}
+
+void VerilogStatements::WriteTimeStamp(char const *fileName) {
+    stream << "// Verilog model ";
+    if (fileName && *fileName)
+        Put(stream, "created from ", fileName);
+    Put(stream, " - ", HdlUtilities::CurrentTimeString(), EOL);
+}
+
+void VerilogStatements::WriteIncludePath(StringArray const &paths) {
+    for (int i = 0; i < paths.GetSize(); ++i)
+        Put(stream, "`include", " \"", HdlUtilities::RemoveQuotes(paths.At(i)), "\"", EOL);
+}
+
+void VerilogStatements::WriteComment(Object const *object) {
+    if (!object || !object->HasComment())
+        return;
+    StringArray const lines(object->GetComment(), "\n", true, nullptr);
+    for (int i = 0; i < lines.GetSize(); ++i)
+        Put(stream, "// ", lines.At(i), "\n");
+}
+
+void VerilogStatements::WriteParameterStatement(Attribute const *attr) {
+    if (!attr)
+        return;
+    Put(stream, "parameter", " ", attr->GetNameRef(), " = ");
+    WriteValue(stream, attr);
+}
+
+void VerilogStatements::WritePortDeclaration(Text const &name, Polarity const &polarity) {
+    if (name.IsEmpty())
+        return;
+    Put(stream,
+        (polarity == Polarity::INPUT           ? " input"
+         : polarity == Polarity::BIDIRECTIONAL ? " inout"
+                                               : "output"),
+        " ");
+    Text base;
+    int left = 0;
+    int right = 0;
+    if (Bus::IsBusName(name) && Bus::ParseBusName(name, base, left, right))
+        Put(stream, "[", left, ":", right, "]", " ", base);
+    else
+        stream << name;
+}
+
+void VerilogStatements::WriteSignalDeclaration(Text const &name) {
+    if (Bus::IsBusName(name))
+        WriteWireBus(name);
+    else
+        WriteWire(name);
+}
+
+void VerilogStatements::WriteWire(Text const &name) { Put(stream, "wire", " ", name); }
+
+void VerilogStatements::WriteWireBus(Text const &name) {
+    Text base;
+    int left = 0;
+    int right = 0;
+    Bus::ParseBusName(name, base, left, right);
+    Put(stream, "wire", " ", "[", left, ":", right, "]", " ", base);
+}
+
+void VerilogStatements::WriteSignalName(char const *name) {
+    Text const text(name);
+    Text base;
+    int left = 0;
+    int right = 0;
+    if (Bus::IsBusName(text) && Bus::ParseBusName(text, base, left, right))
+        Put(stream, base, "[", left, ":", right, "]");
+    else
+        stream << text;
+}
+
+void VerilogStatements::NormalizeBusName(Text &name) const {
+    name.ReplaceChars('(', '[');
+    name.ReplaceChars(')', ']');
+}
+
+void VerilogStatements::WriteConstantSignalAssignment(Text const &name, bool isScalar,
+                                                      BitVectorValue const &value) {
+    Put(stream, "assign", " ", Object::GetBaseName(name), " = ");
+    if (isScalar) {
+        stream << ScalarDigit(value);
+    } else {
+        WriteSize(stream, value);
+        stream << value.GetValue();
+    }
+}
+
+void VerilogStatements::WriteSignalAssignment(Text const &target, Text const &source) {
+    Put(stream, "assign", " ");
+    WriteSignalName(target);
+    stream << " = ";
+    WriteSignalName(source);
+}
+
+void VerilogStatements::WriteDefParamStatement(Attribute const *attr, char const *instance) {
+    if (!attr)
+        return;
+    Put(stream, "defparam", " ", instance, ".", attr->GetNameRef(), " = ");
+    WriteValue(stream, attr);
+}
+
+void VerilogStatements::WriteDefParamInitStatement(Attribute const *attr, char const *instance) {
+    if (attr)
+        Put(stream, "defparam", " ", instance, ".", attr->GetNameRef(), " = ", attr->GetNameRef());
+}
+
+void VerilogStatements::WriteQRTAttr(Iterator<Attribute *> const &attrs, char const *target) {
+    ForEachSynAttr(attrs, [this, target](Text const &name, Text const &value) {
+        WriteQRTAttrStatement(name, target, value);
+    });
+}
+
+void VerilogStatements::WriteQRTAttrStatement(char const *name, char const *target,
+                                              char const *value) {
+    Put(stream, "// synthesis attribute ", name, " ", "of", " ", target, " ", "is", " ", "\"",
+        value, "\"", EOL);
+}
+
+void VerilogStatements::WriteExemplarAttr(Iterator<Attribute *> const &attrs, char const *target) {
+    ForEachSynAttr(attrs, [this, target](Text const &name, Text const &value) {
+        WriteExemplarAttrStatement(name, target, value);
+    });
+}
+
+void VerilogStatements::WriteExemplarAttrStatement(char const *name, char const *target,
+                                                   char const *value) {
+    Put(stream, "// exemplar attribute ", target, " ", name, " ", value, EOL);
+}
+
+void VerilogStatements::WritePrecisionAttr(Iterator<Attribute *> const &attrs, char const *target) {
+    ForEachSynAttr(attrs, [this, target](Text const &name, Text const &value) {
+        WritePrecisionAttrStatement(name, target, value);
+    });
+}
+
+void VerilogStatements::WritePrecisionAttrStatement(char const *name, char const *target,
+                                                    char const *value) {
+    Put(stream, "//pragma attribute ", target, " ", name, " ", value, EOL);
+}
+
+void VerilogStatements::WriteSynplicityAttr(Iterator<Attribute *> const &attrs) {
+    bool first = true;
+    ForEachSynAttr(attrs, [this, &first](Text const &name, Text const &value) {
+        if (first)
+            stream << "/* synthesis \"";
+        else
+            Put(stream, ", \\", EOL, ATTR_COLUMN);
+        first = false;
+        Put(stream, name, "=", value);
+    });
+    if (!first)
+        Put(stream, "\" ", "*/");
+}
+
+void VerilogStatements::WriteSynopsysAttr(Iterator<Attribute *> const &attrs) {
+    bool first = true;
+    ForEachSynAttr(attrs, [this, &first](Text const &name, Text const &value) {
+        if (first)
+            stream << "/* synopsys attribute ";
+        else
+            Put(stream, EOL, ATTR_COLUMN);
+        first = false;
+        Put(stream, name, " ", "\"", value, "\"");
+    });
+    if (!first)
+        Put(stream, " */", EOL);
+}
+
+} // namespace Vesk_Hdl

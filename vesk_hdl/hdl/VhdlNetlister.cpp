@@ -1,0 +1,288 @@
+#include "vesk_hdl/hdl/VhdlNetlister.h"
+
+#include <unordered_map>
+#include <unordered_set>
+
+#include "vesk_hdl/hdl/HdlUtilities.h"
+#include "vesk_hdl/hdl/Pieces.h"
+#include "vesk_hdl/hdl/Translate.h"
+#include "vesk_hdl/hdl/VhdlStatements.h"
+#include "vesk_hdl/model/HdlOptions.h"
+#include "vesk_hdl/netlist/Netlist.h"
+#include "vesk_hdl/text/basis/Functions.h"
+
+using namespace Vesk_Hdl;
+using Text = Basis::StringBase<char>;
+
+namespace {
+
+/// A port clause of an entity or component: the caller writes the items.
+class PortClause {
+public:
+    explicit PortClause(OutStream &out) : stream(out) { Put(stream, "port", " ( "); }
+    /// Ends the item before, if there is one, and begins the next line under it.
+    void NextItem() {
+        stream << separator;
+        if (*separator)
+            Put(stream, EOL, "       ");
+        separator = "; ";
+    }
+    void End() { Put(stream, ");", EOL); }
+
+private:
+    OutStream &stream;
+    char const *separator = "";
+};
+
+bool IsDeclaredPort(Signal const &signal) { return signal.IsPort() && signal.IsNeededToDeclared(); }
+
+/// A signal that the architecture declares.
+bool IsInnerSignal(Signal const &signal) {
+    return signal.GetPortPolarity() == Polarity::INVALID && signal.IsNeededToDeclared();
+}
+
+Text BaseNameOf(Object const &object) { return Object::GetBaseName(object.GetNameRef()); }
+
+} // namespace
+
+namespace Vesk_Hdl {
+
+VhdlNetlister::VhdlNetlister(OutStream &out)
+    : statements(std::make_shared<VhdlStatements>(out)), stream(&out) {}
+
+VhdlNetlister::VhdlNetlister(VhdlNetlister &other) = default;
+VhdlNetlister::~VhdlNetlister() = default;
+
+void VhdlNetlister::WriteNetlist(Netlist *netlist, HdlOptions const *options) {
+    if (!netlist || !options)
+        return;
+    HdlOptions::VhdlOption const &vhdl = options->vhdlOption;
+
+    netlist->SortNetlist();
+    netlist->CreateVhdlDummySignals();
+    netlist->SetBoxTypeAttribute();
+    if (!vhdl.openPin)
+        netlist->ConnectOpenPinToDummy();
+
+    Text const name = netlist->GetName();
+    bool const isMacro = name.GetIndexOfString("MORVANE", Text::COMPARE_EXACT) != Basis::NOT_FOUND;
+    options->macroNetlist = isMacro && InitDefined(netlist);
+
+    if (options->writeHeader)
+        HdlUtilities::WriteHeader(name, true, *options, *stream);
+    statements->WriteComment(netlist);
+    *stream << EOL;
+    statements->WriteUserLibrary(vhdl.libraries);
+    statements->WriteUseUserLibrary(vhdl.useLibraries);
+    if (vhdl.useDefaultLibrary) {
+        statements->WriteIEEELibrary();
+        statements->WriteKorbalLibrary(false);
+        *stream << EOL;
+    }
+    WriteEntity(netlist, options);
+    WriteArchitecture(netlist, options);
+    *stream << EOL;
+    if (!vhdl.suppressConfiguration)
+        WriteConfiguration(netlist);
+    *stream << EOL;
+}
+
+/// Whether the macro takes INIT as a generic of its own, for its instances to be handed on.
+bool VhdlNetlister::InitDefined(AttributeHolder const *holder) {
+    bool defined = false;
+    if (holder && holder->HasAttrs())
+        ForEach(holder->GetAttrIterator(), [&defined](Attribute const *attr) {
+            defined |=
+                attr->GetNameRef() == "INIT" && (attr->IsGenericSyn() || attr->IsGenericNoSyn());
+        });
+    return defined;
+}
+
+void VhdlNetlister::WriteEntity(Netlist const *netlist, HdlOptions const *options) {
+    if (!netlist)
+        return;
+    bool const useAttrType = options->vhdlOption.useAttrType;
+    Iterator<Signal *> signals = netlist->GetSignalIterator();
+    Put(*stream, "entity", " ", netlist->GetNameRef(), " ", "is", EOL);
+    stream->Indent();
+    WriteGenericMap(netlist, true);
+    int const width = Netlist::GetLongestPortName(signals);
+    PortClause ports(*stream);
+    ForEach(signals, [&](Signal const *signal) {
+        if (!IsDeclaredPort(*signal))
+            return;
+        ports.NextItem();
+        statements->WritePortStatement(signal->GetNameRef(), signal->GetPortPolarity(), width);
+    });
+    ports.End();
+    ForEach(signals, [&](Signal const *signal) {
+        if (!IsDeclaredPort(*signal) || !signal->HasAttrs())
+            return;
+        statements->WriteAttrDeclaration(signal, declaredAttrs, useAttrType, 0);
+        statements->WriteAttrAssignment(signal, BaseNameOf(*signal), "signal", useAttrType);
+    });
+    stream->Unindent();
+    Put(*stream, "end", " ", netlist->GetNameRef(), ";", EOL, EOL);
+}
+
+void VhdlNetlister::WriteArchitecture(Netlist const *netlist, HdlOptions const *options) {
+    Iterator<Signal *> signals = netlist->GetSignalIterator();
+    Put(*stream, "architecture", " BEHAVIORAL ", "of", " ", netlist->GetNameRef(), " ", "is", EOL);
+    stream->Indent();
+    WriteAttrDeclarations(netlist, options);
+    int const width = Netlist::GetLongestSignalName(signals);
+    ForEach(signals, [&](Signal const *signal) { WriteSignalDeclaration(signal, options, width); });
+    if (!options->vhdlOption.suppressComponent)
+        WriteComponents(netlist, options);
+    WriteSynthesisAttrAssignment(netlist, options);
+    stream->Unindent();
+    Put(*stream, "begin", EOL);
+    stream->Indent();
+    WriteAssignments(netlist);
+    ForEach(netlist->GetInstanceIterator(),
+            [&](Instance const *instance) { WriteInstance(instance, options); });
+    stream->Unindent();
+    Put(*stream, "end", " BEHAVIORAL;", EOL);
+}
+
+/// The attributes of ports were declared in the entity.
+void VhdlNetlister::WriteAttrDeclarations(Netlist const *netlist, HdlOptions const *options) {
+    bool const useAttrType = options->vhdlOption.useAttrType;
+    int const width = Netlist::GetLongestAttrName(netlist);
+    ForEach(netlist->GetSignalIterator(), [&](Signal const *signal) {
+        if (IsInnerSignal(*signal))
+            statements->WriteAttrDeclaration(signal, declaredAttrs, useAttrType, width);
+    });
+    ForEach(netlist->GetInstanceIterator(), [&](Instance const *instance) {
+        statements->WriteAttrDeclaration(instance->GetComponent(), declaredAttrs, useAttrType,
+                                         width);
+        statements->WriteAttrDeclaration(instance, declaredAttrs, useAttrType, width);
+    });
+}
+
+void VhdlNetlister::WriteSignalDeclaration(Signal const *signal, HdlOptions const *, int width) {
+    if (!signal || signal->GetPortPolarity() != Polarity::INVALID)
+        return;
+    if (signal->GetSignalType() == Signal::SIGNAL_BUS) {
+        statements->WriteComment(signal);
+        statements->WriteSignalVectorStatement(signal->GetNameRef(), width);
+    } else if (signal->GetSignalType() == Signal::SIGNAL_SCALAR) {
+        statements->WriteComment(signal);
+        statements->WriteSignalStatement(signal->GetNameRef(), width);
+    }
+}
+
+/// Each component once, at its first instance.
+void VhdlNetlister::WriteComponents(Netlist const *netlist, HdlOptions const *options) {
+    StringSet names;
+    std::unordered_set<Component const *> seen; // asks a name once for each component, not instance
+    ForEach(netlist->GetInstanceIterator(), [&](Instance const *instance) {
+        Component const *const component = instance->GetComponent();
+        if (!component || !seen.insert(component).second ||
+            names.IContains(component->GetNameRef().View()))
+            return;
+        names.Add(component->GetNameRef());
+        WriteComponent(component, options);
+    });
+}
+
+void VhdlNetlister::WriteComponent(Component const *component, HdlOptions const *options) {
+    if (!component)
+        return;
+    Iterator<Pin *> pins = component->GetPinIterator();
+    statements->WriteComment(component);
+    Put(*stream, "component", " ", component->GetNameRef(), EOL);
+    stream->Indent();
+    WriteGenericMap(component, true);
+    if (pins.HasMore()) {
+        int const width = Netlist::GetLongestPinName(pins);
+        PortClause ports(*stream);
+        ForEach(pins, [&](Pin const *pin) {
+            ports.NextItem();
+            statements->WritePortStatement(pin->GetNameRef(), pin->GetPolarity(), width);
+        });
+        ports.End();
+    }
+    stream->Unindent();
+    Put(*stream, "end", " ", "component", ";", EOL);
+    statements->WriteAttrAssignment(component, component->GetNameRef(), "component",
+                                    options->vhdlOption.useAttrType);
+    *stream << EOL;
+}
+
+void VhdlNetlister::WriteSynthesisAttrAssignment(Netlist const *netlist,
+                                                 HdlOptions const *options) {
+    ForEach(netlist->GetSignalIterator(), [&](Signal const *signal) {
+        if (signal->HasAttrs() && IsInnerSignal(*signal))
+            statements->WriteAttrAssignment(signal, BaseNameOf(*signal), "signal",
+                                            options->vhdlOption.useAttrType);
+    });
+    ForEach(netlist->GetInstanceIterator(),
+            [&](Instance const *instance) { WriteInstanceAttrAssignment(instance, options); });
+}
+
+/// Constants first, then what is assigned from another signal.
+void VhdlNetlister::WriteAssignments(Netlist const *netlist) {
+    ForEach(netlist->GetSignalIterator(), [&](Signal const *signal) {
+        if (!signal->HasConstantValue())
+            return;
+        Signal::SignalType const type = signal->GetSignalType();
+        bool const isScalar = type == Signal::SIGNAL_SCALAR || type == Signal::SIGNAL_BUS_INDEX;
+        statements->WriteConstantSignalAssignment(signal->GetNameRef(), isScalar,
+                                                  signal->GetConstantValue());
+    });
+    ForEach(netlist->GetSignalIterator(), [&](Signal const *target) {
+        ForEach(target->GetSignalIterator(), [&](Signal const *source) {
+            statements->WriteSignalAssignment(target->GetNameRef(), source->GetNameRef());
+        });
+    });
+}
+
+void VhdlNetlister::WriteConfiguration(Netlist const *netlist) {
+    Text const &name = netlist->GetNameRef();
+    // One walk gives each component its instances, in order.
+    std::unordered_map<Component const *, PtrArray<Instance *>> instances;
+    ForEach(netlist->GetInstanceIterator(), [&instances](Instance *instance) {
+        if (Component const *const component = instance->GetComponent())
+            instances[component].Add(instance);
+    });
+
+    Put(*stream, Translate::VHDL_OFF, EOL);
+    Put(*stream, "configuration", " ", "CFG_", name, " ", "of", "  ", name, " ", "is", EOL);
+    stream->Indent();
+    Put(*stream, "for", " ", "BEHAVIORAL", EOL);
+    stream->Indent();
+    ForEach(netlist->GetComponentIterator(), [&](Component const *component) {
+        auto const found = instances.find(component);
+        if (found != instances.end())
+            WriteConfigurationItem(component, found->second);
+    });
+    stream->Unindent();
+    Put(*stream, "end", " ", "for", ";", EOL);
+    stream->Unindent();
+    Put(*stream, "end", " ", "CFG_", name, ";", EOL);
+    Put(*stream, Translate::VHDL_ON, EOL);
+}
+
+/// Primitives of the vendor's library are not configured.
+void VhdlNetlister::WriteConfigurationItem(Component const *component,
+                                           PtrArray<Instance *> const &instances) {
+    if (!component || instances.IsEmpty())
+        return;
+    Attribute const *const level = component->GetAttr("Level");
+    if (level && Basis::stricmp(level->GetValueString(), "ORVANE") == 0)
+        return;
+    Put(*stream, "for", " ");
+    char const *separator = "";
+    ForEach(instances, [&](Instance const *instance) {
+        Put(*stream, separator, instance->GetNameRef());
+        separator = ", ";
+    });
+    Put(*stream, " : ", component->GetNameRef(), EOL);
+    stream->Indent();
+    Put(*stream, "use", " ", "configuration", " ", "WORK.CFG_", component->GetNameRef(), ";", EOL);
+    stream->Unindent();
+    Put(*stream, "end", " ", "for", ";", EOL);
+}
+
+} // namespace Vesk_Hdl

@@ -1,0 +1,60 @@
+#pragma once
+
+#include <memory>
+
+#include "vesk_hdl/netlist/NetlistFwd.h"
+#include "vesk_hdl/text/PtrArray.h"
+#include "vesk_hdl/text/StringSet.h"
+
+namespace Vesk_Hdl {
+
+class HdlOptions;
+class OutStream;
+class VhdlStatements;
+
+/// Writes one netlist as one structural VHDL file: libraries, an entity, an architecture named
+/// BEHAVIORAL and a configuration. It decides what is written and in which order; VhdlStatements
+/// knows the characters.
+///
+/// Sources: VhdlNetlister.cpp reads from top to bottom like the file that it writes;
+/// VhdlNetlister_instances.cpp holds generic clauses and instance statements.
+class VESK_HDL_API VhdlNetlister {
+public:
+    /// Points at the stream, which must outlive the netlister.
+    explicit VhdlNetlister(OutStream &stream);
+    /// Shares the statements and copies the set of declared attributes.
+    VhdlNetlister(VhdlNetlister &other);
+    ~VhdlNetlister();
+    VhdlNetlister &operator=(VhdlNetlister const &) = delete;
+
+    /// Rewrites the netlist for good so that the text will be legal, then writes it. Null writes
+    /// nothing. One netlister writes one file: a second write takes the attributes of the first as
+    /// declared. Sets `macroNetlist` of the options.
+    void WriteNetlist(Netlist *netlist, HdlOptions const *options);
+
+private:
+    void WriteEntity(Netlist const *netlist, HdlOptions const *options);
+    void WriteArchitecture(Netlist const *netlist, HdlOptions const *options);
+    void WriteAttrDeclarations(Netlist const *netlist, HdlOptions const *options);
+    void WriteSignalDeclaration(Signal const *signal, HdlOptions const *options, int width);
+    void WriteComponents(Netlist const *netlist, HdlOptions const *options);
+    void WriteComponent(Component const *component, HdlOptions const *options);
+    void WriteSynthesisAttrAssignment(Netlist const *netlist, HdlOptions const *options);
+    void WriteAssignments(Netlist const *netlist);
+    void WriteConfiguration(Netlist const *netlist);
+    void WriteConfigurationItem(Component const *component, PtrArray<Instance *> const &instances);
+    bool InitDefined(AttributeHolder const *holder);
+
+    void WriteGenericMap(AttributeHolder const *holder, bool isDeclaration);
+    void WriteInstanceGenericMap(Instance const *instance, bool isDeclaration, bool macroNetlist);
+    struct GenericItems;
+    void WriteGenericClause(GenericItems const &items, bool isDeclaration);
+    void WriteInstance(Instance const *instance, HdlOptions const *options);
+    void WriteInstanceAttrAssignment(Instance const *instance, HdlOptions const *options);
+
+    std::shared_ptr<VhdlStatements> statements;
+    OutStream *stream;
+    StringSet declaredAttrs; ///< declared so far in this file, by entity and architecture alike
+};
+
+} // namespace Vesk_Hdl

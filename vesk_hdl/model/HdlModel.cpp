@@ -1,0 +1,97 @@
+#include "vesk_hdl/model/HdlModel.h"
+
+#include "vesk_hdl/model/Messages.h"
+#include "vesk_hdl/netlist/Netlist.h"
+#include "vesk_hdl/text/Raise.h"
+#include "vesk_hdl/text/basis/OrEmpty.h"
+
+#define RAISE(...) VESK_HDL_RAISE("HdlModel", __VA_ARGS__)
+
+namespace Vesk_Hdl {
+
+using Basis::OrEmpty;
+using Basis::StringBase;
+
+/// Names are shared by components, instances and signals; those of pins and attributes are not.
+bool Model::IsNamedUsed(char const *name) {
+    Netlist const &netlist = *GetNetlist();
+    return netlist.GetComponent(name) || netlist.GetInstance(name) || netlist.GetSignal(name);
+}
+
+bool Model::AddComponent(char const *name) {
+    if (!name)
+        RAISE(Messages::INVALID_NAME);
+    if (IsNamedUsed(name))
+        RAISE(Messages::IDENTIFIER_DEFINED, name);
+    GetNetlist()->Add(new Component(name));
+    SetModifiedFlag(true);
+    return true;
+}
+
+bool Model::AddPin(char const *pinName, Polarity const &polarity, char const *componentName,
+                   char const *initialValue) {
+    if (!pinName)
+        RAISE(Messages::INVALID_NAME);
+    Component *const component = GetComponent(componentName);
+    if (!component)
+        RAISE(Messages::COMPONENT_NOT_FOUND, OrEmpty(componentName));
+    if (component->GetPin(pinName))
+        RAISE(Messages::COMPONENT_HAS_PIN, OrEmpty(componentName), pinName);
+    component->AddPin(pinName, polarity, initialValue);
+    SetModifiedFlag(true);
+    return true;
+}
+
+bool Model::AddInstance(char const *instanceName, char const *componentName) {
+    if (!instanceName)
+        RAISE(Messages::INVALID_NAME);
+    if (IsNamedUsed(instanceName))
+        RAISE(Messages::IDENTIFIER_DEFINED, instanceName);
+    Component *const component = GetComponent(componentName);
+    if (!component)
+        RAISE(Messages::COMPONENT_NOT_FOUND, OrEmpty(componentName));
+    if (GetInstance(instanceName)) // a guard: the identifier check has caught this
+        RAISE(Messages::INSTANCE_EXISTS, instanceName);
+    GetNetlist()->Add(new Instance(instanceName, component));
+    SetModifiedFlag(true);
+    return true;
+}
+
+bool Model::AddSignal(char const *name) {
+    if (!name)
+        RAISE(Messages::INVALID_NAME);
+    if (IsNamedUsed(name))
+        RAISE(Messages::IDENTIFIER_DEFINED, name);
+    StringBase<char> copy(name);
+    Object::NormalizeName(copy);
+    Netlist &netlist = *GetNetlist();
+    if (Bus::IsBusName(copy)) {
+        if (netlist.GetParentBus(copy))
+            RAISE(Messages::SIGNAL_DECLARED, name);
+        netlist.Add(new Bus(copy));
+    } else {
+        if (netlist.GetSignal(copy))
+            RAISE(Messages::SIGNAL_DECLARED, name);
+        netlist.Add(new ScalarSignal(copy));
+    }
+    SetModifiedFlag(true);
+    return true;
+}
+
+Component *Model::GetComponent(char const *name) const { return GetNetlist()->GetComponent(name); }
+Instance *Model::GetInstance(char const *name) const { return GetNetlist()->GetInstance(name); }
+Signal *Model::GetSignal(char const *name) const { return GetNetlist()->GetSignal(name); }
+
+Pin *Model::GetPin(char const *name, Component const *component) const {
+    return component ? component->GetPin(name) : nullptr;
+}
+
+Pin *Model::GetPin(char const *name, Instance const *instance) const {
+    return instance ? instance->GetPin(name) : nullptr;
+}
+
+Attribute *Model::GetAttr(char const *name, AttributeHolder const *holder) const {
+    return holder ? holder->GetAttr(name) : nullptr;
+}
+
+} // namespace Vesk_Hdl

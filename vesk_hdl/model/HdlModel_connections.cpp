@@ -1,0 +1,227 @@
+// Model's connections. Netlists arrive as flat text, a signal and a pin at a time, and signals need
+// not be declared first: a name brings what it demands into being.
+
+#include "vesk_hdl/model/HdlModel.h"
+
+#include "vesk_hdl/model/Messages.h"
+#include "vesk_hdl/netlist/Names.h"
+#include "vesk_hdl/netlist/Netlist.h"
+#include "vesk_hdl/text/Raise.h"
+#include "vesk_hdl/text/basis/OrEmpty.h"
+
+#define RAISE(...) VESK_HDL_RAISE("HdlModel", __VA_ARGS__)
+
+using namespace Vesk_Hdl;
+using Basis::OrEmpty;
+using Text = Basis::StringBase<char>;
+
+namespace {
+
+/// Builds the name of the signal that ties a pin to a constant; the pin's class picks the form.
+class PinConstantSignalVisitor : public PinVisitor {
+public:
+    explicit PinConstantSignalVisitor(char const *instance) : instanceName(instance) {}
+
+    void VisitScalarPin(ScalarPin *pin) override { SetName(*pin); }
+    void VisitBusPin(BusPin *pin) override {
+        Text left;
+        Text right;
+        pin->GetIndex(left, right);
+        SetName(*pin);
+        signalName += '(';
+        signalName += left;
+        signalName += ':';
+        signalName += right;
+        signalName += ')';
+    }
+    void VisitBusIndexPin(BusIndexPin *pin) override {
+        SetName(*pin);
+        signalName += '(';
+        signalName += pin->GetIndex();
+        signalName += ')';
+    }
+
+    Text const &GetSignalName() const { return signalName; }
+
+private:
+    void SetName(Pin const &pin) {
+        signalName = instanceName;
+        signalName += '_';
+        signalName += pin.GetBaseName();
+        signalName += "_CONST_SIGNAL";
+    }
+
+    Text instanceName;
+    Text signalName;
+};
+
+} // namespace
+
+namespace Vesk_Hdl {
+
+/// Null for a bit of an unknown bus: a bit never makes its bus. The forms are tested on the name as
+/// it was typed, so that "a[3]" makes a scalar that is called a(3).
+Signal *Model::GetOrCreateSignal(char const *name, InHand &inHand) {
+    Text const typed(name);
+    if (Signal *const signal = GetSignal(name))
+        return signal;
+    if (BusIndex::IsBusIndexName(typed))
+        return CreateAndAddBusIndexSignal(name);
+    if (Bus::IsBusName(typed))
+        return CreateAndAddBusSliceSignal(name, inHand);
+    if (CompoundBus::IsCompoundBusName(typed))
+        return CreateAndAddCompundSignal(name, inHand);
+    AddSignal(OrEmpty(name));
+    return GetSignal(name);
+}
+
+Signal *Model::CreateAndAddBusIndexSignal(char const *name) {
+    Bus *const parent = GetNetlist()->GetParentBus(name);
+    if (!parent)
+        return nullptr;
+    auto *const index = new BusIndex(name, parent);
+    GetNetlist()->Add(index);
+    SetModifiedFlag(true);
+    return index;
+}
+
+/// A slice that is narrower than its bus is one wherever its range lies. One as wide or wider takes
+/// the bus's place, and the bus becomes a slice of it.
+Signal *Model::CreateAndAddBusSliceSignal(char const *name, InHand &inHand) {
+    Netlist &netlist = *GetNetlist();
+    Bus *const bus = netlist.GetParentBus(name);
+    Signal *signal = nullptr;
+    if (!bus) {
+        AddSignal(name);
+        signal = netlist.GetSignal(name);
+    } else if (bus->GetWidth() > Names::BusWidth(name)) {
+        signal = new BusSlice(name, bus);
+        netlist.Add(signal);
+    } else {
+        signal = netlist.Widen(bus, name, inHand);
+    }
+    SetModifiedFlag(true);
+    return signal;
+}
+
+Signal *Model::CreateAndAddCompundSignal(char const *name, InHand &inHand) {
+    Text const typed(name);
+    Text normal(typed);
+    Object::NormalizeName(normal);
+    StringArray memberNames;
+    CompoundBus::ParseCompoundBusName(normal, memberNames, false);
+
+    // The members go behind what the caller holds: a later member may widen the bus of an earlier.
+    int const first = inHand.GetSize();
+    for (int i = 0; i < memberNames.GetSize(); ++i) {
+        Text const &member = memberNames.At(i);
+        Signal *signal = GetSignal(member);
+        if (!signal && BusIndex::IsBusIndexName(member))
+            signal = CreateAndAddBusIndexSignal(member);
+        else if (!signal && Bus::IsBusName(member))
+            signal = CreateAndAddBusSliceSignal(member, inHand);
+        if (!signal) { // also a bit of an unknown bus, unlike outside a compound
+            AddSignal(member);
+            signal = GetSignal(member);
+        }
+        inHand.Add(signal);
+    }
+    auto compound = std::make_unique<CompoundBus>(normal);
+    for (int i = first; i < inHand.GetSize(); ++i)
+        compound->AddBusMember(inHand.GetAt(i));
+    while (inHand.GetSize() > first)
+        inHand.RemoveTail();
+    Signal *const result = compound.get();
+    GetNetlist()->Add(compound.release());
+    SetModifiedFlag(true);
+    return result;
+}
+
+bool Model::Connect(Signal *signal, Pin *pin) {
+    if (!signal || !pin)
+        return false;
+    signal->Connect(pin);
+    SetModifiedFlag(true);
+    return true;
+}
+
+bool Model::Connect(Signal *left, Signal *right) {
+    if (!left || !right)
+        return false;
+    left->Connect(right);
+    SetModifiedFlag(true);
+    return true;
+}
+
+bool Model::AssignConstant(Signal *signal, char const *value) {
+    if (!signal)
+        return false;
+    signal->AssignConstantValue(value);
+    SetModifiedFlag(true);
+    return true;
+}
+
+bool Model::AssignConstant(Pin *pin, char const *value, char const *instanceName) {
+    if (!pin)
+        return false;
+    PinConstantSignalVisitor visitor(instanceName);
+    pin->AcceptPin(visitor);
+    Text const &signalName = visitor.GetSignalName();
+    if (!GetSignal(signalName))
+        AddSignal(signalName);
+    Signal *const signal = GetSignal(signalName);
+    if (!AssignConstant(signal, value))
+        return false;
+    pin->Connect(signal); // one way: the signal's list of pins stays empty
+    return true;
+}
+
+bool Model::ConnectSignalToPin(char const *signalName, char const *instanceName,
+                               char const *pinName) {
+    InHand inHand;
+    Signal *const signal = GetOrCreateSignal(signalName, inHand);
+    if (!signal)
+        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(signalName));
+    Instance const *const instance = GetInstance(instanceName);
+    if (!instance) // the word "Signal" is meant
+        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(instanceName));
+    Pin *const pin = instance->GetPin(pinName);
+    if (!pin) {
+        Text joined(instanceName);
+        joined += '.';
+        joined += pinName;
+        RAISE(Messages::PIN_NOT_FOUND, joined.GetText());
+    }
+    return Connect(signal, pin);
+}
+
+bool Model::ConnectSignals(char const *left, char const *right) {
+    InHand inHand;
+    inHand.Add(GetOrCreateSignal(left, inHand));
+    if (!inHand.GetAt(0))
+        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(left));
+    Signal *const source = GetOrCreateSignal(right, inHand);
+    if (!source)
+        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(right));
+    return Connect(inHand.GetAt(0), source);
+}
+
+bool Model::AssignConstantToPin(char const *instanceName, char const *pinName, char const *value) {
+    Instance const *const instance = GetInstance(instanceName);
+    if (!instance) // the word "Signal" is meant
+        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(instanceName));
+    Pin *const pin = instance->GetPin(pinName);
+    if (!pin)
+        RAISE(Messages::PIN_NOT_FOUND, OrEmpty(pinName));
+    return AssignConstant(pin, value, instanceName);
+}
+
+bool Model::AssignConstantToSignal(char const *signalName, char const *value) {
+    InHand inHand;
+    Signal *const signal = GetOrCreateSignal(signalName, inHand);
+    if (!signal)
+        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(signalName));
+    return AssignConstant(signal, value);
+}
+
+} // namespace Vesk_Hdl

@@ -1,0 +1,307 @@
+#include "vesk_hdl/netlist/Attribute.h"
+
+#include <clocale>
+#include <cstdlib>
+#include <locale.h>
+
+#include "vesk_hdl/text/StringArray.h"
+#include "vesk_hdl/text/basis/Functions.h"
+#include "vesk_hdl/text/basis/OrEmpty.h"
+
+namespace Vesk_Hdl {
+
+using Basis::OrEmpty;
+using Basis::StringBase;
+
+namespace {
+
+/// The words of an option; the index is the value of its two bits in the flags.
+struct Option {
+    unsigned int shift;
+    char const *words[3];
+};
+constexpr Option GENERIC = {0, {"NONE", "NOSYN", "SYN"}};
+constexpr Option SYNTHESIS = {2, {"NONE", "ASSIGN", "ASSIGNNODEC"}};
+
+unsigned int GetOption(unsigned int flags, Option const &option) {
+    return (flags >> option.shift) & 3U;
+}
+
+bool SetOption(unsigned int &flags, Option const &option, char const *word) {
+    for (unsigned int value = 0; value < 3; ++value)
+        if (Basis::stricmp(word, option.words[value]) == 0) {
+            flags = (flags & ~(3U << option.shift)) | (value << option.shift);
+            return true;
+        }
+    return false;
+}
+
+/// Numbers are read and written with a decimal point whatever the client's locale says.
+class PlainNumbers {
+public:
+    PlainNumbers() : before(uselocale(Plain())) {}
+    ~PlainNumbers() { uselocale(before); }
+    PlainNumbers(PlainNumbers const &) = delete;
+    PlainNumbers &operator=(PlainNumbers const &) = delete;
+
+private:
+    static locale_t Plain() {
+        static locale_t const plain = newlocale(LC_ALL_MASK, "C", nullptr);
+        return plain;
+    }
+    locale_t before;
+};
+
+} // namespace
+
+unsigned int const Attribute::DEFAULT_GENERIC = 0;
+unsigned int const Attribute::DEFAULT_SYNATTR = 0;
+char const *const Attribute::DEFAULT_ATTRTYPE = "String";
+
+struct Attribute::Record {
+    unsigned int flags = DEFAULT_GENERIC << GENERIC.shift | DEFAULT_SYNATTR << SYNTHESIS.shift;
+    ValueType valueType = VALUE_STRING;
+};
+
+Attribute::Attribute() : record(new Record) {}
+
+Attribute::Attribute(char const *name) : record(new Record) {
+    SetNormalizedName(name);
+    SetObjectType(OBJECT_ATTRIBUTE);
+}
+
+Attribute::Attribute(Attribute const &other) : Object(other), record(new Record(*other.record)) {}
+
+Attribute::~Attribute() = default;
+
+Attribute &Attribute::operator=(Attribute const &other) {
+    Object::operator=(other);
+    *record = *other.record;
+    return *this;
+}
+
+Object::ObjectType Attribute::GetObjectType() const { return GetStoredObjectType(); }
+void Attribute::AcceptObject(ObjectVisitor &visitor) { visitor.VisitAttribute(this); }
+void Attribute::SetName(char const *name) { Object::SetName(name); }
+void Attribute::AcceptAttribute(AttributeVisitor &visitor) { visitor.VisitAttribute(this); }
+
+bool Attribute::operator==(Attribute const &other) const {
+    return Object::operator==(other) && record->valueType == other.record->valueType &&
+           record->flags == other.record->flags &&
+           GetValueString().Compare(other.GetValueString(),
+                                    StringBase<char>::COMPARE_IGNORING_CASE) == 0;
+}
+
+StringBase<char> Attribute::GetValueTypeName() const {
+    static char const *const NAMES[] = {"String", "Integer",   "Float", "Boolean",
+                                        "Bit",    "BitVector", "User"};
+    return NAMES[GetValueType()];
+}
+
+StringBase<char> Attribute::GetGeneric() const {
+    return GENERIC.words[GetOption(record->flags, GENERIC)];
+}
+bool Attribute::SetGeneric(char const *word) { return SetOption(record->flags, GENERIC, word); }
+
+StringBase<char> Attribute::GetSynAttr() const {
+    return SYNTHESIS.words[GetOption(record->flags, SYNTHESIS)];
+}
+bool Attribute::SetSynAttr(char const *word) { return SetOption(record->flags, SYNTHESIS, word); }
+
+bool Attribute::IsGenericNoSyn() const { return GetOption(record->flags, GENERIC) == 1; }
+bool Attribute::IsGenericSyn() const { return GetOption(record->flags, GENERIC) == 2; }
+bool Attribute::IsSynAssigned() const { return GetOption(record->flags, SYNTHESIS) != 0; }
+bool Attribute::IsSynDeclared() const { return GetOption(record->flags, SYNTHESIS) == 1; }
+
+void Attribute::SetValueType(ValueType type) { record->valueType = type; }
+Attribute::ValueType Attribute::GetStoredValueType() const { return record->valueType; }
+
+struct AttributeString::Record {
+    StringBase<char> value;
+};
+struct AttributeInteger::Record {
+    int value = 0;
+};
+struct AttributeFloat::Record {
+    Record() = default;
+    Record(Record const &other) : value(other.value) {}
+    /// The look of the number stays behind.
+    Record &operator=(Record const &other) {
+        value = other.value;
+        return *this;
+    }
+
+    double value = 0;
+    int width = 3;
+    int precision = 1;
+};
+struct AttributeBoolean::Record {
+    bool value = false;
+};
+struct AttributeBit::Record {
+    StringBase<char> value;
+};
+struct AttributeBitVector::Record {
+    BitVectorValue value;
+};
+struct AttributeUser::Record {
+    StringBase<char> value;
+    StringBase<char> userType;
+};
+
+// What is the same in the seven classes. Each line is one operation.
+#define VESK_HDL_ATTRIBUTE_BODIES(Class, TYPE)                                                     \
+    Class::Class(char const *name, char const *value) : Attribute(name), record(new Record) {      \
+        SetValueType(TYPE);                                                                        \
+        Class::SetValue(value);                                                                    \
+    }                                                                                              \
+    Class::Class(Class const &other) : Attribute(other), record(new Record(*other.record)) {}      \
+    Class::~Class() = default;                                                                     \
+    Class &Class::operator=(Class const &other) {                                                  \
+        if (this != &other) {                                                                      \
+            Attribute::operator=(other);                                                           \
+            *record = *other.record;                                                               \
+        }                                                                                          \
+        return *this;                                                                              \
+    }                                                                                              \
+    Attribute *Class::CreateAttribute(char const *name, char const *value) {                       \
+        return new Class(name, value);                                                             \
+    }                                                                                              \
+    void Class::AcceptAttribute(AttributeVisitor &visitor) { visitor.Visit##Class(this); }         \
+    Attribute *Class::CloneAttribute() const { return new Class(*this); }                          \
+    Attribute::ValueType Class::GetValueType() const { return GetStoredValueType(); }
+
+VESK_HDL_ATTRIBUTE_BODIES(AttributeString, VALUE_STRING)
+VESK_HDL_ATTRIBUTE_BODIES(AttributeInteger, VALUE_INTEGER)
+VESK_HDL_ATTRIBUTE_BODIES(AttributeFloat, VALUE_FLOAT)
+VESK_HDL_ATTRIBUTE_BODIES(AttributeBoolean, VALUE_BOOLEAN)
+VESK_HDL_ATTRIBUTE_BODIES(AttributeBit, VALUE_BIT)
+VESK_HDL_ATTRIBUTE_BODIES(AttributeBitVector, VALUE_BIT_VECTOR)
+VESK_HDL_ATTRIBUTE_BODIES(AttributeUser, VALUE_USER)
+
+#undef VESK_HDL_ATTRIBUTE_BODIES
+
+void AttributeString::SetValue(char const *text) { record->value = text; }
+StringBase<char> AttributeString::GetValueString() const { return record->value; }
+StringBase<char> AttributeString::GetValue() const { return record->value; }
+
+void AttributeInteger::SetValue(char const *text) { record->value = std::atoi(OrEmpty(text)); }
+StringBase<char> AttributeInteger::GetValueString() const {
+    return StringBase<char>::doFormat("%d", record->value);
+}
+int AttributeInteger::GetValue() const { return record->value; }
+
+void AttributeFloat::SetValue(char const *text) {
+    StringArray const parts(text, ".", true, nullptr);
+    auto const digits = [&parts](int part) { return static_cast<int>(parts.At(part).GetLength()); };
+    record->precision = digits(1) == 0 ? 1 : digits(1);
+    record->width = record->precision + (digits(0) == 0 ? 1 : digits(0)) + 1;
+    PlainNumbers const plain;
+    record->value = std::atof(OrEmpty(text));
+}
+StringBase<char> AttributeFloat::GetValueString() const {
+    PlainNumbers const plain;
+    return StringBase<char>::doFormat("%*.*f", record->width, record->precision, record->value);
+}
+double AttributeFloat::GetValue() const { return record->value; }
+
+void AttributeBoolean::SetValue(char const *text) {
+    record->value = Basis::stricmp(text, "true") == 0;
+}
+StringBase<char> AttributeBoolean::GetValueString() const {
+    return record->value ? "TRUE" : "FALSE";
+}
+bool AttributeBoolean::GetValue() const { return record->value; }
+
+void AttributeBit::SetValue(char const *text) {
+    record->value = std::string_view(OrEmpty(text)) == "1" ? "1" : "0";
+}
+StringBase<char> AttributeBit::GetValueString() const { return record->value; }
+StringBase<char> AttributeBit::GetValue() const { return record->value; }
+
+void AttributeBitVector::SetValue(char const *text) { record->value.SetValue(text); }
+StringBase<char> AttributeBitVector::GetValueString() const { return record->value.GetValue(); }
+StringBase<char> AttributeBitVector::GetValue() const { return record->value.GetValue(); }
+BitVectorValue AttributeBitVector::GetBitVectorValue() const { return record->value; }
+
+void AttributeUser::SetValue(char const *text) { record->value = text; }
+StringBase<char> AttributeUser::GetValueString() const { return record->value; }
+StringBase<char> AttributeUser::GetValue() const { return record->value; }
+void AttributeUser::SetUserType(char const *type) { record->userType = type; }
+StringBase<char> AttributeUser::GetUserType() const { return record->userType; }
+
+AttributeVisitor::~AttributeVisitor() = default;
+
+struct AttributeHolder::Record {
+    OwnPtrArray<Attribute *> attributes;
+    IStringPtrMap<Attribute *> attributeMap;
+};
+
+AttributeHolder::AttributeHolder() = default;
+
+AttributeHolder::AttributeHolder(AttributeHolder const &other) : AttributeHolder() {
+    AttributeHolder::operator=(other);
+}
+
+AttributeHolder::~AttributeHolder() = default;
+
+AttributeHolder::Record &AttributeHolder::Own() const {
+    if (!record)
+        record = std::make_unique<Record>();
+    return *record;
+}
+
+AttributeHolder &AttributeHolder::operator=(AttributeHolder const &other) {
+    if (this == &other)
+        return *this;
+    // Names that only the old set had are forgotten with it, so that none leads to a dead one.
+    record.reset();
+    if (other.record)
+        ForEach(other.record->attributes,
+                [this](Attribute *attribute) { AddAttr(attribute->CloneAttribute()); });
+    return *this;
+}
+
+void AttributeHolder::AddAttr(Attribute *attribute) {
+    if (!attribute)
+        return;
+    std::unique_ptr<Attribute> held(attribute);
+    Own().attributes.Add(attribute);
+    held.release();
+    record->attributeMap.Add(attribute->GetNameRef(), attribute);
+}
+
+Attribute *AttributeHolder::GetAttr(char const *name) const {
+    return record ? record->attributeMap.Get(name) : nullptr;
+}
+
+Iterator<Attribute *> AttributeHolder::GetAttrIterator() const {
+    return Iterator<Attribute *>(&Own().attributes);
+}
+
+bool AttributeHolder::HasAttrs() const { return record && !record->attributes.IsEmpty(); }
+
+AttributeFactory::AttributeFactory() {
+    creators.Add("String", AttributeString::CreateAttribute);
+    creators.Add("Integer", AttributeInteger::CreateAttribute);
+    creators.Add("Float", AttributeFloat::CreateAttribute);
+    creators.Add("Boolean", AttributeBoolean::CreateAttribute);
+    creators.Add("Bit", AttributeBit::CreateAttribute);
+    creators.Add("BitVector", AttributeBitVector::CreateAttribute);
+    creators.Add("User", AttributeUser::CreateAttribute);
+}
+
+AttributeFactory::~AttributeFactory() = default;
+
+AttributeFactory &AttributeFactory::GetInstance() {
+    static AttributeFactory factory;
+    return factory;
+}
+
+Attribute *AttributeFactory::CreateAttribute(char const *type, char const *name,
+                                             char const *value) const {
+    AttributeCreator const creator = creators.Get(type ? type : Attribute::DEFAULT_ATTRTYPE);
+    return creator ? creator(name, value) : nullptr;
+}
+
+} // namespace Vesk_Hdl

@@ -1,0 +1,178 @@
+#include "vesk_hdl/netlist/Names.h"
+
+#include <charconv>
+#include <climits>
+#include <limits>
+
+#include "vesk_hdl/text/basis/Ascii.h"
+#include "vesk_hdl/text/basis/Tokens.h"
+
+namespace Vesk_Hdl::Names {
+
+using Basis::NextToken;
+using Basis::StringBase;
+using Basis::TokenIn;
+using namespace Basis::Ascii;
+
+namespace {
+
+constexpr std::string_view::size_type NPOS = std::string_view::npos;
+
+bool IsMember(std::string_view token) {
+    std::string_view base;
+    std::string_view index;
+    return IsBaseName(token) || IsBusName(token) || SplitBusIndexName(token, base, index);
+}
+
+} // namespace
+
+bool IsBaseName(std::string_view text) {
+    if (text.empty() || !(IsLetter(text[0]) || text[0] == '_' || text[0] == '\''))
+        return false;
+    for (char const c : text.substr(1))
+        if (!IsLetter(c) && !IsDigit(c) && c != '_')
+            return false;
+    return true;
+}
+
+bool IsInteger(std::string_view text) {
+    if (!text.empty() && (text[0] == '+' || text[0] == '-'))
+        text.remove_prefix(1);
+    for (char const c : text)
+        if (!IsDigit(c))
+            return false;
+    return !text.empty();
+}
+
+int ToInt(std::string_view integer) {
+    bool const negative = integer.starts_with('-');
+    if (integer.starts_with('+'))
+        integer.remove_prefix(1);
+    long value = 0;
+    auto const result = std::from_chars(integer.data(), integer.data() + integer.size(), value);
+    if (result.ec == std::errc::result_out_of_range)
+        value = negative ? LONG_MIN : LONG_MAX;
+    return static_cast<int>(value);
+}
+
+bool IsBusName(std::string_view name) {
+    std::size_t const open = name.find('(');
+    std::size_t const close = name.find(')');
+    std::size_t const colon = name.find(':');
+    if (open == NPOS || close == NPOS || colon == NPOS || close + 1 != name.size() || colon < open)
+        return false;
+    return IsBaseName(name.substr(0, open)) && IsInteger(name.substr(open + 1, colon - open - 1)) &&
+           IsInteger(name.substr(colon + 1, close - colon - 1));
+}
+
+bool SplitBusName(std::string_view name, BusParts &parts) {
+    Basis_Range range = {1, 0};
+    if (!NextToken(name, range, "(", true))
+        return false;
+    std::string_view const base = TokenIn(name, range);
+    if (!NextToken(name, range, ":", true))
+        return false;
+    std::string_view const left = TokenIn(name, range);
+    if (!NextToken(name, range, ")", true))
+        return false;
+    std::string_view const right = TokenIn(name, range);
+    if (std::size_t{range.last} + 2 != name.size())
+        return false;
+    if (!IsBaseName(base) || !IsInteger(left) || !IsInteger(right))
+        return false;
+    parts = {base, left, right};
+    return true;
+}
+
+bool SplitBusIndexName(std::string_view name, std::string_view &base, std::string_view &index) {
+    Basis_Range range = {1, 0};
+    if (!NextToken(name, range, "(", true))
+        return false;
+    std::string_view const first = TokenIn(name, range);
+    if (!NextToken(name, range, ")", true))
+        return false;
+    std::string_view const second = TokenIn(name, range);
+    if (std::size_t{range.last} + 2 != name.size())
+        return false;
+    if (!IsBaseName(first) || !IsInteger(second))
+        return false;
+    base = first;
+    index = second;
+    return true;
+}
+
+bool IsCompoundBusName(std::string_view name) {
+    int members = 0;
+    for (Basis_Range range = {1, 0}; NextToken(name, range, ",\\", true); ++members)
+        if (!IsMember(TokenIn(name, range)))
+            return false;
+    return members >= 2;
+}
+
+bool ParseBounds(std::string_view name, Bounds &bounds) {
+    BusParts parts;
+    if (!SplitBusName(name, parts))
+        return false;
+    bounds = {ToInt(parts.left), ToInt(parts.right)};
+    return true;
+}
+
+int BusWidth(std::string_view name) {
+    Bounds bounds;
+    if (!ParseBounds(name, bounds))
+        return 0;
+    constexpr auto MOST = static_cast<unsigned int>(std::numeric_limits<int>::max());
+    return static_cast<int>(std::min(bounds.Distance(), MOST - 1) + 1);
+}
+
+bool IsOneBitBus(std::string_view name) {
+    Bounds bounds;
+    return IsBusName(name) && ParseBounds(name, bounds) && bounds.Distance() == 0;
+}
+
+StringBase<char> BitName(std::string_view base, int index) {
+    char digits[16];
+    std::to_chars_result const end = std::to_chars(digits, digits + sizeof digits, index);
+    StringBase<char> name(base);
+    name += '(';
+    name += std::string_view(digits, static_cast<std::size_t>(end.ptr - digits));
+    name += ')';
+    return name;
+}
+
+bool IsNormal(std::string_view name) {
+    for (char const c : name)
+        switch (c) {
+        case '[':
+        case ']':
+        case '{':
+        case '}':
+        case '<':
+        case '>':
+        case '-':
+            return false;
+        default:
+            break;
+        }
+    return true;
+}
+
+void Normalize(StringBase<char> &name) {
+    if (IsNormal(name.View()))
+        return;
+    for (char const open : {'[', '{', '<'})
+        name.ReplaceChars(open, '(');
+    for (char const close : {']', '}', '>'})
+        name.ReplaceChars(close, ')');
+    name.ReplaceChars('-', ':');
+}
+
+std::string_view BaseName(std::string_view name) {
+    std::size_t const open = name.find('(');
+    bool const ranged = open != NPOS && name.find(')') != NPOS && name.find(',') == NPOS;
+    return ranged ? name.substr(0, open) : name;
+}
+
+bool EndsInDummyTag(std::string_view name) { return EndsWithIgnoringCase(name, DUMMY_TAG); }
+
+} // namespace Vesk_Hdl::Names

@@ -1,0 +1,240 @@
+#include "vesk_hdl/netlist/Netlist.h"
+
+#include "vesk_hdl/netlist/Names.h"
+#include "vesk_hdl/netlist/NaturalOrder.h"
+#include "vesk_hdl/netlist/NetlistRecord.h"
+
+namespace Vesk_Hdl {
+
+using Basis::StringBase;
+
+char const Netlist::DEFAULT_NETLIST_NAME[] = "HDL_NETLIST";
+
+namespace {
+
+int Length(StringBase<char> const &name) { return static_cast<int>(name.GetLength()); }
+
+/// Array first: should the map fail to grow, the object is owned all the same.
+template <class T> void File(OwnPtrArray<T *> &array, IStringPtrMap<T *> &map, T *object) {
+    std::unique_ptr<T> held(object);
+    array.Add(object);
+    held.release();
+    map.Add(object->GetNameRef(), object);
+}
+
+template <class T> void Unfile(OwnPtrArray<T *> &array, IStringPtrMap<T *> &map, T *object) {
+    array.Remove(object);
+    map.Remove(object->GetNameRef());
+}
+
+/// The longest name of the signals that pass a test, a bus counted by its base name.
+template <class Test> int LongestName(Iterator<Signal *> &signals, Test test) {
+    int longest = 0;
+    for (signals.Rewind(); signals.HasMore(); signals.Advance()) {
+        Signal const *const signal = signals.Current();
+        if (!signal || !test(*signal))
+            continue;
+        auto const *const bus = dynamic_cast<Bus const *>(signal);
+        longest = std::max(longest, Length(bus ? bus->GetBaseName() : signal->GetNameRef()));
+    }
+    return longest;
+}
+
+} // namespace
+
+Netlist::Netlist(char const *name) : record(std::make_unique<Record>()) {
+    SetNameText(name ? name : "hdlNetlist");
+    SetObjectType(OBJECT_NETLIST);
+}
+
+Netlist::~Netlist() = default;
+
+Object::ObjectType Netlist::GetObjectType() const { return GetStoredObjectType(); }
+void Netlist::AcceptObject(ObjectVisitor &visitor) { visitor.VisitNetlist(this); }
+void Netlist::SetName(char const *name) { SetNameText(name); }
+
+void Netlist::SetSourceFileName(char const *fileName) { record->sourceFileName = fileName; }
+StringBase<char> Netlist::GetSourceFileName() const { return record->sourceFileName; }
+
+void Netlist::Add(Signal *signal) {
+    if (!signal)
+        return;
+    File(record->signals, record->signalMap, signal);
+    if (auto const *const bus = dynamic_cast<Bus const *>(signal))
+        record->busMap.Add(bus->GetBaseName(), signal);
+}
+
+void Netlist::Add(Instance *instance) {
+    if (instance)
+        File(record->instances, record->instanceMap, instance);
+}
+
+void Netlist::Add(Component *component) {
+    if (component)
+        File(record->components, record->componentMap, component);
+}
+
+void Netlist::Remove(Signal *signal) {
+    if (!signal)
+        return;
+    Unfile(record->signals, record->signalMap, signal);
+    signal->DisconnectAll();
+    if (auto const *const bus = dynamic_cast<Bus const *>(signal))
+        record->busMap.Remove(bus->GetBaseName());
+    delete signal;
+}
+
+void Netlist::Remove(Instance *instance) {
+    if (!instance)
+        return;
+    Unfile(record->instances, record->instanceMap, instance);
+    delete instance;
+}
+
+void Netlist::Remove(Component *component) {
+    if (!component)
+        return;
+    Unfile(record->components, record->componentMap, component);
+    delete component;
+}
+
+Signal *Netlist::FindSignal(std::string_view name) const { return record->signalMap.Get(name); }
+
+Bus *Netlist::FindBus(std::string_view baseName) const {
+    return static_cast<Bus *>(record->busMap.Get(baseName));
+}
+
+Signal *Netlist::GetSignal(char const *name) const { return FindSignal(Names::Key(name).View()); }
+
+Instance *Netlist::GetInstance(char const *name) const {
+    return record->instanceMap.Get(Names::Key(name).View());
+}
+
+Component *Netlist::GetComponent(char const *name) const {
+    return record->componentMap.Get(Names::Key(name).View());
+}
+
+Bus *Netlist::GetParentBus(char const *name) const {
+    return FindBus(Names::BaseName(Names::Key(name).View()));
+}
+
+Iterator<Signal *> Netlist::GetSignalIterator() const {
+    return Iterator<Signal *>(&record->signals);
+}
+
+Iterator<Instance *> Netlist::GetInstanceIterator() const {
+    return Iterator<Instance *>(&record->instances);
+}
+
+Iterator<Component *> Netlist::GetComponentIterator() const {
+    return Iterator<Component *>(&record->components);
+}
+
+void Netlist::GetInstances(Component const *component, PtrArray<Instance *> &found) const {
+    found.Empty();
+    if (!component)
+        return;
+    ForEach(record->instances, [component, &found](Instance *instance) {
+        if (instance->GetComponent() == component)
+            found.Add(instance);
+    });
+}
+
+void Netlist::GetInstances(char const *componentName, PtrArray<Instance *> &found) const {
+    GetInstances(GetComponent(componentName), found);
+}
+
+Bus *Netlist::Widen(Bus *bus, char const *name, PtrArray<Signal *> &inHand) {
+    auto wide = std::make_unique<Bus>(name);
+    auto slice = std::make_unique<BusSlice>(bus->GetNameRef(), wide.get());
+    BusSlice *const stand = slice.get();
+    record->widenedSlices.Add(stand);
+    slice.release();
+    stand->CloneConnection(bus);
+    ForEach(bus->GetBusSliceIterator(), [&wide](Signal *moved) {
+        if (auto *const part = dynamic_cast<BusSlice *>(moved))
+            part->SetParent(wide.get());
+        else if (auto *const index = dynamic_cast<BusIndex *>(moved))
+            index->SetParent(wide.get());
+        wide->AddBusSlice(moved);
+    });
+    if (bus->HasReference())
+        ReplaceReferences(bus, stand);
+    for (int i = 0; i < inHand.GetSize(); ++i)
+        if (inHand.GetAt(i) == bus)
+            inHand.SetAt(i, stand);
+    Remove(bus);
+    Bus *const result = wide.get();
+    Add(wide.release());
+    return result;
+}
+
+/// Whatever may point at a signal one way: links, members of compounds, pins that it does not list.
+void Netlist::ReplaceReferences(Signal *former, Signal *now) {
+    auto const replaceIn = [former, now](Signal *signal) {
+        signal->ReplaceAssigned(former, now);
+        if (auto *const compound = dynamic_cast<CompoundBus *>(signal))
+            for (int i = 0; i < compound->GetSize(); ++i)
+                if (compound->GetAt(i) == former)
+                    compound->SetAt(i, now);
+    };
+    ForEach(record->signals, replaceIn);
+    ForEach(record->widenedSlices, replaceIn);
+    auto const reconnect = [former, now](Pin *pin) {
+        if (pin->GetSignal() == former)
+            pin->Connect(now);
+    };
+    ForEach(record->instances,
+            [&](Instance *instance) { ForEach(instance->GetPinIterator(), reconnect); });
+    ForEach(record->components,
+            [&](Component *component) { ForEach(component->GetPinIterator(), reconnect); });
+}
+
+void Netlist::SortNetlist() {
+    auto const noPolarity = [](Object const *) { return Polarity(); };
+    SortNaturally(record->signals, [](Signal const *s) { return s->GetPortPolarity(); });
+    SortNaturally(record->components, noPolarity);
+    SortNaturally(record->instances, noPolarity);
+    ForEach(record->instances, [](Instance *instance) { instance->SortPinName(); });
+}
+
+int Netlist::GetLongestPinName(Iterator<Pin *> &pins) {
+    int longest = 0;
+    for (pins.Rewind(); pins.HasMore(); pins.Advance())
+        if (Pin const *const pin = pins.Current())
+            longest = std::max(longest, Length(pin->GetBaseName()));
+    return longest;
+}
+
+int Netlist::GetLongestPortName(Iterator<Signal *> &signals) {
+    return LongestName(signals,
+                       [](Signal const &s) { return s.IsPort() && s.IsNeededToDeclared(); });
+}
+
+int Netlist::GetLongestSignalName(Iterator<Signal *> &signals) {
+    return LongestName(signals, [](Signal const &s) { return s.IsNeededToDeclared(); });
+}
+
+void Netlist::GetLongestAttrName(AttributeHolder const *holder, int &longest) {
+    if (holder && holder->HasAttrs())
+        ForEach(holder->GetAttrIterator(), [&longest](Attribute const *attribute) {
+            longest = std::max(longest, Length(attribute->GetNameRef()));
+        });
+}
+
+int Netlist::GetLongestAttrName(Netlist const *netlist) {
+    int longest = 0;
+    if (!netlist)
+        return longest;
+    ForEach(netlist->record->signals, [&longest](Signal const *signal) {
+        if (signal->GetPortPolarity() == Polarity::INVALID && signal->IsNeededToDeclared())
+            GetLongestAttrName(signal, longest);
+    });
+    ForEach(netlist->record->instances, [&longest](Instance const *instance) {
+        GetLongestAttrName(instance->GetComponent(), longest);
+        GetLongestAttrName(instance, longest);
+    });
+    return longest;
+}
+
+} // namespace Vesk_Hdl

@@ -1,0 +1,21 @@
+#pragma once
+
+#include "vesk_hdl/netlist/Netlist.h"
+
+namespace Vesk_Hdl {
+
+/// Members die in reverse order: the maps first, then the signals, the instances whose pins point
+/// at them, and last the components that the instances point at.
+struct Netlist::Record {
+    OwnPtrArray<Component *> components;
+    OwnPtrArray<Instance *> instances;
+    OwnPtrArray<Signal *> widenedSlices; ///< what stands for buses that a wider one replaced
+    OwnPtrArray<Signal *> signals;
+    IStringPtrMap<Component *> componentMap;
+    IStringPtrMap<Instance *> instanceMap;
+    IStringPtrMap<Signal *> signalMap; ///< by full name
+    IStringPtrMap<Signal *> busMap;    ///< each Bus by its base name
+    Basis::StringBase<char> sourceFileName;
+};
+
+} // namespace Vesk_Hdl

@@ -1,0 +1,215 @@
+// The rewriting before a write. A drawing may read an out port, drive an in port and join several
+// drivers on an out port; VHDL forbids the first two (IEEE 1076-1993, 1.1.1.2 and 4.3.2) and gives
+// the third no single source. These passes change the netlist for good and know nothing of text.
+
+#include "vesk_hdl/netlist/Netlist.h"
+
+#include <string>
+#include <unordered_map>
+#include <vector>
+
+#include "vesk_hdl/netlist/Names.h"
+#include "vesk_hdl/netlist/NetlistRecord.h"
+#include "vesk_hdl/text/basis/Ascii.h"
+
+namespace Vesk_Hdl {
+
+using Basis::StringBase;
+
+namespace {
+
+/// Where scalar signals stand in compounds, by name in any case. It takes the place of a walk over
+/// all compounds of the netlist for each scalar that gets a dummy.
+class ScalarMembers {
+public:
+    explicit ScalarMembers(PtrArray<Signal *> const &signals) {
+        ForEach(signals, [this](Signal *signal) {
+            auto *const compound = dynamic_cast<CompoundBus *>(signal);
+            for (int i = 0; compound && i < compound->GetSize(); ++i)
+                if (dynamic_cast<ScalarSignal *>(compound->GetAt(i)))
+                    places[Fold(compound->GetAt(i)->GetNameRef())].push_back({compound, i});
+        });
+    }
+
+    /// Puts `dummy` into every place of a scalar of that name.
+    void Replace(StringBase<char> const &name, Signal *dummy) {
+        auto const found = places.find(Fold(name));
+        if (found == places.end())
+            return;
+        std::vector<Place> const replaced = std::move(found->second);
+        places.erase(found);
+        // The places now bear the dummy's name, by which a later round may find them again.
+        std::vector<Place> &now = places[Fold(dummy->GetNameRef())];
+        for (Place const &place : replaced) {
+            place.compound->SetAt(place.position, dummy);
+            now.push_back(place);
+        }
+    }
+
+private:
+    struct Place {
+        CompoundBus *compound;
+        int position;
+    };
+
+    static std::string Fold(StringBase<char> const &name) {
+        std::string folded(name.View());
+        for (char &c : folded)
+            c = Basis::Ascii::ToUpper(c);
+        return folded;
+    }
+
+    std::unordered_map<std::string, std::vector<Place>> places;
+};
+
+/// The dummy of a slice or index of a bus, on the bus's own dummy; null for any other class.
+Signal *MakeSliceDummy(Signal const *member, Bus *parent) {
+    if (auto const *const slice = dynamic_cast<BusSlice const *>(member))
+        return slice->CreateDummySignal(parent);
+    if (auto const *const index = dynamic_cast<BusIndex const *>(member))
+        return index->CreateDummySignal(parent);
+    return nullptr;
+}
+
+} // namespace
+
+void Netlist::CreateVhdlDummySignals() {
+    // One set for all stages: emptied, it still keeps the names that a stage handled out of the
+    // later ones.
+    StringSet names;
+    GetFeedBackSignals(true, names);
+    AddDummySignals(true, names);
+    names.Empty();
+    GetFeedBackSignals(false, names);
+    AddDummySignals(false, names);
+    names.Empty();
+    GetWiredOrOutputSignals(names);
+    AddDummySignals(true, names);
+}
+
+void Netlist::CreateVerilogDummySignals() {
+    StringSet names;
+    GetFeedBackSignals(false, names);
+    AddDummySignals(false, names);
+}
+
+/// Collects the out ports that an instance reads, or the in ports that an instance drives.
+void Netlist::GetFeedBackSignals(bool outPortToInPin, StringSet &names) {
+    PtrArray<Pin *> pins;
+    ForEach(record->instances, [&](Instance const *instance) {
+        pins.Empty();
+        if (outPortToInPin)
+            instance->GetOutPortConnectedToInPin(pins);
+        else
+            instance->GetInPortConnectedToOutPin(pins);
+        ForEach(pins, [&names](Pin const *pin) { pin->GetSignal()->GetBaseName(names); });
+    });
+}
+
+/// Collects the out ports with several drivers.
+void Netlist::GetWiredOrOutputSignals(StringSet &names) {
+    ForEach(record->signals, [&names](Signal const *signal) {
+        if (signal->GetPortPolarity() == Polarity::OUTPUT && signal->HasMultiDriver())
+            signal->GetBaseName(names);
+    });
+}
+
+/// Gives each named signal a dummy that takes over its connections. With `portTakesDummy` the port
+/// is assigned from the dummy, otherwise the dummy from the port. The order of the names is the
+/// order of the new signals.
+void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
+    if (names.IsEmpty())
+        return;
+    auto const addDummy = [this](Signal *dummy, Signal *old) {
+        Add(dummy);
+        dummy->CloneConnection(old);
+    };
+    auto const link = [portTakesDummy](Signal *port, Signal *dummy) {
+        if (portTakesDummy)
+            port->Connect(dummy);
+        else
+            dummy->Connect(port);
+    };
+
+    ScalarMembers scalarMembers(record->signals);
+    PtrArray<CompoundBus *> compounds;
+    StringSetIterator const end = names.GetEndPos();
+    for (StringSetIterator it = names.GetBeginPos(); it != end; ++it) {
+        StringBase<char> const name = *it;
+        Signal *const found = GetSignal(name);
+        if (auto *const old = dynamic_cast<ScalarSignal *>(found)) {
+            ScalarSignal *const dummy = old->CreateDummySignal();
+            addDummy(dummy, old);
+            link(old, dummy);
+            scalarMembers.Replace(name, dummy);
+        } else if (Bus *const oldBus = FindBus(Object::GetBaseName(name).View())) {
+            Bus *const dummy = oldBus->CreateDummySignal();
+            addDummy(dummy, oldBus);
+            link(oldBus, dummy);
+            // The slices get no link of their own: the assignment of the whole buses carries them.
+            ForEach(oldBus->GetBusSliceIterator(), [&](Signal *member) {
+                if (Signal *const part = MakeSliceDummy(member, dummy))
+                    addDummy(part, member);
+            });
+        } else if (auto *const compound = dynamic_cast<CompoundBus *>(found)) {
+            compounds.Add(compound);
+        }
+    }
+
+    // A compound's dummy lists the dummies of its members, which exist by now.
+    ForEach(compounds, [&](CompoundBus *old) {
+        CompoundBus *const dummy = old->CreateDummySignal();
+        addDummy(dummy, old);
+        ForEach(old->GetBusMemberIterator(), [this, dummy](Signal const *member) {
+            if (Signal *const memberDummy = GetSignal(member->GetDummySignalName()))
+                dummy->AddBusMember(memberDummy);
+        });
+    });
+}
+
+void Netlist::ConnectOpenPinToDummy() {
+    PtrArray<Pin *> open;
+    ForEach(record->instances, [&](Instance const *instance) {
+        open.Empty();
+        instance->GetOpenPin(open, true);
+        ForEach(open, [&](Pin *pin) {
+            StringBase<char> name = instance->GetName();
+            name += '_';
+            name += pin->GetBaseName();
+            name += "_openSignal";
+            Signal *signal = nullptr;
+            if (pin->GetPinType() == Pin::PIN_SCALAR) {
+                signal = new ScalarSignal(name);
+            } else if (auto const *const busPin = dynamic_cast<BusPin const *>(pin)) {
+                StringBase<char> left;
+                StringBase<char> right;
+                busPin->GetIndex(left, right);
+                name += '(';
+                name += left;
+                name += ':';
+                name += right;
+                name += ')';
+                signal = new Bus(name);
+            } else {
+                return; // one bit of a bus pin: a port may not be open in part, so it stays whole
+            }
+            Add(signal);
+            pin->Connect(signal);
+        });
+    });
+}
+
+void Netlist::SetBoxTypeAttribute() {
+    ForEach(record->components, [](Component *component) {
+        Attribute const *const level = component->GetAttr("Level");
+        if (!level || !Basis::Ascii::EqualIgnoringCase(level->GetValueString().View(), "ORVANE") ||
+            component->GetAttr("BOX_TYPE"))
+            return;
+        Attribute *const boxType =
+            AttributeFactory::GetInstance().CreateAttribute("String", "BOX_TYPE", "BLACK_BOX");
+        boxType->SetSynAttr("ASSIGN");
+        component->AddAttr(boxType);
+    });
+}
+
+} // namespace Vesk_Hdl

@@ -1,0 +1,105 @@
+#include "vesk_hdl/netlist/Object.h"
+
+#include <atomic>
+
+#include "vesk_hdl/netlist/Names.h"
+#include "vesk_hdl/text/basis/Functions.h"
+
+namespace Vesk_Hdl {
+
+using Basis::StringBase;
+
+/// Shared between copies: the pins of a million instances are called what their components' pins
+/// are called.
+struct Object::Record {
+    Record() = default;
+    Record(Record const &other)
+        : name(other.name), comment(other.comment), objectType(other.objectType) {}
+
+    StringBase<char> name;
+    StringBase<char> comment;
+    ObjectType objectType = ObjectType();
+    std::atomic<unsigned int> owners{1};
+};
+
+Object::Object() : record(new Record) {}
+
+Object::Object(Object const &other) : record(other.record) {
+    record->owners.fetch_add(1, std::memory_order_relaxed);
+}
+
+Object::~Object() { Release(); }
+
+void Object::Release() {
+    if (record->owners.load(std::memory_order_acquire) == 1 ||
+        record->owners.fetch_sub(1, std::memory_order_acq_rel) == 1)
+        delete record;
+}
+
+/// The record for writing: this object's alone.
+Object::Record &Object::Own() {
+    if (record->owners.load(std::memory_order_acquire) != 1) {
+        auto *const copy = new Record(*record);
+        Release();
+        record = copy;
+    }
+    return *record;
+}
+
+Object &Object::operator=(Object const &other) {
+    if (record != other.record) {
+        other.record->owners.fetch_add(1, std::memory_order_relaxed);
+        Release();
+        record = other.record;
+    }
+    return *this;
+}
+
+bool Object::operator==(Object const &other) const {
+    return record->comment == other.record->comment && record->name == other.record->name &&
+           record->objectType == other.record->objectType;
+}
+
+void Object::SetName(char const *name) { SetNormalizedName(name); }
+
+StringBase<char> Object::GetName() const { return record->name; }
+StringBase<char> const &Object::GetNameRef() const { return record->name; }
+StringBase<char> Object::GetComment() const { return record->comment; }
+bool Object::HasComment() const { return !record->comment.IsEmpty(); }
+
+void Object::AddComment(char const *text) {
+    StringBase<char> &comment = Own().comment;
+    comment += text;
+    comment += '\n';
+}
+
+bool Object::IsNamed(char const *name) const { return Basis::stricmp(record->name, name) == 0; }
+
+void Object::NormalizeName(StringBase<char> &name) { Names::Normalize(name); }
+
+StringBase<char> Object::GetBaseName(char const *name) {
+    Names::Key const key(name);
+    return StringBase<char>(Names::BaseName(key.View()));
+}
+
+bool Object::IsValidBaseName(char const *name) { return name && Names::IsBaseName(name); }
+
+bool Object::IsValidIntegerString(StringBase<char> const &text) {
+    return Names::IsInteger(text.View());
+}
+
+Object::ObjectType Object::GetStoredObjectType() const { return record->objectType; }
+
+void Object::SetObjectType(ObjectType type) { Own().objectType = type; }
+
+void Object::SetNameText(StringBase<char> const &name) { Own().name = name; }
+
+void Object::SetNormalizedName(char const *name) {
+    StringBase<char> text(name);
+    Names::Normalize(text);
+    SetNameText(text);
+}
+
+ObjectVisitor::~ObjectVisitor() = default;
+
+} // namespace Vesk_Hdl

@@ -1,0 +1,239 @@
+#include "vesk_hdl/netlist/Pin.h"
+
+#include "vesk_hdl/netlist/Names.h"
+#include "vesk_hdl/netlist/NaturalOrder.h"
+#include "vesk_hdl/netlist/Signal.h"
+#include "vesk_hdl/text/basis/Ascii.h"
+
+namespace Vesk_Hdl {
+
+using Basis::StringBase;
+
+namespace {
+
+Pin *FindPin(PtrArray<Pin *> const &pins, char const *name) {
+    Names::Key const key(name);
+    for (int i = 0; i < pins.GetSize(); ++i) {
+        Pin *const pin = pins.GetAt(i);
+        if (pin && Basis::Ascii::EqualIgnoringCase(pin->GetNameRef().View(), key.View()))
+            return pin;
+    }
+    return nullptr;
+}
+
+std::unique_ptr<Pin> MakePin(char const *name, Polarity const &polarity) {
+    std::string_view const text(name ? name : "");
+    std::string_view base;
+    std::string_view index;
+    if (Names::IsBusName(text))
+        return std::make_unique<BusPin>(name, polarity);
+    if (Names::SplitBusIndexName(text, base, index))
+        return std::make_unique<BusIndexPin>(name, polarity);
+    return std::make_unique<ScalarPin>(name, polarity);
+}
+
+/// Appends the pins of one of two polarities that are on a port of another.
+void FindOnPorts(PtrArray<Pin *> const &pins, Polarity::Value pinPolarity,
+                 Polarity::Value portPolarity, PtrArray<Pin *> &found) {
+    ForEach(pins, [&](Pin *pin) {
+        Polarity::Value const own = pin->GetPolarity().GetValue();
+        Signal const *const signal = pin->GetSignal();
+        if (signal && (own == pinPolarity || own == Polarity::BIDIRECTIONAL) &&
+            signal->GetPortPolarity() == portPolarity)
+            found.Add(pin);
+    });
+}
+
+} // namespace
+
+struct Pin::Record {
+    Polarity polarity;
+    Signal *signal = nullptr;
+    BitVectorValue defaultValue;
+};
+
+Pin::Pin(char const *name, Polarity const &polarity)
+    : record(new Record{polarity, nullptr, BitVectorValue()}) {
+    SetNormalizedName(name);
+    SetObjectType(OBJECT_PIN);
+}
+
+Pin::Pin(Pin const &other)
+    : Object(other), AttributeHolder(other), record(new Record(*other.record)) {
+    if (record->signal)
+        record->signal->NoteReference();
+}
+
+Pin::~Pin() = default;
+
+Object::ObjectType Pin::GetObjectType() const { return OBJECT_PIN; }
+void Pin::AcceptObject(ObjectVisitor &visitor) { visitor.VisitPin(this); }
+void Pin::SetName(char const *name) { Object::SetName(name); }
+
+Pin &Pin::operator=(Pin const &other) {
+    if (this == &other)
+        return *this;
+    AttributeHolder::operator=(other);
+    Object::operator=(other);
+    record->polarity = other.record->polarity;
+    Connect(other.record->signal);
+    record->defaultValue = other.record->defaultValue;
+    return *this;
+}
+
+void Pin::Connect(Signal *signal) {
+    record->signal = signal;
+    if (signal)
+        signal->NoteReference();
+}
+
+void Pin::SetListedSignal(Signal *signal) { record->signal = signal; }
+void Pin::Disconnect() { record->signal = nullptr; }
+Signal *Pin::GetSignal() const { return record->signal; }
+void Pin::SetPolarity(Polarity const &polarity) { record->polarity = polarity; }
+Polarity Pin::GetPolarity() const { return record->polarity; }
+StringBase<char> Pin::GetPolarityName() const { return record->polarity.GetValueName(); }
+void Pin::SetDefaultValue(BitVectorValue const &value) { record->defaultValue = value; }
+void Pin::SetDefaultValue(char const *text) { record->defaultValue.SetValue(text); }
+BitVectorValue Pin::GetDefaultValue() const { return record->defaultValue; }
+
+ScalarPin::ScalarPin(char const *name, Polarity const &polarity) : Pin(name, polarity) {}
+ScalarPin::ScalarPin(ScalarPin const &other) = default;
+ScalarPin &ScalarPin::operator=(ScalarPin const &other) = default;
+Pin::PinType ScalarPin::GetPinType() const { return PIN_SCALAR; }
+Pin *ScalarPin::ClonePin() const { return new ScalarPin(*this); }
+void ScalarPin::AcceptPin(PinVisitor &visitor) { visitor.VisitScalarPin(this); }
+StringBase<char> ScalarPin::GetBaseName() const { return GetNameRef(); }
+
+BusPin::BusPin(char const *name, Polarity const &polarity) : Pin(name, polarity) {}
+BusPin::BusPin(BusPin const &other) = default;
+BusPin &BusPin::operator=(BusPin const &other) = default;
+Pin::PinType BusPin::GetPinType() const { return PIN_BUS; }
+Pin *BusPin::ClonePin() const { return new BusPin(*this); }
+void BusPin::AcceptPin(PinVisitor &visitor) { visitor.VisitBusPin(this); }
+StringBase<char> BusPin::GetBaseName() const { return Object::GetBaseName(GetNameRef()); }
+
+void BusPin::GetIndex(StringBase<char> &left, StringBase<char> &right) const {
+    StringBase<char> base;
+    Bus::ParseBusName(GetNameRef(), base, left, right);
+}
+
+bool BusPin::IsDownTo() const {
+    Names::Bounds bounds;
+    return Names::ParseBounds(GetNameRef().View(), bounds) && bounds.IsDownTo();
+}
+
+int BusPin::GetWidth() const { return Names::BusWidth(GetNameRef().View()); }
+
+BusIndexPin::BusIndexPin(char const *name, Polarity const &polarity) : Pin(name, polarity) {}
+BusIndexPin::BusIndexPin(BusIndexPin const &other) = default;
+BusIndexPin &BusIndexPin::operator=(BusIndexPin const &other) = default;
+Pin::PinType BusIndexPin::GetPinType() const { return PIN_BUS_INDEX; }
+Pin *BusIndexPin::ClonePin() const { return new BusIndexPin(*this); }
+void BusIndexPin::AcceptPin(PinVisitor &visitor) { visitor.VisitBusIndexPin(this); }
+StringBase<char> BusIndexPin::GetBaseName() const { return Object::GetBaseName(GetNameRef()); }
+
+StringBase<char> BusIndexPin::GetIndex() const {
+    StringBase<char> base;
+    StringBase<char> index;
+    BusIndex::ParseBusIndexName(GetNameRef(), base, index);
+    return index;
+}
+
+PinVisitor::~PinVisitor() = default;
+
+struct Component::Record {
+    OwnPtrArray<Pin *> pins;
+};
+
+Component::Component(char const *name) : record(std::make_unique<Record>()) {
+    SetNormalizedName(name);
+    SetObjectType(OBJECT_COMPONENT);
+}
+
+Component::~Component() = default;
+
+Object::ObjectType Component::GetObjectType() const { return GetStoredObjectType(); }
+void Component::AcceptObject(ObjectVisitor &visitor) { visitor.VisitComponent(this); }
+void Component::SetName(char const *name) { Object::SetName(name); }
+
+void Component::AddPin(char const *name, Polarity const &polarity,
+                       BitVectorValue const &defaultValue) {
+    std::unique_ptr<Pin> pin = MakePin(name, polarity);
+    if (!defaultValue.IsEmpty())
+        pin->SetDefaultValue(defaultValue);
+    record->pins.Add(pin.get());
+    pin.release();
+}
+
+void Component::AddPin(char const *name, Polarity const &polarity, char const *defaultValue) {
+    AddPin(name, polarity, BitVectorValue(defaultValue));
+}
+
+void Component::AddPin(Pin const &pin) {
+    AddPin(pin.GetName(), pin.GetPolarity(), pin.GetDefaultValue());
+}
+
+Pin *Component::GetPin(char const *name) const { return FindPin(record->pins, name); }
+
+Iterator<Pin *> Component::GetPinIterator() const { return Iterator<Pin *>(&record->pins); }
+
+struct Instance::Record {
+    Component *component = nullptr;
+    OwnPtrArray<Pin *> pins;
+};
+
+Instance::Instance(char const *name, Component *component) : record(std::make_unique<Record>()) {
+    record->component = component;
+    SetNormalizedName(name);
+    SetObjectType(OBJECT_INSTANCE);
+    if (!component)
+        return;
+    ForEach(component->record->pins, [this](Pin const *pin) {
+        std::unique_ptr<Pin> copy(pin->ClonePin());
+        record->pins.Add(copy.get());
+        copy.release();
+    });
+}
+
+Instance::~Instance() = default;
+
+Object::ObjectType Instance::GetObjectType() const { return GetStoredObjectType(); }
+void Instance::AcceptObject(ObjectVisitor &visitor) { visitor.VisitInstance(this); }
+void Instance::SetName(char const *name) { Object::SetName(name); }
+
+Component *Instance::GetComponent() const { return record->component; }
+
+StringBase<char> Instance::GetComponentName() const {
+    return record->component ? record->component->GetName() : StringBase<char>();
+}
+
+Attribute *Instance::GetComponentAttr(char const *name) const {
+    return record->component ? record->component->GetAttr(name) : nullptr;
+}
+
+Pin *Instance::GetPin(char const *name) const { return FindPin(record->pins, name); }
+
+Iterator<Pin *> Instance::GetPinIterator() const { return Iterator<Pin *>(&record->pins); }
+
+void Instance::SortPinName() {
+    SortNaturally(record->pins, [](Pin const *pin) { return pin->GetPolarity(); });
+}
+
+void Instance::GetOutPortConnectedToInPin(PtrArray<Pin *> &found) const {
+    FindOnPorts(record->pins, Polarity::INPUT, Polarity::OUTPUT, found);
+}
+
+void Instance::GetInPortConnectedToOutPin(PtrArray<Pin *> &found) const {
+    FindOnPorts(record->pins, Polarity::OUTPUT, Polarity::INPUT, found);
+}
+
+bool Instance::GetOpenPin(PtrArray<Pin *> &found, bool onlyInputs) const {
+    ForEach(record->pins, [&](Pin *pin) {
+        if (!pin->GetSignal() && (!onlyInputs || pin->GetPolarity() == Polarity::INPUT))
+            found.Add(pin);
+    });
+    return !found.IsEmpty();
+}
+
+} // namespace Vesk_Hdl

@@ -1,0 +1,106 @@
+#include "vesk_hdl/netlist/Values.h"
+
+#include <cstdlib>
+#include <cstring>
+
+#include "vesk_hdl/text/StringArray.h"
+#include "vesk_hdl/text/basis/Functions.h"
+
+namespace Vesk_Hdl {
+
+using Basis::StringBase;
+
+namespace {
+
+char const *const POLARITY_NAMES[] = {"Input", "Output", "BiDirectional"};
+
+} // namespace
+
+Polarity::Polarity(char const *text) : value(GetValue(text)) {}
+
+void Polarity::SetValue(char const *text) { value = GetValue(text); }
+
+Polarity::Value Polarity::GetValue(char const *text) {
+    std::size_t const length = text ? std::strlen(text) : 0;
+    if (length == 0)
+        return INVALID;
+    for (int i = INPUT; i <= BIDIRECTIONAL; ++i)
+        if (Basis::strnicmp(POLARITY_NAMES[i], text, length) == 0)
+            return static_cast<Value>(i);
+    return INVALID;
+}
+
+bool Polarity::IsValidValue(Value value) {
+    return static_cast<unsigned int>(value) <= static_cast<unsigned int>(BIDIRECTIONAL);
+}
+
+StringBase<char> Polarity::GetValueName() const {
+    return IsValidValue(value) ? POLARITY_NAMES[value] : "Output";
+}
+
+struct BitVectorValue::Record {
+    StringBase<char> value;
+    int base = 2;
+    int length = 1;
+    bool hasBaseAndLength = false;
+};
+
+BitVectorValue::BitVectorValue() : record(nullptr) {}
+
+BitVectorValue::BitVectorValue(char const *text) : record(nullptr) { SetValue(text); }
+
+BitVectorValue::BitVectorValue(BitVectorValue const &other)
+    : record(other.record ? new Record(*other.record) : nullptr) {}
+
+BitVectorValue::~BitVectorValue() { delete record; }
+
+BitVectorValue &BitVectorValue::operator=(BitVectorValue const &other) {
+    if (this != &other) {
+        Record *const copy = other.record ? new Record(*other.record) : nullptr;
+        delete record;
+        record = copy;
+    }
+    return *this;
+}
+
+void BitVectorValue::SetValue(char const *text) {
+    StringBase<char> const whole(text); // the text may be this value's own
+    delete record;
+    record = nullptr;
+    if (whole.IsEmpty())
+        return;
+    record = new Record;
+    StringArray const parts(whole, ":", true, nullptr);
+    if (parts.GetSize() < 3) {
+        record->value = whole;
+        return;
+    }
+    record->length = std::atoi(parts.At(0));
+    record->base = ConvertToBase(parts.At(1));
+    record->value = parts.At(2);
+    record->hasBaseAndLength = true;
+}
+
+StringBase<char> BitVectorValue::GetValue() const {
+    return record ? record->value : StringBase<char>();
+}
+
+int BitVectorValue::GetBase() const { return record ? record->base : 2; }
+int BitVectorValue::GetLength() const { return record ? record->length : 1; }
+bool BitVectorValue::HasBaseAndLength() const { return record && record->hasBaseAndLength; }
+bool BitVectorValue::IsEmpty() const { return !record || record->value.IsEmpty(); }
+
+int BitVectorValue::ConvertToBase(char const *text) const {
+    switch (text[0]) {
+    case 'o':
+    case 'O':
+        return 8;
+    case 'h':
+    case 'H':
+        return 16;
+    default:
+        return 2;
+    }
+}
+
+} // namespace Vesk_Hdl

@@ -1,0 +1,174 @@
+#include "vesk_hdl/text/OutStream.h"
+
+#include <cerrno>
+
+#include "vesk_hdl/text/FoldingLine.h"
+
+StreamDst::StreamDst() : indentLevel(0) {}
+StreamDst::StreamDst(StreamDst const &other) = default;
+StreamDst &StreamDst::operator=(StreamDst const &other) = default;
+StreamDst::~StreamDst() = default;
+void StreamDst::Flush() {}
+void StreamDst::WriteNewLine() { Write("\n"); }
+void StreamDst::Indent() { ++indentLevel; }
+void StreamDst::Unindent() { indentLevel -= indentLevel > 0 ? 1 : 0; }
+int StreamDst::GetIndentLevel() const { return indentLevel; }
+
+namespace {
+
+using Basis::File;
+using Basis::Stream;
+using Vesk_Hdl::FoldingLine;
+
+/// Text into a file, a line at a time. Writes nothing while no file is open.
+class TextFileDst : public StreamDst {
+public:
+    explicit TextFileDst(char const *name) : fileName(name) {}
+    TextFileDst(TextFileDst const &) = delete;
+    TextFileDst &operator=(TextFileDst const &) = delete;
+    ~TextFileDst() override { Close(); }
+
+    void Flush() override {
+        if (!file)
+            return;
+        if (!line.IsEmpty())
+            line.Break(*file, Indentation());
+        file->flush();
+    }
+
+    using StreamDst::Write;
+    void Write(char const *text) override { WriteText(text); }
+    void Write(int value) override {
+        if (file)
+            AppendToken(std::to_string(value));
+    }
+
+    /// What stands in front of a "\n" in one piece ends the line unfolded.
+    void WriteText(std::string_view rest) {
+        if (!file)
+            return;
+        for (std::size_t end; (end = rest.find('\n')) != std::string_view::npos;) {
+            IndentNewLine();
+            line.Write(*file);
+            file->Write(rest.substr(0, end + 1));
+            rest.remove_prefix(end + 1);
+        }
+        if (!rest.empty())
+            AppendToken(rest);
+    }
+
+    bool Open(char const *name, bool append) {
+        Close();
+        file = append ? File::open(name, Stream::ACCESS_APPEND, false)
+                      : File::open(name, Stream::ACCESS_REPLACE, true);
+        error = file ? 0 : errno;
+        return file != nullptr;
+    }
+
+    void Close() {
+        if (!file)
+            return;
+        Flush();
+        if (!File::close(file))
+            error = errno;
+        file = nullptr;
+    }
+
+    bool IsOpen() const { return file != nullptr; }
+    int GetError() const { return file ? file->GetError() : error; }
+    Basis::StringBase<char> const &GetFileName() const { return fileName; }
+
+private:
+    std::size_t Indentation() const { return 3 * static_cast<std::size_t>(GetIndentLevel()); }
+
+    void IndentNewLine() {
+        if (line.IsEmpty())
+            line.Indent(Indentation());
+    }
+
+    void AppendToken(std::string_view token) {
+        IndentNewLine();
+        if (!line.IsComment() && line.GetLength() + token.size() > FoldingLine::MAX_LENGTH)
+            line.Fold(*file, Indentation());
+        line.Append(token);
+    }
+
+    Stream *file = nullptr;
+    FoldingLine line;
+    Basis::StringBase<char> fileName;
+    int error = 0;
+};
+
+class TextMemDst : public StreamDst {
+public:
+    explicit TextMemDst(char const *text) : value(text) {}
+    void Write(char const *text) override { value += text; }
+    void Write(int number) override { value += std::to_string(number); }
+
+    Basis::StringBase<char> value;
+};
+
+} // namespace
+
+namespace Vesk_Hdl {
+
+OutStream::OutStream(StreamDst *destination) : dst(destination) {}
+OutStream::~OutStream() { delete dst; }
+
+OutStream &OutStream::operator<<(Operand operand) {
+    if (operand == NEW_LINE)
+        dst->WriteNewLine();
+    else if (operand == FLUSH)
+        dst->Flush();
+    return *this;
+}
+
+OutStream &OutStream::operator<<(int value) {
+    dst->Write(value);
+    return *this;
+}
+
+OutStream &OutStream::operator<<(char const *text) {
+    dst->Write(text ? text : "");
+    return *this;
+}
+
+OutStream &OutStream::operator<<(Basis::StringBase<char> const &text) {
+    dst->Write(text.GetText());
+    return *this;
+}
+
+void OutStream::Indent() { dst->Indent(); }
+void OutStream::Unindent() { dst->Unindent(); }
+
+TextFileOutStream::TextFileOutStream(char const *fileName, bool append)
+    : OutStream(new TextFileDst(fileName)) {
+    if (fileName)
+        Open(fileName, append);
+}
+
+bool TextFileOutStream::Open(char const *fileName, bool append) {
+    return static_cast<TextFileDst *>(dst)->Open(fileName, append);
+}
+
+void TextFileOutStream::Close() { static_cast<TextFileDst *>(dst)->Close(); }
+
+bool TextFileOutStream::IsOpen() const { return static_cast<TextFileDst *>(dst)->IsOpen(); }
+
+Basis::StringBase<char> TextFileOutStream::GetFileName() const {
+    return static_cast<TextFileDst *>(dst)->GetFileName();
+}
+
+int TextFileOutStream::GetError() const { return static_cast<TextFileDst *>(dst)->GetError(); }
+
+TextMemOutStream::TextMemOutStream(char const *value) : OutStream(new TextMemDst(value)) {}
+
+Basis::StringBase<char> TextMemOutStream::GetValue() const {
+    return static_cast<TextMemDst *>(dst)->value;
+}
+
+void TextMemOutStream::SetValue(char const *value) {
+    static_cast<TextMemDst *>(dst)->value = value;
+}
+
+} // namespace Vesk_Hdl

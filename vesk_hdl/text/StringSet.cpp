@@ -1,0 +1,117 @@
+#include "vesk_hdl/text/StringSet.h"
+
+#include "vesk_hdl/text/StringTable.h"
+#include "vesk_hdl/text/basis/OrEmpty.h"
+
+namespace Vesk_Hdl {
+
+using Basis::ViewOf;
+
+namespace {
+
+constexpr std::uint32_t FIRST_BUCKETS = 100;
+
+} // namespace
+
+struct StringSetIterator::Cell {
+    StringTable const *table;
+    StringTable::Node const *node; ///< null at the end
+};
+
+StringSetIterator::StringSetIterator() : cell(nullptr) {}
+StringSetIterator::StringSetIterator(void *position) : cell(static_cast<Cell *>(position)) {}
+StringSetIterator::StringSetIterator(StringSetIterator const &other)
+    : cell(other.cell ? new Cell(*other.cell) : nullptr) {}
+StringSetIterator::~StringSetIterator() { delete cell; }
+
+StringSetIterator &StringSetIterator::operator=(StringSetIterator const &other) {
+    if (this != &other) {
+        Cell *const copy = other.cell ? new Cell(*other.cell) : nullptr;
+        delete cell;
+        cell = copy;
+    }
+    return *this;
+}
+
+bool StringSetIterator::operator==(StringSetIterator const &other) const {
+    if (!cell || !other.cell)
+        return cell == other.cell;
+    return cell->node == other.cell->node;
+}
+
+bool StringSetIterator::operator!=(StringSetIterator const &other) const {
+    return !(*this == other);
+}
+
+StringSetIterator &StringSetIterator::operator++() {
+    if (cell && cell->node)
+        cell->node = cell->table->GetNext(cell->node);
+    return *this;
+}
+
+void StringSetIterator::operator++(int) { ++*this; }
+
+Basis::StringBase<char> StringSetIterator::operator*() const {
+    return cell && cell->node ? cell->node->key : Basis::StringBase<char>();
+}
+
+struct StringSet::Record {
+    StringTable insensitiveTable{StringTable::CASE_IGNORED, FIRST_BUCKETS};
+    StringTable sensitiveTable{StringTable::CASE_EXACT, FIRST_BUCKETS};
+};
+
+StringSet::StringSet() : record(new Record) {}
+StringSet::StringSet(StringSet &other) : StringSet() { *this = other; }
+StringSet::~StringSet() { delete record; }
+
+StringSet &StringSet::operator=(StringSet &other) {
+    if (this == &other)
+        return *this;
+    record->insensitiveTable.Empty();
+    StringTable const &source = other.record->sensitiveTable;
+    for (StringTable::Node const *node = source.GetFirst(); node; node = source.GetNext(node))
+        Add(node->key);
+    return *this;
+}
+
+void StringSet::Add(char const *string) { Add(Basis::StringBase<char>(string)); }
+
+void StringSet::Add(Basis::StringBase<char> const &string) {
+    // Both tables grow before anybody asks whether the string is new: an addition that changes
+    // nothing else can still change the order.
+    record->insensitiveTable.GrowForOneMore();
+    record->sensitiveTable.GrowForOneMore();
+    for (StringTable *const table : {&record->insensitiveTable, &record->sensitiveTable})
+        if (!table->Find(string.View()))
+            table->Insert(string, nullptr);
+}
+
+bool StringSet::IContains(char const *string) const { return IContains(ViewOf(string)); }
+
+bool StringSet::IContains(std::string_view string) const {
+    return record->insensitiveTable.Find(string) != nullptr;
+}
+
+bool StringSet::Contains(char const *string) const {
+    return record->sensitiveTable.Find(ViewOf(string)) != nullptr;
+}
+
+void StringSet::Remove(char const *string) {
+    record->insensitiveTable.Remove(ViewOf(string));
+    record->sensitiveTable.Remove(ViewOf(string));
+}
+
+bool StringSet::IsEmpty() const { return record->sensitiveTable.GetCount() == 0; }
+
+void StringSet::Empty() { record->sensitiveTable.Empty(); }
+
+StringSetIterator StringSet::GetBeginPos() {
+    StringTable const &table = record->sensitiveTable;
+    return StringSetIterator(new StringSetIterator::Cell{&table, table.GetFirst()});
+}
+
+StringSetIterator StringSet::GetEndPos() {
+    return StringSetIterator(new StringSetIterator::Cell{&record->sensitiveTable, nullptr});
+}
+
+} // namespace Vesk_Hdl

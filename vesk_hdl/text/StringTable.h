@@ -1,0 +1,63 @@
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <memory>
+#include <vector>
+
+#include "vesk_hdl/text/basis/StringBase.h"
+
+namespace Vesk_Hdl {
+
+/// The hash table behind IStringPtrMap and StringSet: texts, each with a pointer, hashed in chains.
+///
+/// The order of a walk is fixed, since the order of dummy signals in a written file comes from it:
+/// buckets in ascending order, and in a bucket the oldest text first, then the others newest first.
+/// Hash: from 5381, for each character as a signed byte, times 33 plus the character, in 32 bits.
+/// Bucket counts are primes; a table never holds more texts than it has buckets. A table that holds
+/// nothing yet costs no allocation.
+class StringTable {
+public:
+    enum CaseRule { CASE_EXACT, CASE_IGNORED };
+
+    struct Node {
+        Basis::StringBase<char> key;
+        void *value = nullptr;
+        Node *next = nullptr;
+        std::uint32_t hash = 0;
+    };
+
+    /// The table begins with the first bucket count of the series at or above `buckets`.
+    StringTable(CaseRule caseRule, std::uint32_t buckets);
+
+    std::size_t GetCount() const { return count; }
+    Node *Find(std::string_view key) const;
+    /// Makes the table as large as one more text demands.
+    void GrowForOneMore();
+    /// Adds a text that the table does not hold, behind GrowForOneMore.
+    Node *Insert(Basis::StringBase<char> const &key, void *value);
+    void Remove(std::string_view key);
+    /// Removes all texts; the bucket count stays.
+    void Empty();
+
+    /// The walk: the first node, the one behind `node`, null at the end.
+    Node *GetFirst() const { return FirstFrom(0); }
+    Node *GetNext(Node const *node) const;
+
+private:
+    std::uint32_t Hash(std::string_view key) const;
+    bool Equal(std::string_view a, std::string_view b) const;
+    std::uint32_t BucketOf(std::uint32_t hash) const { return hash % bucketCount; }
+    Node *FirstFrom(std::uint32_t bucket) const;
+    void Rebuild(std::uint32_t newCount);
+    Node *NewNode();
+
+    CaseRule caseRule;
+    std::uint32_t bucketCount;
+    std::size_t count = 0;
+    std::vector<Node *> buckets;                 ///< empty until the first text comes
+    std::vector<std::unique_ptr<Node[]>> blocks; ///< nodes are made by the block
+    Node *unused = nullptr;                      ///< nodes that hold no text
+};
+
+} // namespace Vesk_Hdl

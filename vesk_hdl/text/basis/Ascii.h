@@ -1,0 +1,27 @@
+#pragma once
+
+#include <string_view>
+
+/// Character tests that do not depend on the locale, so that a design reads the same everywhere.
+namespace Basis::Ascii {
+
+constexpr char ToUpper(char c) { return c >= 'a' && c <= 'z' ? static_cast<char>(c - 32) : c; }
+constexpr char ToLower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c + 32) : c; }
+constexpr bool IsDigit(char c) { return c >= '0' && c <= '9'; }
+constexpr bool IsLetter(char c) { return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z'); }
+
+constexpr bool EqualIgnoringCase(std::string_view a, std::string_view b) {
+    if (a.size() != b.size())
+        return false;
+    for (std::size_t i = 0; i < a.size(); ++i)
+        if (ToUpper(a[i]) != ToUpper(b[i]))
+            return false;
+    return true;
+}
+
+constexpr bool EndsWithIgnoringCase(std::string_view text, std::string_view end) {
+    return text.size() >= end.size() &&
+           EqualIgnoringCase(text.substr(text.size() - end.size()), end);
+}
+
+} // namespace Basis::Ascii

@@ -1,0 +1,54 @@
+#include "vesk_hdl/text/basis/Exception.h"
+
+#include <string>
+
+#include "vesk_hdl/text/basis/OrEmpty.h"
+#include "vesk_hdl/text/basis/Printf.h"
+
+namespace Basis {
+
+struct Exception::Record {
+    std::string module;
+    std::string sourceFile;
+    std::string revision;
+    int line;
+    std::string description;
+    std::wstring localized;
+};
+
+Exception::Exception(char const *module, char const *sourceFile, char const *revision, int line)
+    : record(new Record{
+          OrEmpty(module), OrEmpty(sourceFile), OrEmpty(revision), line, std::string(), {}}) {}
+
+Exception::Exception(Exception const &other) : record(new Record(*other.record)) {}
+
+Exception &Exception::operator=(Exception const &other) {
+    *record = *other.record;
+    return *this;
+}
+
+Exception::~Exception() { delete record; }
+
+wchar_t const *Exception::getLocalized() const { return record->localized.c_str(); }
+
+void Exception::report() const {
+    std::fprintf(stderr, "%s: %s", record->module.c_str(), record->description.c_str());
+}
+
+Exception &Exception::setDescription(char const *format, ...) {
+    va_list arguments;
+    va_start(arguments, format);
+    record->description = Printf(OrEmpty(format), arguments);
+    va_end(arguments);
+    record->localized.clear();
+    for (char const c : record->description)
+        record->localized += static_cast<wchar_t>(static_cast<unsigned char>(c));
+    return *this;
+}
+
+char const *Exception::getDescription() const { return record->description.c_str(); }
+char const *Exception::getModule() const { return record->module.c_str(); }
+char const *Exception::getSourceFile() const { return record->sourceFile.c_str(); }
+int Exception::getLine() const { return record->line; }
+
+} // namespace Basis

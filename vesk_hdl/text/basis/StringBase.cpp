@@ -1,0 +1,256 @@
+#include "vesk_hdl/text/basis/StringBase.h"
+
+#include <cstdarg>
+#include <cstdlib>
+#include <cstring>
+#include <new>
+#include <stdexcept>
+
+#include "vesk_hdl/text/basis/Ascii.h"
+#include "vesk_hdl/text/basis/File.h"
+#include "vesk_hdl/text/basis/OrEmpty.h"
+#include "vesk_hdl/text/basis/Printf.h"
+#include "vesk_hdl/text/basis/Regexp.h"
+#include "vesk_hdl/text/basis/Tokens.h"
+
+namespace Basis {
+
+namespace {
+
+constexpr std::size_t LONGEST = 0xFFFFFFEFU;
+
+} // namespace
+
+constinit StringBase<char>::EmptyRep StringBase<char>::empty = {{{1}, 0, 0}, {}};
+
+StringBase<char>::Rep *StringBase<char>::NewRep(std::size_t capacity) {
+    if (capacity > LONGEST)
+        throw std::length_error("Basis::StringBase: text too long");
+    void *const memory = std::malloc(sizeof(Rep) + capacity + 1);
+    if (!memory)
+        throw std::bad_alloc();
+    return new (memory) Rep{{1}, 0, static_cast<unsigned int>(capacity)};
+}
+
+void StringBase<char>::Release(Rep *rep) noexcept {
+    if (rep == &empty.rep)
+        return;
+    // Somebody who holds the only copy need not take part in the counting.
+    if (rep->owners.load(std::memory_order_acquire) == 1 ||
+        rep->owners.fetch_sub(1, std::memory_order_acq_rel) == 1)
+        std::free(rep);
+}
+
+/// Makes the text this string's own, `length` characters long, and gives it for writing: the old
+/// characters up to the new length stay, further ones are the caller's to fill.
+char *StringBase<char>::Writable(std::size_t length) {
+    bool const own = rep != &empty.rep && rep->owners.load(std::memory_order_acquire) == 1;
+    if (!own || length > rep->capacity) {
+        std::size_t const grown = own ? rep->capacity + rep->capacity / 2 : 0;
+        Rep *const wider = NewRep(length > grown ? length : std::min(grown, LONGEST));
+        std::memcpy(wider->Text(), rep->Text(), std::min<std::size_t>(length, rep->length));
+        Release(rep);
+        rep = wider;
+    }
+    rep->length = static_cast<unsigned int>(length);
+    rep->Text()[length] = '\0';
+    return rep->Text();
+}
+
+StringBase<char>::StringBase() noexcept : rep(&empty.rep) {}
+
+StringBase<char>::StringBase(char const *text) : StringBase(ViewOf(text)) {}
+
+StringBase<char>::StringBase(std::string_view text) : rep(&empty.rep) {
+    if (!text.empty())
+        std::memcpy(Writable(text.size()), text.data(), text.size());
+}
+
+StringBase<char>::StringBase(StringBase const &other) noexcept : rep(other.rep) {
+    if (rep != &empty.rep)
+        rep->owners.fetch_add(1, std::memory_order_relaxed);
+}
+
+StringBase<char>::StringBase(StringBase &&other) noexcept : rep(other.rep) {
+    other.rep = &empty.rep;
+}
+
+StringBase<char>::StringBase(StringBase const &whole, Basis_Range const &range)
+    : StringBase(whole.Extract(range)) {}
+
+StringBase<char>::~StringBase() { Release(rep); }
+
+StringBase<char> &StringBase<char>::operator=(char const *text) {
+    return *this = StringBase(ViewOf(text));
+}
+
+StringBase<char> &StringBase<char>::operator=(StringBase const &other) noexcept {
+    return *this = StringBase(other);
+}
+
+StringBase<char> &StringBase<char>::operator=(StringBase &&other) noexcept {
+    std::swap(rep, other.rep);
+    return *this;
+}
+
+StringBase<char> &StringBase<char>::operator+=(char character) {
+    return character ? *this += std::string_view(&character, 1) : *this;
+}
+
+StringBase<char> &StringBase<char>::operator+=(char const *text) { return *this += ViewOf(text); }
+
+StringBase<char> &StringBase<char>::operator+=(StringBase const &text) {
+    return *this += text.View();
+}
+
+StringBase<char> &StringBase<char>::operator+=(std::string_view text) {
+    if (text.empty())
+        return *this;
+    std::size_t const old = GetLength();
+    // A piece of this very text must outlive the growth: a second owner keeps it.
+    bool const ownPiece = text.data() >= GetText() && text.data() <= GetText() + old;
+    StringBase const keep = ownPiece ? *this : StringBase();
+    std::memcpy(Writable(old + text.size()) + old, text.data(), text.size());
+    return *this;
+}
+
+StringBase<char> &StringBase<char>::Append(StringBase const &text) { return *this += text; }
+
+StringBase<char> &StringBase<char>::Append(char const *text, unsigned int count) {
+    std::string_view const whole = ViewOf(text);
+    return *this += whole.substr(0, count == NOT_FOUND ? whole.size() : count);
+}
+
+void StringBase<char>::Empty() {
+    Release(rep);
+    rep = &empty.rep;
+}
+
+int StringBase<char>::Compare(StringBase const &other, CompareType type) const {
+    if (rep == other.rep)
+        return 0;
+    bool const equal = type == COMPARE_IGNORING_CASE
+                           ? Ascii::EqualIgnoringCase(View(), other.View())
+                           : View() == other.View();
+    return equal ? 0 : 1;
+}
+
+int StringBase<char>::Compare(char const *other, CompareType type) const {
+    std::string_view const view = ViewOf(other);
+    bool const equal =
+        type == COMPARE_IGNORING_CASE ? Ascii::EqualIgnoringCase(View(), view) : View() == view;
+    return equal ? 0 : 1;
+}
+
+unsigned int StringBase<char>::GetIndexOfFirstChar(char character, char) const {
+    std::size_t const at = character ? View().find(character) : std::string_view::npos;
+    return at == std::string_view::npos ? NOT_FOUND : static_cast<unsigned int>(at);
+}
+
+unsigned int StringBase<char>::GetIndexOfLastChar(char character, char) const {
+    std::size_t const at = character ? View().rfind(character) : std::string_view::npos;
+    return at == std::string_view::npos ? NOT_FOUND : static_cast<unsigned int>(at);
+}
+
+unsigned int StringBase<char>::GetIndexOfString(char const *text, CompareType type) const {
+    std::string_view const wanted = ViewOf(text);
+    if (type == COMPARE_EXACT) {
+        std::size_t const at = View().find(wanted);
+        return at == std::string_view::npos ? NOT_FOUND : static_cast<unsigned int>(at);
+    }
+    for (std::size_t at = 0; at + wanted.size() <= GetLength(); ++at)
+        if (Ascii::EqualIgnoringCase(View().substr(at, wanted.size()), wanted))
+            return static_cast<unsigned int>(at);
+    return NOT_FOUND;
+}
+
+unsigned int StringBase<char>::ReplaceChars(char from, char to) {
+    if (from == to || to == '\0' || GetIndexOfFirstChar(from, 0) == NOT_FOUND)
+        return 0;
+    unsigned int count = 0;
+    char *const text = Writable(GetLength());
+    for (unsigned int i = 0; i < GetLength(); ++i)
+        if (text[i] == from) {
+            text[i] = to;
+            ++count;
+        }
+    return count;
+}
+
+void StringBase<char>::MakeUpper() {
+    if (IsEmpty())
+        return;
+    char *const text = Writable(GetLength());
+    for (unsigned int i = 0; i < GetLength(); ++i)
+        text[i] = Ascii::ToUpper(text[i]);
+}
+
+void StringBase<char>::MakeLower() {
+    if (IsEmpty())
+        return;
+    char *const text = Writable(GetLength());
+    for (unsigned int i = 0; i < GetLength(); ++i)
+        text[i] = Ascii::ToLower(text[i]);
+}
+
+void StringBase<char>::Trim(char const *characters, TrimType) {
+    std::string_view const set = ViewOf(characters);
+    std::size_t const first = View().find_first_not_of(set);
+    if (first == std::string_view::npos)
+        return Empty();
+    std::size_t const last = View().find_last_not_of(set);
+    *this = StringBase(View().substr(first, last + 1 - first));
+}
+
+StringBase<char> StringBase<char>::Extract(Basis_Range const &range) const {
+    if (range.first > range.last || range.first >= GetLength())
+        return {};
+    if (range.first == 0 && range.last >= GetLength() - 1)
+        return *this;
+    std::size_t const count = static_cast<std::size_t>(range.last) + 1 - range.first;
+    return StringBase(View().substr(range.first, count));
+}
+
+void StringBase<char>::Remove(Basis_Range const &range) {
+    if (range.first > range.last || range.first >= GetLength())
+        return;
+    StringBase rest(View().substr(0, range.first));
+    if (range.last < GetLength())
+        rest += View().substr(static_cast<std::size_t>(range.last) + 1);
+    *this = static_cast<StringBase &&>(rest);
+}
+
+StringBase<char> &StringBase<char>::Format(char const *format, ...) {
+    va_list arguments;
+    va_start(arguments, format);
+    *this = StringBase(std::string_view(Printf(format, arguments)));
+    va_end(arguments);
+    return *this;
+}
+
+StringBase<char> StringBase<char>::doFormat(char const *format, ...) {
+    va_list arguments;
+    va_start(arguments, format);
+    StringBase text((std::string_view(Printf(format, arguments))));
+    va_end(arguments);
+    return text;
+}
+
+bool StringBase<char>::ReadLine(Stream *stream) {
+    std::string_view line;
+    if (!stream || !stream->ReadLine(line))
+        return false;
+    *this = StringBase(line.substr(0, line.find('\0')));
+    return true;
+}
+
+bool StringBase<char>::NextTokenRange(Basis_Range &range, char const *separators,
+                                      ParseType type) const {
+    return NextToken(View(), range, ViewOf(separators), type == PARSE_SKIPPING_EMPTY);
+}
+
+Basis_Range StringBase<char>::GetRangeOfMatch(Basis_Regexp const &expression) const {
+    return expression.Match(View());
+}
+
+} // namespace Basis

@@ -105,8 +105,7 @@ Signal *Model::CreateAndAddBusSliceSignal(char const *name, InHand &inHand) {
 }
 
 Signal *Model::CreateAndAddCompundSignal(char const *name, InHand &inHand) {
-    Text const typed(name);
-    Text normal(typed);
+    Text normal(name);
     Object::NormalizeName(normal);
     StringArray memberNames;
     CompoundBus::ParseCompoundBusName(normal, memberNames, false);
@@ -148,7 +147,7 @@ bool Model::Connect(Signal *signal, Pin *pin) {
 bool Model::Connect(Signal *left, Signal *right) {
     if (!left || !right)
         return false;
-    left->Connect(right);
+    GetNetlist()->Link(left, right);
     SetModifiedFlag(true);
     return true;
 }

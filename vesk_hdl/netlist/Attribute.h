@@ -195,6 +195,8 @@ public:
 
     /// Deletes the own attributes and copies those of `other`.
     AttributeHolder &operator=(AttributeHolder const &other);
+    /// A walk also sees attributes that are added after it was asked for, so that asking makes an
+    /// empty list: ask HasAttrs first where many holders are empty.
     Iterator<Attribute *> GetAttrIterator() const;
     bool HasAttrs() const;
 

@@ -43,7 +43,8 @@ public:
         for (int i = 0; i < items.GetSize(); ++i)
             if (items.GetAt(i) == former)
                 items.SetAt(i, now);
-        index.reset();
+        if (index && index->erase(former) > 0)
+            index->insert(now);
     }
 
     void Empty() {

@@ -58,7 +58,8 @@ bool IsOneBitBus(std::string_view name);
 /// "BASE(INDEX)".
 Basis::StringBase<char> BitName(std::string_view base, int index);
 
-/// Whether rewriting changes the text: it holds a square, curly or angle bracket or a hyphen.
+/// Whether rewriting leaves the text as it is: it holds no square, curly or angle bracket and no
+/// hyphen.
 bool IsNormal(std::string_view name);
 /// The rewriting: square, curly and angle brackets become parentheses, every hyphen a colon.
 void Normalize(Basis::StringBase<char> &name);

@@ -23,7 +23,10 @@ template <class T> void File(OwnPtrArray<T *> &array, IStringPtrMap<T *> &map, T
 }
 
 template <class T> void Unfile(OwnPtrArray<T *> &array, IStringPtrMap<T *> &map, T *object) {
-    array.Remove(object);
+    if (array.GetTail() == object)
+        array.RemoveTail();
+    else
+        array.Remove(object);
     map.Remove(object->GetNameRef());
 }
 
@@ -62,6 +65,9 @@ void Netlist::Add(Signal *signal) {
     File(record->signals, record->signalMap, signal);
     if (auto const *const bus = dynamic_cast<Bus const *>(signal))
         record->busMap.Add(bus->GetBaseName(), signal);
+    else if (auto const *const compound = dynamic_cast<CompoundBus const *>(signal))
+        ForEach(compound->GetBusMemberIterator(),
+                [this, signal](Signal *member) { NoteReferrer(member, signal); });
 }
 
 void Netlist::Add(Instance *instance) {
@@ -78,6 +84,7 @@ void Netlist::Remove(Signal *signal) {
     if (!signal)
         return;
     Unfile(record->signals, record->signalMap, signal);
+    record->referrers.Forget(signal);
     signal->DisconnectAll();
     if (auto const *const bus = dynamic_cast<Bus const *>(signal))
         record->busMap.Remove(bus->GetBaseName());
@@ -146,20 +153,14 @@ void Netlist::GetInstances(char const *componentName, PtrArray<Instance *> &foun
 
 Bus *Netlist::Widen(Bus *bus, char const *name, PtrArray<Signal *> &inHand) {
     auto wide = std::make_unique<Bus>(name);
+    wide->TakeCell(*bus);
     auto slice = std::make_unique<BusSlice>(bus->GetNameRef(), wide.get());
     BusSlice *const stand = slice.get();
     record->widenedSlices.Add(stand);
     slice.release();
-    stand->CloneConnection(bus);
-    ForEach(bus->GetBusSliceIterator(), [&wide](Signal *moved) {
-        if (auto *const part = dynamic_cast<BusSlice *>(moved))
-            part->SetParent(wide.get());
-        else if (auto *const index = dynamic_cast<BusIndex *>(moved))
-            index->SetParent(wide.get());
-        wide->AddBusSlice(moved);
-    });
-    if (bus->HasReference())
-        ReplaceReferences(bus, stand);
+    MoveConnections(bus, stand);
+    ForEach(bus->GetBusSliceIterator(), [&wide](Signal *moved) { wide->AddBusSlice(moved); });
+    ReplaceReferences(bus, stand);
     for (int i = 0; i < inHand.GetSize(); ++i)
         if (inHand.GetAt(i) == bus)
             inHand.SetAt(i, stand);
@@ -169,17 +170,44 @@ Bus *Netlist::Widen(Bus *bus, char const *name, PtrArray<Signal *> &inHand) {
     return result;
 }
 
+void Netlist::Link(Signal *left, Signal *right) {
+    left->Connect(right);
+    NoteReferrer(right, left);
+}
+
+void Netlist::MoveConnections(Signal *from, Signal *to) {
+    record->referrers.Move(from, to);
+    to->CloneConnection(from);
+}
+
+void Netlist::NoteReferrer(Signal *target, Signal *referrer) {
+    if (target->GetSignalType() == Signal::SIGNAL_BUS)
+        record->referrers.Note(target, referrer);
+}
+
+void Netlist::ReplaceReferencesIn(Signal *referrer, Signal *former, Signal *now) {
+    referrer->ReplaceAssigned(former, now);
+    if (auto *const compound = dynamic_cast<CompoundBus *>(referrer))
+        for (int i = 0; i < compound->GetSize(); ++i)
+            if (compound->GetAt(i) == former)
+                compound->SetAt(i, now);
+}
+
 /// Whatever may point at a signal one way: links, members of compounds, pins that it does not list.
+/// Where the netlist knows of fewer links and members than were ever made, somebody made one behind
+/// its back, and it looks at all there are.
 void Netlist::ReplaceReferences(Signal *former, Signal *now) {
-    auto const replaceIn = [former, now](Signal *signal) {
-        signal->ReplaceAssigned(former, now);
-        if (auto *const compound = dynamic_cast<CompoundBus *>(signal))
-            for (int i = 0; i < compound->GetSize(); ++i)
-                if (compound->GetAt(i) == former)
-                    compound->SetAt(i, now);
-    };
-    ForEach(record->signals, replaceIn);
-    ForEach(record->widenedSlices, replaceIn);
+    Referrers::Set const known = record->referrers.TakeReferrers(former);
+    auto const replaceIn = [&](Signal *referrer) { ReplaceReferencesIn(referrer, former, now); };
+    if (known.size() == former->GetReferences()) {
+        for (Signal *const referrer : known)
+            replaceIn(referrer);
+    } else {
+        ForEach(record->signals, replaceIn);
+        ForEach(record->widenedSlices, replaceIn);
+    }
+    if (!former->IsTied())
+        return;
     auto const reconnect = [former, now](Pin *pin) {
         if (pin->GetSignal() == former)
             pin->Connect(now);

@@ -59,13 +59,6 @@ public:
     /// instances.
     void GetInstances(Component const *component, PtrArray<Instance *> &found) const;
     void GetInstances(char const *componentName, PtrArray<Instance *> &found) const;
-    /// Replaces a bus by a wider one that is called `name`. What was on the old bus, and every
-    /// pointer to it in this netlist and in `inHand`, goes to a slice of the new bus that bears the
-    /// old one's name; the old slices become slices of the new bus. That slice is the netlist's,
-    /// but nobody finds it by name or by a walk. Polarity, comment, attributes and constant of the
-    /// old bus are lost. Returns the new bus.
-    Bus *Widen(Bus *bus, char const *name, PtrArray<Signal *> &inHand);
-
     /// Sorts signals by port polarity (none, in, out, inout) and name, components and instances by
     /// name, the pins of each instance by polarity and name. Names are in natural order: case is
     /// ignored, runs of digits compare as numbers.
@@ -100,7 +93,19 @@ public:
     void SetBoxTypeAttribute();
 
 private:
+    friend class Model;
     struct Record;
+
+    /// Replaces a bus by a wider one that is called `name`. What was on the old bus, and every
+    /// pointer to it in this netlist and in `inHand`, goes to a slice of the new bus that bears the
+    /// old one's name; the old slices become slices of the new bus. That slice is the netlist's,
+    /// but nobody finds it by name or by a walk. Polarity, comment, attributes and constant of the
+    /// old bus are lost. Returns the new bus.
+    Bus *Widen(Bus *bus, char const *name, PtrArray<Signal *> &inHand);
+    /// Signal::Connect and Signal::CloneConnection, and the netlist knows who lists a bus.
+    void Link(Signal *left, Signal *right);
+    void MoveConnections(Signal *from, Signal *to);
+    void NoteReferrer(Signal *target, Signal *referrer);
 
     void GetWiredOrOutputSignals(StringSet &names);
     void GetFeedBackSignals(bool outPortToInPin, StringSet &names);
@@ -108,6 +113,7 @@ private:
     Signal *FindSignal(std::string_view name) const;
     Bus *FindBus(std::string_view baseName) const;
     void ReplaceReferences(Signal *former, Signal *now);
+    void ReplaceReferencesIn(Signal *referrer, Signal *former, Signal *now);
 
     std::unique_ptr<Record> record;
 };

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "vesk_hdl/netlist/Netlist.h"
+#include "vesk_hdl/netlist/Referrers.h"
 
 namespace Vesk_Hdl {
 
@@ -16,6 +17,7 @@ struct Netlist::Record {
     IStringPtrMap<Signal *> signalMap; ///< by full name
     IStringPtrMap<Signal *> busMap;    ///< each Bus by its base name
     Basis::StringBase<char> sourceFileName;
+    Referrers referrers; ///< links and compounds that list a bus
 };
 
 } // namespace Vesk_Hdl

@@ -122,13 +122,13 @@ void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
         return;
     auto const addDummy = [this](Signal *dummy, Signal *old) {
         Add(dummy);
-        dummy->CloneConnection(old);
+        MoveConnections(old, dummy);
     };
-    auto const link = [portTakesDummy](Signal *port, Signal *dummy) {
+    auto const link = [this, portTakesDummy](Signal *port, Signal *dummy) {
         if (portTakesDummy)
-            port->Connect(dummy);
+            Link(port, dummy);
         else
-            dummy->Connect(port);
+            Link(dummy, port);
     };
 
     ScalarMembers scalarMembers(record->signals);
@@ -191,7 +191,7 @@ void Netlist::ConnectOpenPinToDummy() {
                 name += ')';
                 signal = new Bus(name);
             } else {
-                return; // one bit of a bus pin: a port may not be open in part, so it stays whole
+                return; // a pin that is one bit of a range stays open
             }
             Add(signal);
             pin->Connect(signal);

@@ -1,8 +1,12 @@
 #include "vesk_hdl/netlist/Pin.h"
 
+#include <atomic>
+#include <cstdint>
+
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/NaturalOrder.h"
 #include "vesk_hdl/netlist/Signal.h"
+#include "vesk_hdl/text/StringTable.h"
 #include "vesk_hdl/text/basis/Ascii.h"
 
 namespace Vesk_Hdl {
@@ -11,15 +15,44 @@ using Basis::StringBase;
 
 namespace {
 
-Pin *FindPin(PtrArray<Pin *> const &pins, char const *name) {
-    Names::Key const key(name);
-    for (int i = 0; i < pins.GetSize(); ++i) {
-        Pin *const pin = pins.GetAt(i);
-        if (pin && Basis::Ascii::EqualIgnoringCase(pin->GetNameRef().View(), key.View()))
-            return pin;
-    }
+bool IsCalled(Pin const *pin, std::string_view name) {
+    return pin && Basis::Ascii::EqualIgnoringCase(pin->GetNameRef().View(), name);
+}
+
+/// The first pin of that name.
+Pin *FindPin(PtrArray<Pin *> const &pins, std::string_view name) {
+    for (int i = 0; i < pins.GetSize(); ++i)
+        if (IsCalled(pins.GetAt(i), name))
+            return pins.GetAt(i);
     return nullptr;
 }
+
+/// Set once any pin was renamed, which only a client does: from then on nobody trusts an index.
+std::atomic<bool> somePinWasRenamed{false};
+
+/// Where the pins of a large component stand, by name, in place of FindPin's walk. It answers as
+/// long as no two pins share a name and none was renamed.
+class PinPositions {
+public:
+    static constexpr int FEWEST_PINS = 16;
+
+    void Add(StringBase<char> const &name, int position) {
+        isUnique = isUnique && !table.Find(name.View());
+        table.GrowForOneMore();
+        if (isUnique)
+            table.Insert(name, reinterpret_cast<void *>(static_cast<std::uintptr_t>(position)));
+    }
+    bool IsUsable() const { return isUnique && !somePinWasRenamed; }
+    /// -1 when absent.
+    int Find(std::string_view name) const {
+        StringTable::Node const *const node = table.Find(name);
+        return node ? static_cast<int>(reinterpret_cast<std::uintptr_t>(node->value)) : -1;
+    }
+
+private:
+    StringTable table{StringTable::CASE_IGNORED, FEWEST_PINS};
+    bool isUnique = true;
+};
 
 std::unique_ptr<Pin> MakePin(char const *name, Polarity const &polarity) {
     std::string_view const text(name ? name : "");
@@ -61,18 +94,22 @@ Pin::Pin(char const *name, Polarity const &polarity)
 Pin::Pin(Pin const &other)
     : Object(other), AttributeHolder(other), record(new Record(*other.record)) {
     if (record->signal)
-        record->signal->NoteReference();
+        record->signal->NoteTie();
 }
 
 Pin::~Pin() = default;
 
 Object::ObjectType Pin::GetObjectType() const { return OBJECT_PIN; }
 void Pin::AcceptObject(ObjectVisitor &visitor) { visitor.VisitPin(this); }
-void Pin::SetName(char const *name) { Object::SetName(name); }
+void Pin::SetName(char const *name) {
+    somePinWasRenamed = true;
+    Object::SetName(name);
+}
 
 Pin &Pin::operator=(Pin const &other) {
     if (this == &other)
         return *this;
+    somePinWasRenamed = somePinWasRenamed || !IsCalled(this, other.GetNameRef().View());
     AttributeHolder::operator=(other);
     Object::operator=(other);
     record->polarity = other.record->polarity;
@@ -84,7 +121,7 @@ Pin &Pin::operator=(Pin const &other) {
 void Pin::Connect(Signal *signal) {
     record->signal = signal;
     if (signal)
-        signal->NoteReference();
+        signal->NoteTie();
 }
 
 void Pin::SetListedSignal(Signal *signal) { record->signal = signal; }
@@ -144,6 +181,25 @@ PinVisitor::~PinVisitor() = default;
 
 struct Component::Record {
     OwnPtrArray<Pin *> pins;
+    std::unique_ptr<PinPositions> positions; ///< null while there are few pins
+
+    void AddPosition() {
+        int const size = pins.GetSize();
+        if (size < PinPositions::FEWEST_PINS)
+            return;
+        int position = size - 1;
+        if (!positions) {
+            positions = std::make_unique<PinPositions>();
+            position = 0;
+        }
+        for (; position < size; ++position)
+            positions->Add(pins.GetAt(position)->GetNameRef(), position);
+    }
+
+    /// The place of a pin if the index knows it, else -1.
+    int GetPosition(std::string_view name) const {
+        return positions && positions->IsUsable() ? positions->Find(name) : -1;
+    }
 };
 
 Component::Component(char const *name) : record(std::make_unique<Record>()) {
@@ -164,6 +220,7 @@ void Component::AddPin(char const *name, Polarity const &polarity,
         pin->SetDefaultValue(defaultValue);
     record->pins.Add(pin.get());
     pin.release();
+    record->AddPosition();
 }
 
 void Component::AddPin(char const *name, Polarity const &polarity, char const *defaultValue) {
@@ -174,7 +231,12 @@ void Component::AddPin(Pin const &pin) {
     AddPin(pin.GetName(), pin.GetPolarity(), pin.GetDefaultValue());
 }
 
-Pin *Component::GetPin(char const *name) const { return FindPin(record->pins, name); }
+Pin *Component::GetPin(char const *name) const {
+    Names::Key const key(name);
+    bool const isIndexed = record->positions && record->positions->IsUsable();
+    return isIndexed ? record->pins.GetAt(record->GetPosition(key.View()))
+                     : FindPin(record->pins, key.View());
+}
 
 Iterator<Pin *> Component::GetPinIterator() const { return Iterator<Pin *>(&record->pins); }
 
@@ -212,7 +274,14 @@ Attribute *Instance::GetComponentAttr(char const *name) const {
     return record->component ? record->component->GetAttr(name) : nullptr;
 }
 
-Pin *Instance::GetPin(char const *name) const { return FindPin(record->pins, name); }
+/// A pin stands where the component's does until somebody sorts.
+Pin *Instance::GetPin(char const *name) const {
+    Names::Key const key(name);
+    Component const *const component = record->component;
+    Pin *const guess =
+        component ? record->pins.GetAt(component->record->GetPosition(key.View())) : nullptr;
+    return IsCalled(guess, key.View()) ? guess : FindPin(record->pins, key.View());
+}
 
 Iterator<Pin *> Instance::GetPinIterator() const { return Iterator<Pin *>(&record->pins); }
 

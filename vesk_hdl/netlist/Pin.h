@@ -150,7 +150,8 @@ private:
 /// and pin attributes that the component gets later do not reach it.
 class VESK_HDL_API Instance : public Object, public AttributeHolder {
 public:
-    /// Null makes an instance without pins. The component is not owned.
+    /// Null makes an instance without pins. The component is not owned and must outlive the
+    /// instance.
     Instance(char const *name, Component *component);
     ~Instance() override;
     ObjectType GetObjectType() const override;

@@ -58,7 +58,8 @@ struct Signal::Record {
     BitVectorValue constantValue;
     ListedOnce<Pin *> pins;
     ListedOnce<Signal *> signals;
-    bool referenced = false;
+    unsigned int references = 0;
+    bool tied = false;
 };
 
 Signal::Signal() : record(std::make_unique<Record>()) { SetObjectType(OBJECT_SIGNAL); }
@@ -68,8 +69,10 @@ Object::ObjectType Signal::GetObjectType() const { return GetStoredObjectType();
 void Signal::AcceptObject(ObjectVisitor &visitor) { visitor.VisitSignal(this); }
 void Signal::SetName(char const *name) { Object::SetName(name); }
 
-void Signal::NoteReference() { record->referenced = true; }
-bool Signal::HasReference() const { return record->referenced; }
+void Signal::NoteReference() { ++record->references; }
+void Signal::NoteTie() { record->tied = true; }
+unsigned int Signal::GetReferences() const { return record->references; }
+bool Signal::IsTied() const { return record->tied; }
 
 void Signal::Connect(Pin *pin) {
     if (!pin || record->pins.Contains(pin))
@@ -184,10 +187,14 @@ ScalarSignal *ScalarSignal::CreateDummySignal() const {
 struct Bus::Record {
     PtrArray<Signal *> busSlices;
     Polarity portPolarity;
+    std::shared_ptr<Bus *> cell; ///< null while the bus has no slices
 };
 
 Bus::Bus(char const *name) : record(std::make_unique<Record>()) { SetNormalizedName(name); }
-Bus::~Bus() = default;
+Bus::~Bus() {
+    if (record->cell)
+        *record->cell = nullptr;
+}
 
 Signal::SignalType Bus::GetSignalType() const { return SIGNAL_BUS; }
 void Bus::SetPortPolarity(Polarity const &polarity) { record->portPolarity = polarity; }
@@ -205,6 +212,19 @@ bool Bus::IsNeededToDeclared() const { return true; }
 StringBase<char> Bus::GetDummySignalName() const {
     StringBase<char> base = GetBaseName();
     return Names::EndsInDummyTag(base.View()) ? base : DummyBusName(*this);
+}
+
+std::shared_ptr<Bus *> const &Bus::GetCell() {
+    if (!record->cell)
+        record->cell = std::make_shared<Bus *>(this);
+    return record->cell;
+}
+
+/// Becomes the parent of all slices of another bus at one stroke, before it has any of its own.
+void Bus::TakeCell(Bus &narrow) {
+    record->cell = narrow.GetCell();
+    *record->cell = this;
+    narrow.record->cell.reset();
 }
 
 void Bus::AddBusSlice(Signal *slice) { record->busSlices.Add(slice); }
@@ -280,23 +300,24 @@ StringBase<char> Bus::GetBusSliceName(StringBase<char> const &name, int start, i
 }
 
 struct BusSlice::Record {
-    Bus *parent;
+    std::shared_ptr<Bus *> parent;
 };
 
-BusSlice::BusSlice(char const *name, Bus *parent) : record(new Record{parent}) {
+BusSlice::BusSlice(char const *name, Bus *parent)
+    : record(new Record{parent ? parent->GetCell() : nullptr}) {
     SetNormalizedName(name);
     if (parent)
         parent->AddBusSlice(this);
 }
 BusSlice::~BusSlice() = default;
 
-void BusSlice::SetParent(Bus *parent) { record->parent = parent; }
+Bus *BusSlice::GetParent() const { return record->parent ? *record->parent : nullptr; }
 
 Signal::SignalType BusSlice::GetSignalType() const { return SIGNAL_BUS_SLICE; }
 
 void BusSlice::SetPortPolarity(Polarity const &polarity) {
-    if (record->parent)
-        record->parent->SetPortPolarity(polarity);
+    if (Bus *const parent = GetParent())
+        parent->SetPortPolarity(polarity);
 }
 
 void BusSlice::AcceptSignal(SignalVisitor &visitor) {
@@ -305,7 +326,8 @@ void BusSlice::AcceptSignal(SignalVisitor &visitor) {
 }
 
 Polarity BusSlice::GetPortPolarity() const {
-    return record->parent ? record->parent->GetPortPolarity() : Polarity();
+    Bus const *const parent = GetParent();
+    return parent ? parent->GetPortPolarity() : Polarity();
 }
 
 int BusSlice::GetWidth() const { return Names::BusWidth(GetNameRef().View()); }
@@ -320,7 +342,8 @@ bool BusSlice::IsDownTo() const { return RunsDown(*this); }
 StringBase<char> BusSlice::GetBaseName() const { return BaseNameOf(*this); }
 
 bool BusSlice::IsSameDirectionAsParent() const {
-    return (record->parent && RunsDown(*record->parent)) == RunsDown(*this);
+    Bus const *const parent = GetParent();
+    return (parent && RunsDown(*parent)) == RunsDown(*this);
 }
 
 BusSlice *BusSlice::CreateDummySignal(Bus *parent) const {
@@ -328,25 +351,26 @@ BusSlice *BusSlice::CreateDummySignal(Bus *parent) const {
 }
 
 struct BusIndex::Record {
-    Bus *parent;
+    std::shared_ptr<Bus *> parent;
     Polarity portPolarity;
 };
 
-BusIndex::BusIndex(char const *name, Bus *parent) : record(new Record{parent, Polarity()}) {
+BusIndex::BusIndex(char const *name, Bus *parent)
+    : record(new Record{parent ? parent->GetCell() : nullptr, Polarity()}) {
     SetNormalizedName(name);
     if (parent)
         parent->AddBusSlice(this);
 }
 BusIndex::~BusIndex() = default;
 
-void BusIndex::SetParent(Bus *parent) { record->parent = parent; }
+Bus *BusIndex::GetParent() const { return record->parent ? *record->parent : nullptr; }
 
 Signal::SignalType BusIndex::GetSignalType() const { return SIGNAL_BUS_INDEX; }
 
 void BusIndex::SetPortPolarity(Polarity const &polarity) {
     record->portPolarity = polarity;
-    if (record->parent)
-        record->parent->SetPortPolarity(polarity);
+    if (Bus *const parent = GetParent())
+        parent->SetPortPolarity(polarity);
 }
 
 void BusIndex::AcceptSignal(SignalVisitor &visitor) {
@@ -355,7 +379,8 @@ void BusIndex::AcceptSignal(SignalVisitor &visitor) {
 }
 
 Polarity BusIndex::GetPortPolarity() const {
-    return record->parent ? record->parent->GetPortPolarity() : record->portPolarity;
+    Bus const *const parent = GetParent();
+    return parent ? parent->GetPortPolarity() : record->portPolarity;
 }
 
 int BusIndex::GetWidth() const { return 1; }

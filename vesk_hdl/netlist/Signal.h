@@ -80,9 +80,12 @@ private:
     friend class CompoundBus;
     struct Record;
 
-    /// Notes that something may point at this signal without being listed here.
+    // Who points at this signal without being listed here: links and memberships in compounds are
+    // counted, that some pin is tied one way is noted. Nothing is ever counted back.
     void NoteReference();
-    bool HasReference() const;
+    void NoteTie();
+    unsigned int GetReferences() const;
+    bool IsTied() const;
     void ReplaceAssigned(Signal *former, Signal *now);
 
     std::unique_ptr<Record> record;
@@ -159,7 +162,15 @@ public:
                                                    int count);
 
 private:
+    friend class BusSlice;
+    friend class BusIndex;
+    friend class Netlist;
     struct Record;
+
+    /// Where the slices of this bus look for their parent.
+    std::shared_ptr<Bus *> const &GetCell();
+    void TakeCell(Bus &narrow);
+
     std::unique_ptr<Record> record;
 };
 
@@ -191,9 +202,8 @@ public:
     BusSlice *CreateDummySignal(Bus *parent) const;
 
 private:
-    friend class Netlist;
     struct Record;
-    void SetParent(Bus *parent);
+    Bus *GetParent() const;
     std::unique_ptr<Record> record;
 };
 
@@ -229,9 +239,8 @@ public:
                                   Basis::StringBase<char> &base, int &index);
 
 private:
-    friend class Netlist;
     struct Record;
-    void SetParent(Bus *parent);
+    Bus *GetParent() const;
     std::unique_ptr<Record> record;
 };
 

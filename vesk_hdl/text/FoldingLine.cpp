@@ -33,7 +33,7 @@ void FoldingLine::Append(std::string_view token) {
 
 void FoldingLine::Fold(Basis::Stream &file, std::size_t indentation) {
     WriteBlanks(file, blanks);
-    std::size_t end = start; // the last blank may be the one in front of the text
+    std::size_t end = start; // unless the text holds a blank, the last one stands in front of it
     if (lastBlank != NONE)
         end = lastBlank + 1;
     else if (blanks == 0)
@@ -41,9 +41,7 @@ void FoldingLine::Fold(Basis::Stream &file, std::size_t indentation) {
     file.Write(std::string_view(text).substr(start, end - start)).Write("\n");
     start = end;
     blanks = indentation + FOLD_INDENT;
-    lastBlank = NONE;
-    if (lastComma != NONE && lastComma < start)
-        lastComma = NONE;
+    lastBlank = lastComma = NONE; // blanks stand in front now, so that no comma will be asked for
     if (start == text.size()) {
         text.clear();
         start = 0;

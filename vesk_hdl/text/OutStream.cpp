@@ -36,7 +36,6 @@ public:
         file->flush();
     }
 
-    using StreamDst::Write;
     void Write(char const *text) override { WriteText(text); }
     void Write(int value) override {
         if (file)

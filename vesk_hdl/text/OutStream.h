@@ -32,7 +32,7 @@ namespace Vesk_Hdl {
 /// what that looks like. For one thread.
 class VESK_HDL_API OutStream {
 public:
-    enum Operand { NEW_LINE = 0, FLUSH = 1 };
+    enum Operand : int { NEW_LINE = 0, FLUSH = 1 };
 
     /// Takes over the destination, which must not be null.
     explicit OutStream(StreamDst *destination);
@@ -67,7 +67,8 @@ public:
 
     /// Closes an open file as Close does, then opens the named one, at its end with `append`,
     /// otherwise replacing it. False if that fails; what is then written is dropped in silence.
-    /// GetFileName goes on telling the name given to the constructor.
+    /// GetFileName goes on telling the name given to the constructor. Close first to learn about
+    /// the former file from GetError.
     bool Open(char const *fileName, bool append);
     /// Writes what is left, with an end of line, and closes the file.
     void Close();

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <type_traits>
+
 #include "vesk_hdl/Api.h"
 
 namespace Vesk_Hdl {
@@ -77,6 +79,7 @@ public:
 template <class T> class OwnPtrArray : public PtrArray<T> {
 public:
     ~OwnPtrArray() override {
+        static_assert(std::has_virtual_destructor_v<std::remove_pointer_t<T>>);
         for (int i = this->GetSize() - 1; i >= 0; --i)
             delete this->GetAt(i);
         this->Empty();

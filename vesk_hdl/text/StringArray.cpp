@@ -1,6 +1,7 @@
 #include "vesk_hdl/text/StringArray.h"
 
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "vesk_hdl/text/IntroSort.h"
@@ -208,7 +209,7 @@ StringBase<char> StringArray::Concatenate(StringBase<char> const &separator) con
 
 bool StringArray::GetIntAt(int index, int &value, int seed) const {
     long number = seed;
-    if (!Basis::strtol(At(index), number))
+    if (!Basis::strtol(At(index), number) || !std::in_range<int>(number))
         return false;
     value = static_cast<int>(number);
     return true;

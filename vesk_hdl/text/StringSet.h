@@ -9,7 +9,7 @@ namespace Vesk_Hdl {
 class VESK_HDL_API StringSetIterator {
 public:
     StringSetIterator();
-    /// Takes over a position that a StringSet made; null stands nowhere.
+    /// For StringSet: takes over a position. Null, all that a client can pass, stands nowhere.
     explicit StringSetIterator(void *cell);
     StringSetIterator(StringSetIterator const &other);
     ~StringSetIterator();

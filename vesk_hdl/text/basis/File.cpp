@@ -1,10 +1,14 @@
 #include "vesk_hdl/text/basis/File.h"
 
+#include <algorithm>
 #include <cerrno>
+#include <exception>
 #include <fcntl.h>
 #include <memory>
 #include <string>
 #include <unistd.h>
+
+#include "vesk_hdl/text/basis/OrEmpty.h"
 
 namespace Basis {
 
@@ -14,19 +18,14 @@ constexpr std::size_t BLOCK = 64 * 1024;
 
 /// Reads all there is behind a descriptor; false with errno set if reading breaks off.
 bool ReadAll(int descriptor, std::string &text) {
-    for (std::size_t room = BLOCK;; room = text.size()) {
+    for (;;) {
         std::size_t const old = text.size();
+        std::size_t const room = std::max(BLOCK, old);
         text.resize(old + room);
         ssize_t const got = ::read(descriptor, text.data() + old, room);
-        if (got < 0 && errno == EINTR) {
-            text.resize(old);
-            continue;
-        }
         text.resize(old + static_cast<std::size_t>(got > 0 ? got : 0));
-        if (got <= 0)
+        if (got == 0 || (got < 0 && errno != EINTR))
             return got == 0;
-        if (text.empty())
-            return true;
     }
 }
 
@@ -49,6 +48,11 @@ struct Stream::Record {
     std::string text; ///< written: what is not yet in the file; read: the whole file
     std::size_t position = 0;
 
+    Record() = default;
+    Record(Record const &) = delete;
+    Record &operator=(Record const &) = delete;
+    ~Record() { Close(); }
+
     void Flush() {
         if (descriptor >= 0 && error == 0)
             error = WriteAll(descriptor, text);
@@ -67,10 +71,7 @@ struct Stream::Record {
 
 Stream::Stream(Record *opened) : record(opened) {}
 
-Stream::~Stream() {
-    record->Close();
-    delete record;
-}
+Stream::~Stream() { delete record; }
 
 Stream &Stream::operator<<(char const *text) { return Write(text ? text : ""); }
 
@@ -108,28 +109,27 @@ Stream *File::open(char const *name, Stream::Access access, bool) {
                       : access == Stream::ACCESS_APPEND ? O_WRONLY | O_CREAT | O_APPEND
                                                         : O_WRONLY | O_CREAT | O_TRUNC;
     auto record = std::make_unique<Stream::Record>();
-    int const descriptor = ::open(name ? name : "", flags | O_CLOEXEC, 0666);
-    if (descriptor < 0)
+    do
+        record->descriptor = ::open(OrEmpty(name), flags | O_CLOEXEC, 0666);
+    while (record->descriptor < 0 && errno == EINTR);
+    if (record->descriptor < 0)
         return nullptr;
     if (access == Stream::ACCESS_READ) {
-        bool whole = false;
         int error = ENOMEM;
         try {
-            whole = ReadAll(descriptor, record->text);
-            error = errno;
-        } catch (...) {
-            ::close(descriptor);
-            throw;
+            error = ReadAll(record->descriptor, record->text) ? 0 : errno;
+        } catch (std::exception const &) { // more than the memory holds, as from an endless device
         }
-        ::close(descriptor);
-        if (!whole) {
+        ::close(record->descriptor);
+        record->descriptor = -1;
+        if (error != 0) {
             errno = error;
             return nullptr;
         }
-    } else {
-        record->descriptor = descriptor;
     }
-    return new Stream(record.release());
+    auto *const stream = new Stream(record.get());
+    record.release();
+    return stream;
 }
 
 bool File::close(Stream *stream) {

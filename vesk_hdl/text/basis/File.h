@@ -8,7 +8,7 @@ namespace Basis {
 /// that a stream somebody forgets holds no descriptor. Made by File::open alone.
 class VESK_HDL_API Stream {
 public:
-    enum Access { ACCESS_READ = 1, ACCESS_REPLACE = 2, ACCESS_APPEND = 6 };
+    enum Access : int { ACCESS_READ = 1, ACCESS_REPLACE = 2, ACCESS_APPEND = 6 };
 
     /// Releases what the stream holds. Text not yet flushed is still written, but a failure goes
     /// unseen: File::close tells it.

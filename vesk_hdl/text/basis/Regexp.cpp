@@ -1,5 +1,6 @@
 #include "vesk_hdl/text/basis/Regexp.h"
 
+#include <algorithm>
 #include <bitset>
 #include <vector>
 

@@ -1,10 +1,12 @@
 #include "vesk_hdl/text/basis/StringBase.h"
 
+#include <algorithm>
 #include <cstdarg>
 #include <cstdlib>
 #include <cstring>
 #include <new>
 #include <stdexcept>
+#include <utility>
 
 #include "vesk_hdl/text/basis/Ascii.h"
 #include "vesk_hdl/text/basis/File.h"
@@ -46,7 +48,7 @@ void StringBase<char>::Release(Rep *rep) noexcept {
 char *StringBase<char>::Writable(std::size_t length) {
     bool const own = rep != &empty.rep && rep->owners.load(std::memory_order_acquire) == 1;
     if (!own || length > rep->capacity) {
-        std::size_t const grown = own ? rep->capacity + rep->capacity / 2 : 0;
+        std::size_t const grown = own ? std::size_t{rep->capacity} * 3 / 2 : 0;
         Rep *const wider = NewRep(length > grown ? length : std::min(grown, LONGEST));
         std::memcpy(wider->Text(), rep->Text(), std::min<std::size_t>(length, rep->length));
         Release(rep);
@@ -223,7 +225,7 @@ void StringBase<char>::Remove(Basis_Range const &range) {
 StringBase<char> &StringBase<char>::Format(char const *format, ...) {
     va_list arguments;
     va_start(arguments, format);
-    *this = StringBase(std::string_view(Printf(format, arguments)));
+    *this = Printf(OrEmpty(format), arguments).c_str();
     va_end(arguments);
     return *this;
 }
@@ -231,7 +233,7 @@ StringBase<char> &StringBase<char>::Format(char const *format, ...) {
 StringBase<char> StringBase<char>::doFormat(char const *format, ...) {
     va_list arguments;
     va_start(arguments, format);
-    StringBase text((std::string_view(Printf(format, arguments))));
+    StringBase text(Printf(OrEmpty(format), arguments).c_str());
     va_end(arguments);
     return text;
 }

@@ -31,9 +31,9 @@ template <class Char> class StringBase;
 /// A string holds at most 0xFFFFFFEF characters; more raises std::length_error.
 template <> class VESK_HDL_API StringBase<char> {
 public:
-    enum CompareType { COMPARE_EXACT = 0, COMPARE_IGNORING_CASE = 1 };
-    enum ParseType { PARSE_KEEPING_EMPTY = 0, PARSE_SKIPPING_EMPTY = 1 };
-    enum TrimType { TRIM_BOTH_ENDS = 2 };
+    enum CompareType : int { COMPARE_EXACT = 0, COMPARE_IGNORING_CASE = 1 };
+    enum ParseType : int { PARSE_KEEPING_EMPTY = 0, PARSE_SKIPPING_EMPTY = 1 };
+    enum TrimType : int { TRIM_BOTH_ENDS = 2 };
 
     StringBase() noexcept;
     StringBase(char const *text);
@@ -41,6 +41,7 @@ public:
     StringBase(StringBase &&other) noexcept;
     /// The characters of `range`; what lies behind the end of `whole` is left out.
     StringBase(StringBase const &whole, Basis_Range const &range);
+    /// The text holds no NUL character.
     explicit StringBase(std::string_view text);
     ~StringBase();
 

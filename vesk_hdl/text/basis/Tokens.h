@@ -1,5 +1,7 @@
 #pragma once
 
+#include <algorithm>
+
 #include "vesk_hdl/text/basis/StringBase.h"
 
 namespace Basis {

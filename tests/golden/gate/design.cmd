@@ -1,0 +1,1 @@
+../../../examples/gate/gate.cmd

@@ -1,0 +1,174 @@
+// What the designs under golden/ do not reach.
+
+#include <array>
+#include <string>
+#include <tuple>
+
+#include <gtest/gtest.h>
+
+#include "tests/support/Lines.h"
+
+using namespace Vesk_Hdl;
+
+namespace {
+
+/// A design written without header and without default libraries, its lists on one line.
+struct Written {
+    explicit Written(Design &design, bool onePerLine = false) {
+        HdlOptions &options = *design.model.GetOptions();
+        options.writeHeader = options.vhdlOption.useDefaultLibrary = false;
+        options.portOnePerLine = onePerLine;
+        TextMemOutStream stream;
+        VhdlNetlister(stream).WriteNetlist(&design.netlist, &options);
+        vhdl = stream.GetValue();
+        vhdlMacro = options.macroNetlist;
+        stream.SetValue("");
+        VerilogNetlister(stream).WriteNetlist(&design.netlist, options);
+        verilog = stream.GetValue();
+        verilogMacro = options.macroNetlist;
+    }
+    /// The associations of the first instance.
+    std::string VhdlPins() const { return Between(vhdl, "port map (", ");\n"); }
+    std::string VerilogPins() const { return Between(verilog, " u1 (", ");\n"); }
+
+    static std::string Between(std::string const &text, std::string const &begin, char const *end) {
+        std::size_t const from = text.find(begin) + begin.size();
+        return text.substr(from, text.find(end, from) - from);
+    }
+
+    std::string vhdl, verilog;
+    bool vhdlMacro, verilogMacro;
+};
+
+TEST(Netlisters, PinsOfAllFormsOnSignalsOfAllKinds) {
+    using Row = std::array<char const *, 4>; // pin, signal if any, what VHDL and Verilog get
+    for (auto const &[pin, signal, vhdl, verilog] : std::vector<Row>{
+             {"D(3:0)", "", "D=>open", ".D()"},
+             {"D(3:0)", "s", "D(3:0)=>s", ".D(s)"},
+             {"D(3:0)", "OPEN", "D(3:0)=>OPEN", ".D()"},
+             {"D(3:0)", "B(2)", "D(3:0)=>B(2)", ".D(B[2])"},
+             {"D(3:0)", "O(2:2)", "D(3 downto 0)=>O(2)", ".D(O[2])"},
+             {"D(3:0)", "B(4:5)", "D(3)=>B(4), D(2)=>B(5)", ".D(B[4:5])"},
+             {"D(3:0)", "R(3:3)", "D(3 downto 0)=>R(3 downto 3)", ".D(R[3:3])"},
+             {"D(3:0)", "B(0:1),B(7:6)", "D(3)=>B(0), D(2)=>B(1), D(1 downto 0)=>B(7 downto 6)",
+              ".D({B[0:1], B[7:6]})"},
+             {"D(0:3)", "s,B(6:4)", "D(0)=>s, D(1 to 3)=>B(6 downto 4)", ".D({s, B[6:4]})"},
+             {"D(3:0)", "B(7:0),s", "=>B(7 downto 0), =>s", ".D({B[7:0], s})"},
+             {"D(3)", "", "D(3)=>open", ".D()"},
+             {"D(3)", "B(7:0)", "D(3)=>B(7 downto 0)", ".D(B[7:0])"},
+             {"D(3)", "B(0:1)", "D(3)=>B(0), D(3)=>B(1)", ".D(B[0:1])"},
+             {"G(1:1)", "", "G=>open", ".G()"},
+             {"G(1:1)", "s", "G(1)=>s", ".G(s)"},
+             {"G(1:1)", "O(2:2)", "G(1)=>O(2)", ".G(O[2])"},
+             {"G(1:1)", "B(3:3)", "G(1)=>B(3)", ".G(B[3:3])"},
+             {"S", "", "S=>open", ".S()"},
+             {"S", "B(7:0)", "S=>B(7 downto 0)", ".S(B[7:0])"},
+             {"S", "B(3:3)", "=>B(3)", ".S(B[3:3])"},
+             {"S", "s,t", "=>s, =>t", ".S({s, t})"},
+             {"A[3:0]", "", "A(3:0)=>open", ".A(3:0)()"},
+             {"A[3:0]", "R(0:3)", "A(3 downto 0)=>R(0 to 3)", ".A(3:0)(R[0:3])"},
+         }) {
+        Lines lines = {"ADD SIGNAL B(7:0)",
+                       "ADD SIGNAL R(0:7)",
+                       "ADD SIGNAL O(2:2)",
+                       "ADD COMPONENT C",
+                       std::string("ADD PIN C ") + pin + " bi",
+                       "ADD INSTANCE C u1"};
+        if (*signal)
+            lines.push_back(std::string("CONNECT SIGNAL ") + signal + " u1." + pin);
+        Design design(lines);
+        Written const written(design);
+        EXPECT_EQ(vhdl, written.VhdlPins()) << pin << " on " << signal;
+        EXPECT_EQ(verilog, written.VerilogPins()) << pin << " on " << signal;
+    }
+}
+
+TEST(Netlisters, SignalsThatNoCommandMakes) {
+    Design design({"ADD COMPONENT C", "ADD PIN C D(3:0) bi", "ADD INSTANCE C u1"});
+    Bus up("P(0:3)"), nameless(""), open("Open"), rangeless("X");
+    BusSlice namelessSlice("", &up), openSlice("oPEN", &up);
+    BusIndex namelessIndex("", &up);
+    CompoundBus empty("E");
+    Pin *const pin = design.netlist.GetInstance("u1")->GetPin("D(3:0)");
+    for (auto const &[signal, vhdl, verilog] :
+         std::vector<std::tuple<Signal *, char const *, char const *>>{
+             {&nameless, "D=>open", ".D()"},
+             {&open, "D(3 downto 0)=>Open", ".D()"},
+             {&rangeless, "D(3 downto 0)=>X", ".D(X)"},
+             {&namelessSlice, "D(3 downto 0)=>open", ".D()"},
+             {&openSlice, "D(3 downto 0)=>oPEN", ".D()"},
+             {&namelessIndex, "D(3:0)=>open", ".D()"},
+             {&empty, "", ".D()"}}) {
+        pin->Connect(signal);
+        Written const written(design);
+        EXPECT_EQ(vhdl, written.VhdlPins());
+        EXPECT_EQ(verilog, written.VerilogPins());
+    }
+}
+
+TEST(Netlisters, ListsOnOneLineOrMany) {
+    Design design({"SET NETLIST NAME top", "ADD COMPONENT C", "ADD PIN C I in", "ADD PIN C O out",
+                   "ADD INSTANCE C u1", "ADD PORT A in", "ADD PORT Y out", "CONNECT SIGNAL A u1.I",
+                   "CONNECT SIGNAL Y u1.O"});
+    Written const line(design);
+    Written const lines(design, true);
+    EXPECT_EQ("I=>A, O=>Y", line.VhdlPins());
+    EXPECT_EQ("I=>A,\n          O=>Y", lines.VhdlPins());
+    EXPECT_EQ(".I(A), .O(Y)", line.VerilogPins());
+    EXPECT_EQ(".I(A), \n      .O(Y)", lines.VerilogPins());
+    EXPECT_EQ("A, Y", Written::Between(line.verilog, "module top(", ");\n\n input A;\n"));
+    EXPECT_EQ("A, \n           Y", Written::Between(lines.verilog, "module top(", ");\n\n"));
+    for (Written const *const written : {&line, &lines}) // the ports of an entity never share one
+        EXPECT_EQ("A : in    std_logic; \n       Y : out   std_logic",
+                  Written::Between(written->vhdl, "port ( ", ");\n"));
+}
+
+TEST(Netlisters, NoPortsAndNoPins) {
+    Design design({"SET NETLIST NAME m", "ADD COMPONENT C", "ADD COMPONENT UNUSED",
+                   "ADD INSTANCE C u2", "ADD INSTANCE C u1"});
+    Written const written(design);
+    EXPECT_EQ("\nentity m is\nport ( );\nend m;\n\narchitecture BEHAVIORAL of m is\ncomponent C\n"
+              "end component;\n\nbegin\nu1 : C\n;\n\nu2 : C\n;\n\nend BEHAVIORAL;\n\n"
+              "-- synopsys translate_off\nconfiguration CFG_m of  m is\nfor BEHAVIORAL\n"
+              "for u1, u2 : C\nuse configuration WORK.CFG_C;\nend for;\nend for;\nend CFG_m;\n"
+              "-- synopsys translate_on\n\n",
+              written.vhdl);
+    EXPECT_EQ("`timescale 1ns / 1ps\n\nmodule m();\n\n\n\nC u1 ();\nC u2 ();\nendmodule\n",
+              written.verilog);
+}
+
+TEST(Netlisters, MacrosOfBothLanguages) {
+    for (auto const &[name, attribute, generic, vhdl, verilog] :
+         std::vector<std::tuple<std::string, std::string, std::string, bool, bool>>{
+             {"aMORVANEb", "INIT", "NOSYN", true, false},
+             {"MORVANE", "INIT", "NONE", false, false},
+             {"MORVANE", "init", "SYN", false, false},
+             {"Morvane", "INIT", "SYN", false, false},
+             {"HORVANE_x", "INIT", "SYN", false, true}}) {
+        Design design({"SET NETLIST NAME " + name, "ADD MODULE ATTRIBUTE " + attribute + " 1",
+                       "SET MODULE ATTRIBUTE OPTION " + attribute + " -GENERIC=" + generic});
+        Written const written(design);
+        EXPECT_EQ(vhdl, written.vhdlMacro) << name << " " << attribute << " " << generic;
+        EXPECT_EQ(verilog, written.verilogMacro) << name << " " << attribute << " " << generic;
+    }
+}
+
+TEST(VhdlNetlister, DeclaresAttributesOnceInItsLife) {
+    Design design({"ADD SIGNAL N", "ADD SIGNAL ATTRIBUTE N K V",
+                   "SET SIGNAL ATTRIBUTE OPTION N K -SYNATTR=ASSIGN"});
+    TextMemOutStream stream;
+    VhdlNetlister first(stream);
+    first.WriteNetlist(nullptr, design.model.GetOptions());
+    first.WriteNetlist(&design.netlist, nullptr);
+    EXPECT_STREQ("", stream.GetValue());
+    for (bool const declares : {true, false}) {
+        stream.SetValue("");
+        VhdlNetlister copy(first); // the set of what is declared is its own
+        (declares ? first : copy).WriteNetlist(&design.netlist, design.model.GetOptions());
+        std::string const text(stream.GetValue());
+        EXPECT_EQ(declares, text.find("attribute K : string ;\n") != std::string::npos);
+        EXPECT_NE(std::string::npos, text.find("attribute K of N : signal is \"V\";\n"));
+    }
+}
+
+} // namespace

@@ -1,0 +1,56 @@
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "vesk_hdl/Vesk_Hdl.h"
+
+using Lines = std::vector<std::string>;
+
+/// Runs lines on a model up to the first that is refused. Its message, or "" if none was.
+std::string Refusal(Vesk_Hdl::Model &model, Lines const &lines);
+
+/// The message of the exception that a call raises, or "" if it raises none.
+template <class Call> std::string MessageOf(Call call) {
+    try {
+        call();
+    } catch (Vesk_Hdl::Exception const &refusal) {
+        return refusal.getDescription();
+    }
+    return "";
+}
+
+/// A fresh model that knows the library's commands, after lines that it must accept.
+struct Design {
+    explicit Design(Lines const &lines = {});
+
+    Vesk_Hdl::CommandFactory factory;
+    Vesk_Hdl::Model model;
+    Vesk_Hdl::Netlist &netlist;
+};
+
+/// A component CELL with pins of all forms and directions, and its instances u1, u2 and u3.
+Lines const &Cells();
+/// Cells, then more lines.
+Lines CellsAnd(Lines const &lines);
+
+/// Names of objects, with a blank between them.
+template <class T> std::string NamesOf(Vesk_Hdl::Iterator<T> objects) {
+    std::string names;
+    Vesk_Hdl::ForEach(objects, [&names](T object) {
+        names += (names.empty() ? "" : " ") + std::string(object->GetName());
+    });
+    return names;
+}
+template <class T> std::string NamesOf(Vesk_Hdl::PtrArray<T> const &objects) {
+    return NamesOf(Vesk_Hdl::Iterator<T>(&objects));
+}
+
+/// All signals and what hangs together with them, a line for each signal in the netlist's order:
+///
+///     out q {member member}: u1.Y (u2.A) <- assigned assigned
+///
+/// A pin in brackets points at a signal that does not list it; one with "!" is listed by a signal
+/// that it does not point at. A name in square brackets is that of a signal outside the netlist's
+/// array that something leads to; such signals come last.
+std::string Wiring(Vesk_Hdl::Netlist const &netlist);

@@ -1,0 +1,205 @@
+#include "vesk_hdl/text/PtrArray.h"
+
+#include <algorithm>
+#include <bit>
+#include <random>
+#include <string>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+using namespace Vesk_Hdl;
+
+namespace {
+
+struct Item {
+    int key;
+};
+using Items = std::vector<Item *>;
+
+Items In(PtrArray<Item *> const &array) {
+    Items items;
+    for (int i = 0; i < array.GetSize(); ++i)
+        items.push_back(array.GetAt(i));
+    return items;
+}
+
+TEST(PtrArray, IndexesOutsideAreHarmless) {
+    Item a{1}, b{2};
+    PtrArray<Item *> array;
+    EXPECT_EQ(array.GetTail(), nullptr);
+    array.SetAt(-1, &a);
+    EXPECT_TRUE(array.IsEmpty());
+    array.SetAt(5, &a);
+    array.SetAt(6, &b); // one past the room there is
+    EXPECT_EQ(array.Add(&a), 7);
+    array.SetAt(9, &b); // inside the room, past the size
+    EXPECT_EQ(In(array),
+              (Items{nullptr, nullptr, nullptr, nullptr, nullptr, &a, &b, &a, nullptr, &b}));
+    EXPECT_TRUE(array.GetAt(-1) == nullptr && array.GetAt(10) == nullptr);
+    array.RemoveTail();
+    EXPECT_EQ(array.GetSize(), 9);
+    array.Empty();
+    EXPECT_EQ(array.GetAt(0), nullptr);
+}
+
+TEST(PtrArray, FindsRemovesAndSwaps) {
+    Item a{1}, b{1}, absent{1};
+    PtrArray<Item *> array;
+    for (Item *const item : {&b, &a, static_cast<Item *>(nullptr), &a})
+        array.Add(item);
+    EXPECT_EQ(array.GetIndex(&a), 1);
+    EXPECT_EQ(array.GetIndex(&absent), -1);
+    EXPECT_TRUE(array.Contains(nullptr) && !array.Contains(&absent));
+    EXPECT_FALSE(array.Remove(&absent));
+    EXPECT_TRUE(array.Remove(&a));
+    EXPECT_EQ(In(array), (Items{&b, nullptr, &a}));
+    for (auto const &[first, second] : {std::pair{1, 1}, {0, 3}, {3, 0}, {-1, 0}, {0, -1}})
+        array.Swap(first, second);
+    EXPECT_EQ(In(array), (Items{&b, nullptr, &a}));
+    array.Swap(2, 0);
+    EXPECT_EQ(In(array), (Items{&a, nullptr, &b}));
+}
+
+struct Mortal {
+    Mortal(std::string &d, char n) : deaths(d), name(n) {}
+    virtual ~Mortal() { deaths += name; }
+    std::string &deaths;
+    char name;
+};
+
+TEST(OwnPtrArray, DeletesWhatItHoldsLastFirst) {
+    std::string deaths;
+    {
+        OwnPtrArray<Mortal *> array;
+        array.Add(new Mortal(deaths, 'x'));
+        Mortal *const held = array.GetTail();
+        array.Empty();
+        for (char const name : {'a', 'b', 'c'})
+            array.Add(new Mortal(deaths, name));
+        Mortal *const second = array.GetAt(1);
+        array.SetAt(5, held);
+        array.Remove(second);
+        EXPECT_EQ(deaths, "");
+        delete second;
+    }
+    EXPECT_EQ(deaths, "bxca");
+}
+
+TEST(Iterator, WalksTheArrayAsItIsNowAndCopiesStartAnew) {
+    Item a{1}, b{2};
+    PtrArray<Item *> array;
+    array.Add(&a);
+    Iterator<Item *> walk(&array);
+    walk.Advance();
+    EXPECT_TRUE(!walk.HasMore() && walk.Current() == nullptr);
+    array.Add(&b);
+    EXPECT_TRUE(walk.HasMore() && walk.Current() == &b);
+    Iterator<Item *> assigned(nullptr);
+    EXPECT_TRUE(!assigned.HasMore() && assigned.Current() == nullptr);
+    assigned.Advance();
+    assigned = walk;
+    EXPECT_EQ(assigned.Current(), &a);
+    EXPECT_EQ(Iterator<Item *>(walk).Current(), &a);
+    Iterator<Item *> &same = walk;
+    walk = same;
+    EXPECT_EQ(walk.Current(), &b);
+    walk.Rewind();
+    EXPECT_EQ(walk.Current(), &a);
+}
+
+bool Less(Item const *a, Item const *b) { return a->key < b->key; }
+
+bool CountingLess(void *a, void *b, void *calls) {
+    ++*static_cast<std::size_t *>(calls);
+    return Less(static_cast<Item *>(a), static_cast<Item *>(b));
+}
+
+/// Introspective sort from the book: cut by the median of three down to 16 elements, then a pass of
+/// insertion, which leaves equal elements in the order it finds them in.
+struct NaiveSort {
+    Items items;
+    bool atDepthLimit = false;
+
+    std::size_t Partition(std::size_t left, std::size_t right) {
+        Items three = {items[left], items[left + (right - left) / 2], items[right - 1]};
+        std::sort(three.begin(), three.end(), Less);
+        for (;; std::swap(items[left++], items[right])) {
+            while (Less(items[left], three[1]))
+                ++left;
+            while (Less(three[1], items[--right]))
+                continue;
+            if (left >= right)
+                return left;
+        }
+    }
+    void Cut(std::size_t first, std::size_t last, int depth) {
+        while (last - first > 16 && !(atDepthLimit = atDepthLimit || depth == 0)) {
+            std::size_t const middle = Partition(first, last);
+            Cut(middle, last, --depth);
+            last = middle;
+        }
+    }
+    void Sort() {
+        Cut(0, items.size(), 2 * (static_cast<int>(std::bit_width(items.size())) - 1));
+        std::stable_sort(items.begin(), items.end(), Less);
+    }
+};
+
+/// Sorts both ways and compares. At the depth limit the order of equal elements is nobody's
+/// promise.
+bool SortBothWays(std::vector<int> const &keys, std::size_t &calls) {
+    std::vector<Item> storage(keys.size());
+    NaiveSort naive;
+    PtrArray<Item *> array;
+    for (std::size_t i = 0; i < keys.size(); ++i) {
+        storage[i].key = keys[i];
+        naive.items.push_back(&storage[i]);
+        array.Add(&storage[i]);
+    }
+    naive.Sort();
+    array.Sort(CountingLess, &calls);
+    Items sorted = In(array);
+    EXPECT_TRUE(std::is_sorted(sorted.begin(), sorted.end(), Less));
+    if (naive.atDepthLimit) {
+        std::sort(sorted.begin(), sorted.end());
+        std::sort(naive.items.begin(), naive.items.end());
+    }
+    EXPECT_EQ(sorted, naive.items);
+    return naive.atDepthLimit;
+}
+
+TEST(PtrArraySort, LeavesEqualElementsWhereTheStepsPutThem) {
+    std::mt19937 random(6);
+    for (std::size_t round = 0; round < 1500; ++round) {
+        std::vector<int> keys(round / 5);
+        unsigned int const ranges[] = {1, 2, 5, 40, 100000};
+        for (int &key : keys)
+            key = static_cast<int>(random() % ranges[round % 5]);
+        if (random() % 5 == 0)
+            std::sort(keys.begin(), keys.end());
+        if (random() % 5 == 0)
+            std::reverse(keys.begin(), keys.end());
+        SCOPED_TRACE(testing::Message() << "round " << round);
+        std::size_t calls = 0;
+        SortBothWays(keys, calls);
+        EXPECT_TRUE(keys.size() > 1 || calls == 0);
+    }
+}
+
+/// Each cut of this order by the median of three splits off two elements only.
+TEST(PtrArraySort, StaysFastOnTheWorstInput) {
+    int const half = 10000;
+    for (int const sharing : {1, 2, 3}) {
+        std::vector<int> keys;
+        for (int i = 1; i <= half; ++i)
+            keys.push_back((i % 2 ? i : half + i - 1) / sharing);
+        for (int i = 1; i <= half; ++i)
+            keys.push_back(2 * i / sharing);
+        std::size_t calls = 0;
+        EXPECT_TRUE(SortBothWays(keys, calls) || sharing > 1);
+        EXPECT_LT(calls, 100 * keys.size()) << "keys shared by " << sharing;
+    }
+}
+
+} // namespace

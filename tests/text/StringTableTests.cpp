@@ -1,0 +1,207 @@
+#include <algorithm>
+#include <cstdint>
+#include <map>
+#include <utility>
+#include <vector>
+
+#include <gtest/gtest.h>
+
+#include "tests/support/RandomText.h"
+#include "vesk_hdl/text/IStringPtrMap.h"
+#include "vesk_hdl/text/StringSet.h"
+
+using namespace Vesk_Hdl;
+using Strings = std::vector<std::string>;
+
+namespace {
+
+constexpr std::string_view LETTERS = "aAbB_09z\x80\xC4\xE4\xFF";
+
+Strings Walk(StringSet &set) {
+    Strings strings;
+    for (StringSetIterator at = set.GetBeginPos(); at != set.GetEndPos(); ++at)
+        strings.emplace_back(*at);
+    return strings;
+}
+
+/// The exact half of a set: all texts in the order of a walk, with their hashes.
+struct NaiveTable {
+    std::vector<std::pair<std::string, std::uint32_t>> nodes;
+    std::uint32_t buckets = 193;
+
+    /// The first text of the bucket, or of the next one that has any.
+    auto PlaceOf(std::uint32_t hash) {
+        return std::find_if(nodes.begin(), nodes.end(), [&](auto const &node) {
+            return node.second % buckets >= hash % buckets;
+        });
+    }
+    void Add(std::string const &text) {
+        if (nodes.size() + 1 > buckets) {
+            for (std::uint32_t const prime : {12289, 6151, 3079, 1543, 769, 389})
+                buckets = prime > nodes.size() ? prime : buckets;
+            for (auto const &node : std::exchange(nodes, {}))
+                nodes.insert(PlaceOf(node.second), node);
+        }
+        std::uint32_t hash = 5381;
+        for (char const c : text)
+            hash = hash * 33 + static_cast<std::uint32_t>(static_cast<signed char>(c));
+        auto const place = PlaceOf(hash);
+        bool const taken = place != nodes.end() && place->second % buckets == hash % buckets;
+        if (std::find(nodes.begin(), nodes.end(), std::pair(text, hash)) == nodes.end())
+            nodes.insert(place + taken, {text, hash});
+    }
+    void Remove(std::string const &text) {
+        std::erase_if(nodes, [&](auto const &node) { return node.first == text; });
+    }
+    Strings Walk() const {
+        Strings strings;
+        for (auto const &node : nodes)
+            strings.push_back(node.first);
+        return strings;
+    }
+};
+
+TEST(StringSet, WalksByBucketAndAge) {
+    StringSet set;
+    // Buckets 178, as the byte counts as -28, then 110, 78 and, for 5381 itself, 170.
+    for (char const *const text : {"\xE4", "a", "A", ""})
+        set.Add(text);
+    EXPECT_EQ(Walk(set), (Strings{"A", "a", "", "\xE4"}));
+    StringSet chain;
+    for (char const *const text : {"ac", "bB", "c!"}) // the same hash: 33 less for one letter more
+        chain.Add(text);
+    EXPECT_EQ(Walk(chain), (Strings{"ac", "c!", "bB"}));
+    chain.Remove("ac");
+    chain.Add("ac");
+    EXPECT_EQ(Walk(chain), (Strings{"c!", "ac", "bB"}));
+}
+
+TEST(StringSet, WalksLikeTheNaiveTable) {
+    for (unsigned int const seed : {1, 2, 3}) {
+        std::mt19937 random(seed);
+        StringSet set;
+        NaiveTable naive;
+        for (int step = 0; step < 5000; ++step) {
+            std::string const name = RandomText(random, LETTERS, seed == 1 ? 3 : 6);
+            bool const removes = random() % 8 == 0;
+            removes ? set.Remove(name.c_str()) : set.Add(name.c_str());
+            removes ? naive.Remove(name) : naive.Add(name);
+            if (step == 2500 && seed == 3) { // the buckets stay as many as they are
+                set.Empty();
+                naive.nodes.clear();
+            }
+            if (step % 100 == 99) {
+                ASSERT_EQ(Walk(set), naive.Walk()) << "seed " << seed << ", step " << step;
+            }
+        }
+    }
+}
+
+TEST(StringSet, GrowsAlsoForAStringThatItHolds) {
+    StringSet set;
+    NaiveTable naive;
+    for (int i = 0; i <= 193; ++i) {
+        std::string const name = "name" + std::to_string(i % 193);
+        set.Add(name.c_str());
+        naive.Add(name);
+    }
+    EXPECT_EQ(naive.buckets, 389U);
+    EXPECT_EQ(Walk(set), naive.Walk());
+}
+
+TEST(StringSet, KeepsTwoRules) {
+    StringSet set;
+    for (char const *const name : {"Clk", "CLK", "Clk"})
+        set.Add(name);
+    EXPECT_EQ(Walk(set).size(), 2U);
+    EXPECT_TRUE(set.Contains("CLK") && set.IContains("clk"));
+    EXPECT_FALSE(set.Contains("clk") || set.IContains("clk1"));
+    set.Remove("clk"); // no exact entry, yet the one that ignores case
+    EXPECT_TRUE(set.Contains("Clk") && set.Contains("CLK"));
+    EXPECT_FALSE(set.IContains("Clk"));
+    set.Add("x");
+    set.Empty();
+    EXPECT_TRUE(set.IsEmpty() && set.IContains("X"));
+    EXPECT_FALSE(set.Contains("x") || set.GetBeginPos() != set.GetEndPos());
+    set.Add("x");
+    EXPECT_EQ(Walk(set), Strings{"x"});
+    set.Remove("X"); // held once, so one removal takes it
+    EXPECT_FALSE(set.IContains("x"));
+}
+
+TEST(StringSet, AssignmentForgetsOnlyWhatIgnoredCase) {
+    StringSet source;
+    StringSet target;
+    source.Add("gone");
+    source.Empty();
+    for (char const *const text : {"ac", "c!", "bB"})
+        source.Add(text); // a walk gives ac, bB, c!
+    target.Add("Old");
+    target = source;
+    EXPECT_TRUE(target.Contains("Old") && target.IContains("BB"));
+    EXPECT_FALSE(target.IContains("Old") || target.IContains("gone"));
+    StringSet copy(source);
+    EXPECT_EQ(Walk(copy), (Strings{"ac", "c!", "bB"}));
+    StringSet &same = source;
+    source = same;
+    EXPECT_TRUE(source.IContains("GONE"));
+}
+
+TEST(StringSetIterator, ComparesByPosition) {
+    StringSet set;
+    set.Add("A");
+    set.Add("a");
+    StringSetIterator nowhere;
+    StringSetIterator at = set.GetBeginPos();
+    StringSetIterator const copy(at);
+    EXPECT_TRUE(nowhere == StringSetIterator(nullptr) && copy == at);
+    EXPECT_TRUE(nowhere != set.GetEndPos() && set.GetEndPos() != nowhere);
+    ++nowhere;
+    EXPECT_STREQ(*nowhere, "");
+    at++;
+    EXPECT_TRUE(copy != at);
+    EXPECT_STREQ(*copy, "A");
+    nowhere = at;
+    EXPECT_STREQ(*nowhere, "a");
+    EXPECT_TRUE(++at == set.GetEndPos());
+}
+
+TEST(IStringPtrMap, AnswersLikeANaiveMap) {
+    std::mt19937 random(7);
+    std::vector<int> values(20000);
+    IStringPtrMap<int *> map;
+    std::map<std::string, int *> naive;
+    auto upper = [](std::string text) {
+        for (char &c : text)
+            c = c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c;
+        return text;
+    };
+    for (int &value : values) {
+        std::string const name = RandomText(random, LETTERS, 5);
+        int *const pointer = random() % 9 ? &value : nullptr;
+        bool const removes = random() % 4 == 0;
+        removes ? map.Remove(name.c_str()) : map.Add(name.c_str(), pointer);
+        removes ? void(naive.erase(upper(name))) : void(naive[upper(name)] = pointer);
+        std::string const asked = RandomText(random, LETTERS, 4);
+        auto const found = naive.find(upper(asked));
+        ASSERT_EQ(map.Get(asked.c_str()), found == naive.end() ? nullptr : found->second) << asked;
+        ASSERT_EQ(map.Contains(asked.c_str()), found != naive.end()) << asked;
+    }
+}
+
+TEST(IStringPtrMap, CopiesPointers) {
+    int p = 0;
+    IStringPtrMap<int *> map;
+    map.Add("p", &p);
+    IStringPtrMap<int *> copy(map);
+    IStringPtrMap<int *> assigned;
+    assigned.Add("old", &p);
+    assigned = map;
+    map.Empty();
+    EXPECT_TRUE(map.IsEmpty());
+    EXPECT_EQ(copy.Get("P"), &p);
+    EXPECT_EQ(assigned.Get("P"), &p);
+    EXPECT_FALSE(assigned.Contains("old"));
+}
+
+} // namespace

@@ -1,7 +1,9 @@
 #include "vesk_hdl/engine/HdlCmd.h"
 
 #include <algorithm>
+#include <atomic>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "vesk_hdl/engine/Commands.h"
@@ -34,9 +36,10 @@ VESK_HDL_COMMANDS(KEYWORD_OF)
 struct CommandFactory::Record {
     IStringPtrMap<CommandCreator> creators; ///< by the keyword with single blanks
     std::size_t longestKeyword = 0;         ///< in characters
+    std::atomic<unsigned int> owners{1};
 };
 
-CommandFactory::CommandFactory() : record(std::make_shared<Record>()) {
+CommandFactory::CommandFactory() : record(new Record) {
 #define REGISTER(keyword, Class)                                                                   \
     AddCommandCreator(                                                                             \
         keyword, [](Model *model, StringArray const &) -> Command * { return new Class(model); });
@@ -44,9 +47,20 @@ CommandFactory::CommandFactory() : record(std::make_shared<Record>()) {
 #undef REGISTER
 }
 
-CommandFactory::~CommandFactory() = default;
-CommandFactory::CommandFactory(CommandFactory const &other) = default;
-CommandFactory &CommandFactory::operator=(CommandFactory const &other) = default;
+CommandFactory::~CommandFactory() {
+    if (--record->owners == 0)
+        delete record;
+}
+
+CommandFactory::CommandFactory(CommandFactory const &other) : record(other.record) {
+    ++record->owners;
+}
+
+CommandFactory &CommandFactory::operator=(CommandFactory const &other) {
+    CommandFactory shared(other);
+    std::swap(record, shared.record);
+    return *this;
+}
 
 void CommandFactory::AddCommandCreator(char const *keyword, CommandCreator creator) {
     AddCommandCreator(StringArray(keyword, " ", true, nullptr), creator);

@@ -68,7 +68,7 @@ public:
 
 private:
     struct Record;
-    std::shared_ptr<Record> record;
+    Record *record; ///< shared with copies
 };
 
 /// Drives commands through their life and keeps, as their owner, those that ran. There is no undo.

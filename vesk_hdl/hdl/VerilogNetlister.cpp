@@ -3,7 +3,7 @@
 #include <string>
 
 #include "vesk_hdl/hdl/HdlUtilities.h"
-#include "vesk_hdl/hdl/Pieces.h"
+#include "vesk_hdl/hdl/Shared.h"
 #include "vesk_hdl/hdl/Translate.h"
 #include "vesk_hdl/hdl/VerilogStatements.h"
 #include "vesk_hdl/netlist/Netlist.h"
@@ -83,7 +83,6 @@ private:
     VerilogStatements const &statements;
 };
 
-bool IsDeclaredPort(Signal const &signal) { return signal.IsPort() && signal.IsNeededToDeclared(); }
 bool IsDeclaredWire(Signal const &signal) {
     return !signal.IsPort() && signal.IsNeededToDeclared();
 }
@@ -264,9 +263,7 @@ void VerilogNetlister::WriteSignalAssignments(Iterator<Signal *> const &signals)
     ForEach(signals, [this](Signal const *signal) {
         if (!signal->HasConstantValue())
             return;
-        Signal::SignalType const type = signal->GetSignalType();
-        bool const isScalar = type == Signal::SIGNAL_SCALAR || type == Signal::SIGNAL_BUS_INDEX;
-        statements->WriteConstantSignalAssignment(signal->GetNameRef(), isScalar,
+        statements->WriteConstantSignalAssignment(signal->GetNameRef(), IsOneDigit(*signal),
                                                   signal->GetConstantValue());
         Put(*stream, ";", EOL);
     });
@@ -399,16 +396,13 @@ void VerilogNetlister::WriteDefParam(Instance const *instance, HdlOptions const 
     if (init) {
         statements->WriteDefParamInitStatement(init, name);
         Put(*stream, ";", EOL);
-        PtrArray<Attribute *> others;
-        ForEach(syn, [&](Attribute *attr) {
-            if (attr != init)
-                others.Add(attr);
-        });
-        return WriteGenerics(others, nosyn, [&](Attribute const *attr) {
-            statements->WriteDefParamStatement(attr, name);
-        });
     }
-    WriteGenerics(syn, nosyn,
+    PtrArray<Attribute *> others;
+    ForEach(syn, [&](Attribute *attr) {
+        if (attr != init)
+            others.Add(attr);
+    });
+    WriteGenerics(others, nosyn,
                   [&](Attribute const *attr) { statements->WriteDefParamStatement(attr, name); });
 }
 

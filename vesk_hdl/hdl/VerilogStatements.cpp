@@ -1,8 +1,7 @@
 #include "vesk_hdl/hdl/VerilogStatements.h"
 
 #include "vesk_hdl/hdl/HdlUtilities.h"
-#include "vesk_hdl/hdl/Pieces.h"
-#include "vesk_hdl/hdl/ScalarDigit.h"
+#include "vesk_hdl/hdl/Shared.h"
 #include "vesk_hdl/netlist/Signal.h"
 
 using namespace Vesk_Hdl;
@@ -86,13 +85,7 @@ void VerilogStatements::WriteIncludePath(StringArray const &paths) {
         Put(stream, "`include", " \"", HdlUtilities::RemoveQuotes(paths.At(i)), "\"", EOL);
 }
 
-void VerilogStatements::WriteComment(Object const *object) {
-    if (!object || !object->HasComment())
-        return;
-    StringArray const lines(object->GetComment(), "\n", true, nullptr);
-    for (int i = 0; i < lines.GetSize(); ++i)
-        Put(stream, "// ", lines.At(i), "\n");
-}
+void VerilogStatements::WriteComment(Object const *object) { PutComment(stream, object, "// "); }
 
 void VerilogStatements::WriteParameterStatement(Attribute const *attr) {
     if (!attr)

@@ -4,7 +4,7 @@
 #include <unordered_set>
 
 #include "vesk_hdl/hdl/HdlUtilities.h"
-#include "vesk_hdl/hdl/Pieces.h"
+#include "vesk_hdl/hdl/Shared.h"
 #include "vesk_hdl/hdl/Translate.h"
 #include "vesk_hdl/hdl/VhdlStatements.h"
 #include "vesk_hdl/model/HdlOptions.h"
@@ -15,6 +15,12 @@ using namespace Vesk_Hdl;
 using Text = Basis::StringBase<char>;
 
 namespace {
+
+/// The statements of a netlister and its copies, which the last of them deletes.
+struct SharedStatements : VhdlStatements {
+    using VhdlStatements::VhdlStatements;
+    int owners = 1;
+};
 
 /// A port clause of an entity or component: the caller writes the items.
 class PortClause {
@@ -34,8 +40,6 @@ private:
     char const *separator = "";
 };
 
-bool IsDeclaredPort(Signal const &signal) { return signal.IsPort() && signal.IsNeededToDeclared(); }
-
 /// A signal that the architecture declares.
 bool IsInnerSignal(Signal const &signal) {
     return signal.GetPortPolarity() == Polarity::INVALID && signal.IsNeededToDeclared();
@@ -48,10 +52,18 @@ Text BaseNameOf(Object const &object) { return Object::GetBaseName(object.GetNam
 namespace Vesk_Hdl {
 
 VhdlNetlister::VhdlNetlister(OutStream &out)
-    : statements(std::make_shared<VhdlStatements>(out)), stream(&out) {}
+    : statements(new SharedStatements(out)), stream(&out) {}
 
-VhdlNetlister::VhdlNetlister(VhdlNetlister &other) = default;
-VhdlNetlister::~VhdlNetlister() = default;
+VhdlNetlister::VhdlNetlister(VhdlNetlister &other)
+    : statements(other.statements), stream(other.stream), declaredAttrs(other.declaredAttrs) {
+    ++static_cast<SharedStatements *>(statements)->owners;
+}
+
+VhdlNetlister::~VhdlNetlister() {
+    auto *const shared = static_cast<SharedStatements *>(statements);
+    if (--shared->owners == 0)
+        delete shared;
+}
 
 void VhdlNetlister::WriteNetlist(Netlist *netlist, HdlOptions const *options) {
     if (!netlist || !options)
@@ -226,9 +238,7 @@ void VhdlNetlister::WriteAssignments(Netlist const *netlist) {
     ForEach(netlist->GetSignalIterator(), [&](Signal const *signal) {
         if (!signal->HasConstantValue())
             return;
-        Signal::SignalType const type = signal->GetSignalType();
-        bool const isScalar = type == Signal::SIGNAL_SCALAR || type == Signal::SIGNAL_BUS_INDEX;
-        statements->WriteConstantSignalAssignment(signal->GetNameRef(), isScalar,
+        statements->WriteConstantSignalAssignment(signal->GetNameRef(), IsOneDigit(*signal),
                                                   signal->GetConstantValue());
     });
     ForEach(netlist->GetSignalIterator(), [&](Signal const *target) {

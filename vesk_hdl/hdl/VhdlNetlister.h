@@ -1,7 +1,5 @@
 #pragma once
 
-#include <memory>
-
 #include "vesk_hdl/netlist/NetlistFwd.h"
 #include "vesk_hdl/text/PtrArray.h"
 #include "vesk_hdl/text/StringSet.h"
@@ -52,7 +50,7 @@ private:
     void WriteInstance(Instance const *instance, HdlOptions const *options);
     void WriteInstanceAttrAssignment(Instance const *instance, HdlOptions const *options);
 
-    std::shared_ptr<VhdlStatements> statements;
+    VhdlStatements *statements; ///< shared with copies
     OutStream *stream;
     StringSet declaredAttrs; ///< declared so far in this file, by entity and architecture alike
 };

@@ -2,6 +2,7 @@
 
 #include "vesk_hdl/hdl/VhdlNetlister.h"
 
+#include <algorithm>
 #include <limits>
 
 #include "vesk_hdl/hdl/Pieces.h"

@@ -3,8 +3,7 @@
 #include <string>
 
 #include "vesk_hdl/hdl/HdlUtilities.h"
-#include "vesk_hdl/hdl/Pieces.h"
-#include "vesk_hdl/hdl/ScalarDigit.h"
+#include "vesk_hdl/hdl/Shared.h"
 #include "vesk_hdl/hdl/Translate.h"
 #include "vesk_hdl/netlist/Signal.h"
 
@@ -81,13 +80,7 @@ void VhdlStatements::WriteTimeStamp(char const *fileName) {
     Put(stream, " - ", HdlUtilities::CurrentTimeString(), EOL);
 }
 
-void VhdlStatements::WriteComment(Object const *object) {
-    if (!object || !object->HasComment())
-        return;
-    StringArray const lines(object->GetComment(), "\n", true, nullptr);
-    for (int i = 0; i < lines.GetSize(); ++i)
-        Put(stream, "-- ", lines.At(i), "\n");
-}
+void VhdlStatements::WriteComment(Object const *object) { PutComment(stream, object, "-- "); }
 
 void VhdlStatements::WriteIEEELibrary() {
     Put(stream, "library", " ieee;", EOL);

@@ -281,14 +281,15 @@ Iterator<Attribute *> AttributeHolder::GetAttrIterator() const {
 
 bool AttributeHolder::HasAttrs() const { return record && !record->attributes.IsEmpty(); }
 
-AttributeFactory::AttributeFactory() {
-    creators.Add("String", AttributeString::CreateAttribute);
-    creators.Add("Integer", AttributeInteger::CreateAttribute);
-    creators.Add("Float", AttributeFloat::CreateAttribute);
-    creators.Add("Boolean", AttributeBoolean::CreateAttribute);
-    creators.Add("Bit", AttributeBit::CreateAttribute);
-    creators.Add("BitVector", AttributeBitVector::CreateAttribute);
-    creators.Add("User", AttributeUser::CreateAttribute);
+AttributeFactory::AttributeFactory()
+    : creators(std::make_unique<IStringPtrMap<AttributeCreator>>()) {
+    creators->Add("String", AttributeString::CreateAttribute);
+    creators->Add("Integer", AttributeInteger::CreateAttribute);
+    creators->Add("Float", AttributeFloat::CreateAttribute);
+    creators->Add("Boolean", AttributeBoolean::CreateAttribute);
+    creators->Add("Bit", AttributeBit::CreateAttribute);
+    creators->Add("BitVector", AttributeBitVector::CreateAttribute);
+    creators->Add("User", AttributeUser::CreateAttribute);
 }
 
 AttributeFactory::~AttributeFactory() = default;
@@ -300,7 +301,7 @@ AttributeFactory &AttributeFactory::GetInstance() {
 
 Attribute *AttributeFactory::CreateAttribute(char const *type, char const *name,
                                              char const *value) const {
-    AttributeCreator const creator = creators.Get(type ? type : Attribute::DEFAULT_ATTRTYPE);
+    AttributeCreator const creator = creators->Get(type ? type : Attribute::DEFAULT_ATTRTYPE);
     return creator ? creator(name, value) : nullptr;
 }
 

@@ -224,7 +224,7 @@ private:
     AttributeFactory(AttributeFactory const &) = delete;
     AttributeFactory &operator=(AttributeFactory const &) = delete;
 
-    IStringPtrMap<AttributeCreator> creators;
+    std::unique_ptr<IStringPtrMap<AttributeCreator>> creators;
 };
 
 } // namespace Vesk_Hdl

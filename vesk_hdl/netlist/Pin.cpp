@@ -39,8 +39,10 @@ public:
     void Add(StringBase<char> const &name, int position) {
         isUnique = isUnique && !table.Find(name.View());
         table.GrowForOneMore();
+        // NOLINTNEXTLINE(performance-no-int-to-ptr): a small number in the slot of a pointer
+        void *const value = reinterpret_cast<void *>(static_cast<std::uintptr_t>(position));
         if (isUnique)
-            table.Insert(name, reinterpret_cast<void *>(static_cast<std::uintptr_t>(position)));
+            table.Insert(name, value);
     }
     bool IsUsable() const { return isUnique && !somePinWasRenamed; }
     /// -1 when absent.

@@ -12,7 +12,7 @@ void StreamDst::Flush() {}
 void StreamDst::WriteNewLine() { Write("\n"); }
 void StreamDst::Indent() { ++indentLevel; }
 void StreamDst::Unindent() { indentLevel -= indentLevel > 0 ? 1 : 0; }
-int StreamDst::GetIndentLevel() const { return indentLevel; }
+int StreamDst::GetIndentLevel() { return indentLevel; }
 
 namespace {
 
@@ -78,7 +78,7 @@ public:
     Basis::StringBase<char> const &GetFileName() const { return fileName; }
 
 private:
-    std::size_t Indentation() const { return 3 * static_cast<std::size_t>(GetIndentLevel()); }
+    std::size_t Indentation() { return 3 * static_cast<std::size_t>(GetIndentLevel()); }
 
     void IndentNewLine() {
         if (line.IsEmpty())

@@ -20,7 +20,7 @@ public:
     void Indent();
     /// One level less; level 0 stays.
     void Unindent();
-    int GetIndentLevel() const;
+    int GetIndentLevel();
 
 private:
     int indentLevel;

@@ -53,14 +53,14 @@ int PtrArrayBase::Add(void *item) {
     return size;
 }
 
-int PtrArrayBase::GetIndex(void const *item) const {
+int PtrArrayBase::GetIndex(void *item) const {
     for (int i = 0; i < GetSize(); ++i)
         if (Items()[i] == item)
             return i;
     return -1;
 }
 
-bool PtrArrayBase::Remove(void const *item) {
+bool PtrArrayBase::Remove(void *item) {
     int const index = GetIndex(item);
     if (index < 0)
         return false;

@@ -32,10 +32,10 @@ protected:
     /// The last element, null when empty.
     void *GetTail() const { return GetAt(GetSize() - 1); }
     /// The index of the first equal pointer, -1 when absent. A scan from the front.
-    int GetIndex(void const *item) const;
-    bool Contains(void const *item) const { return GetIndex(item) >= 0; }
+    int GetIndex(void *item) const;
+    bool Contains(void *item) const { return GetIndex(item) >= 0; }
     /// Removes the first equal pointer and keeps the order of the others; false when absent.
-    bool Remove(void const *item);
+    bool Remove(void *item);
     /// Drops the last element. The array must not be empty.
     void RemoveTail();
     /// Stores at `index`; an index past the end makes the array longer, with null in between. A

@@ -67,7 +67,7 @@ void Netlist::Add(Signal *signal) {
         record->busMap.Add(bus->GetBaseName(), signal);
     else if (auto const *const compound = dynamic_cast<CompoundBus const *>(signal))
         ForEach(compound->GetBusMemberIterator(),
-                [this, signal](Signal *member) { NoteReferrer(member, signal); });
+                [this, signal](Signal *member) { KnowReferrer(member, signal); });
 }
 
 void Netlist::Add(Instance *instance) {
@@ -171,18 +171,22 @@ Bus *Netlist::Widen(Bus *bus, char const *name, PtrArray<Signal *> &inHand) {
 }
 
 void Netlist::Link(Signal *left, Signal *right) {
+    int const before = right->GetUnknownReferences();
     left->Connect(right);
-    NoteReferrer(right, left);
+    if (right->GetUnknownReferences() != before)
+        KnowReferrer(right, left);
 }
 
 void Netlist::MoveConnections(Signal *from, Signal *to) {
-    record->referrers.Move(from, to);
+    record->referrers.Copy(from, to);
     to->CloneConnection(from);
 }
 
-void Netlist::NoteReferrer(Signal *target, Signal *referrer) {
+/// Notes who lists a signal, if it is one that can be widened.
+void Netlist::KnowReferrer(Signal *target, Signal *referrer) {
     if (target->GetSignalType() == Signal::SIGNAL_BUS)
         record->referrers.Note(target, referrer);
+    target->NoteKnownReference();
 }
 
 void Netlist::ReplaceReferencesIn(Signal *referrer, Signal *former, Signal *now) {
@@ -194,12 +198,11 @@ void Netlist::ReplaceReferencesIn(Signal *referrer, Signal *former, Signal *now)
 }
 
 /// Whatever may point at a signal one way: links, members of compounds, pins that it does not list.
-/// Where the netlist knows of fewer links and members than were ever made, somebody made one behind
-/// its back, and it looks at all there are.
+/// Where a link or member was made behind the netlist's back, it looks at all signals there are.
 void Netlist::ReplaceReferences(Signal *former, Signal *now) {
     Referrers::Set const known = record->referrers.TakeReferrers(former);
     auto const replaceIn = [&](Signal *referrer) { ReplaceReferencesIn(referrer, former, now); };
-    if (known.size() == former->GetReferences()) {
+    if (former->GetUnknownReferences() == 0) {
         for (Signal *const referrer : known)
             replaceIn(referrer);
     } else {

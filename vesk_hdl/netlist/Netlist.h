@@ -105,7 +105,7 @@ private:
     /// Signal::Connect and Signal::CloneConnection, and the netlist knows who lists a bus.
     void Link(Signal *left, Signal *right);
     void MoveConnections(Signal *from, Signal *to);
-    void NoteReferrer(Signal *target, Signal *referrer);
+    void KnowReferrer(Signal *target, Signal *referrer);
 
     void GetWiredOrOutputSignals(StringSet &names);
     void GetFeedBackSignals(bool outPortToInPin, StringSet &names);

@@ -161,8 +161,10 @@ void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
         CompoundBus *const dummy = old->CreateDummySignal();
         addDummy(dummy, old);
         ForEach(old->GetBusMemberIterator(), [this, dummy](Signal const *member) {
-            if (Signal *const memberDummy = GetSignal(member->GetDummySignalName()))
+            if (Signal *const memberDummy = GetSignal(member->GetDummySignalName())) {
                 dummy->AddBusMember(memberDummy);
+                KnowReferrer(memberDummy, dummy);
+            }
         });
     });
 }

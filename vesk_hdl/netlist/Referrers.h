@@ -8,8 +8,8 @@
 
 namespace Vesk_Hdl {
 
-/// Which signals list which others, by link or as a member, as far as it was noted here. Signals
-/// are compared and never looked into, so that one may be gone.
+/// Which signals may list which others, by link or as a member: at least those that do of what was
+/// noted here. Signals are compared and never looked into.
 class Referrers {
 public:
     using Set = std::unordered_set<Signal *>;
@@ -19,12 +19,14 @@ public:
         targets[referrer].insert(target);
     }
 
-    /// What `from` lists is listed by `to` from now on.
-    void Move(Signal *from, Signal *to) {
-        for (Signal *const target : Take(targets, from)) {
-            referrers[target].erase(from);
+    /// What `from` lists may be listed by `to` as well.
+    void Copy(Signal *from, Signal *to) {
+        auto const found = targets.find(from);
+        if (found == targets.end())
+            return;
+        Set const listed = found->second;
+        for (Signal *const target : listed)
             Note(target, to);
-        }
     }
 
     /// Forgets a signal that is about to die.

@@ -58,7 +58,7 @@ struct Signal::Record {
     BitVectorValue constantValue;
     ListedOnce<Pin *> pins;
     ListedOnce<Signal *> signals;
-    unsigned int references = 0;
+    int unknownReferences = 0;
     bool tied = false;
 };
 
@@ -69,9 +69,10 @@ Object::ObjectType Signal::GetObjectType() const { return GetStoredObjectType();
 void Signal::AcceptObject(ObjectVisitor &visitor) { visitor.VisitSignal(this); }
 void Signal::SetName(char const *name) { Object::SetName(name); }
 
-void Signal::NoteReference() { ++record->references; }
+void Signal::NoteReference() { ++record->unknownReferences; }
+void Signal::NoteKnownReference() { --record->unknownReferences; }
 void Signal::NoteTie() { record->tied = true; }
-unsigned int Signal::GetReferences() const { return record->references; }
+int Signal::GetUnknownReferences() const { return record->unknownReferences; }
 bool Signal::IsTied() const { return record->tied; }
 
 void Signal::Connect(Pin *pin) {

@@ -80,11 +80,12 @@ private:
     friend class CompoundBus;
     struct Record;
 
-    // Who points at this signal without being listed here: links and memberships in compounds are
-    // counted, that some pin is tied one way is noted. Nothing is ever counted back.
+    // Who points at this signal without being listed here. Links and memberships in compounds are
+    // counted until the netlist knows them; that some pin is tied one way is noted.
     void NoteReference();
+    void NoteKnownReference();
     void NoteTie();
-    unsigned int GetReferences() const;
+    int GetUnknownReferences() const;
     bool IsTied() const;
     void ReplaceAssigned(Signal *former, Signal *now);
 

@@ -6,7 +6,7 @@
 
 #include <CLI/CLI.hpp>
 
-#include "tool/RunCommand.h"
+#include "tool/commands/RunCommand.h"
 #include "vesk_hdl/Vesk_Hdl.h"
 
 namespace {

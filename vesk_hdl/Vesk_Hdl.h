@@ -2,6 +2,7 @@
 
 // The whole exported interface and the types of the base layer that it uses. Begin with Engine.
 
+#include "vesk_hdl/engine/CommandHelp.h"
 #include "vesk_hdl/engine/HdlCmd.h"
 #include "vesk_hdl/engine/HdlEngine.h"
 #include "vesk_hdl/hdl/HdlUtilities.h"

@@ -28,7 +28,7 @@ Model &Command::RequireModel() const {
     return *commandModel;
 }
 
-#define KEYWORD_OF(keyword, Class)                                                                 \
+#define KEYWORD_OF(keyword, Class, grammar)                                                        \
     char const *Class::GetKeyword() const { return keyword; }
 VESK_HDL_COMMANDS(KEYWORD_OF)
 #undef KEYWORD_OF
@@ -40,7 +40,7 @@ struct CommandFactory::Record {
 };
 
 CommandFactory::CommandFactory() : record(new Record) {
-#define REGISTER(keyword, Class)                                                                   \
+#define REGISTER(keyword, Class, grammar)                                                          \
     AddCommandCreator(                                                                             \
         keyword, [](Model *model, StringArray const &) -> Command * { return new Class(model); });
     VESK_HDL_COMMANDS(REGISTER)

@@ -20,6 +20,7 @@ struct Model::Record {
 
     bool modified = false;
     WriteStatus lastWrite;
+    WriteOpener *writeOpener = nullptr;
     Netlist netlist;
     HdlOptions options;
     CommandManager commandManager;
@@ -75,6 +76,10 @@ WriteStatus const &Model::GetLastWrite() const { return record->lastWrite; }
 void Model::SetLastWrite(char const *fileName, int error) {
     record->lastWrite = {record->lastWrite.number + 1, fileName, error};
 }
+
+WriteOpener::~WriteOpener() = default;
+void Model::SetWriteOpener(WriteOpener *opener) { record->writeOpener = opener; }
+WriteOpener *Model::GetWriteOpener() const { return record->writeOpener; }
 
 struct Engine::Record {
     CommandFactory factory; ///< outlives the models, which point at it

@@ -41,7 +41,11 @@ struct WriteArguments {
 /// what became of the write.
 template <class Write>
 void WriteFile(Model &model, WriteArguments const &arguments, Write writeNetlist) {
-    TextFileOutStream stream(arguments.fileName, arguments.append);
+    TextFileOutStream stream(arguments.fileName);
+    if (WriteOpener *const opener = model.GetWriteOpener())
+        stream.Adopt(opener->Open(arguments.fileName, arguments.append));
+    else
+        stream.Open(arguments.fileName, arguments.append);
     model.GetOptions()->writeHeader = arguments.writeHeader;
     writeNetlist(stream, model.GetNetlist(), *model.GetOptions());
     stream.Close();

@@ -21,6 +21,16 @@ struct WriteStatus {
     int error = 0; ///< `errno` of the first failure to open, write or close, or 0
 };
 
+/// Opens the files of a model's write commands in place of the library: derived by a client that
+/// confines, redirects or captures what is written.
+class VESK_HDL_API WriteOpener {
+public:
+    virtual ~WriteOpener();
+    /// A descriptor open for writing, which the library closes; or -1 with `errno` set, and the text
+    /// is dropped as for a file that cannot be opened. The name is as the command gave it.
+    virtual int Open(char const *fileName, bool append) = 0;
+};
+
 /// One design, and the object that commands run against: every change by name goes through it.
 ///
 /// Operations check first and change afterwards. A refusal is an Exception, and what was there
@@ -72,6 +82,9 @@ public:
     WriteStatus const &GetLastWrite() const;
     /// For write commands.
     void SetLastWrite(char const *fileName, int error);
+    /// Who opens the files of write commands; null, as at first, for the library itself. Not owned.
+    void SetWriteOpener(WriteOpener *opener);
+    WriteOpener *GetWriteOpener() const;
 
     // Declarations. Each returns true.
 

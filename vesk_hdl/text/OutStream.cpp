@@ -58,10 +58,17 @@ public:
 
     bool Open(char const *name, bool append) {
         Close();
-        file = append ? File::open(name, Stream::ACCESS_APPEND, false)
-                      : File::open(name, Stream::ACCESS_REPLACE, true);
-        error = file ? 0 : errno;
-        return file != nullptr;
+        return Take(append ? File::open(name, Stream::ACCESS_APPEND, false)
+                           : File::open(name, Stream::ACCESS_REPLACE, true));
+    }
+
+    bool Adopt(int descriptor) {
+        int const callersError = errno;
+        Close();
+        bool const taken = Take(File::adopt(descriptor));
+        if (!taken)
+            error = callersError;
+        return taken;
     }
 
     void Close() {
@@ -78,6 +85,12 @@ public:
     Basis::StringBase<char> const &GetFileName() const { return fileName; }
 
 private:
+    bool Take(Stream *opened) {
+        file = opened;
+        error = file ? 0 : errno;
+        return file != nullptr;
+    }
+
     std::size_t Indentation() { return 3 * static_cast<std::size_t>(GetIndentLevel()); }
 
     void IndentNewLine() {
@@ -146,8 +159,14 @@ TextFileOutStream::TextFileOutStream(char const *fileName, bool append)
         Open(fileName, append);
 }
 
+TextFileOutStream::TextFileOutStream(char const *fileName) : OutStream(new TextFileDst(fileName)) {}
+
 bool TextFileOutStream::Open(char const *fileName, bool append) {
     return static_cast<TextFileDst *>(dst)->Open(fileName, append);
+}
+
+bool TextFileOutStream::Adopt(int descriptor) {
+    return static_cast<TextFileDst *>(dst)->Adopt(descriptor);
 }
 
 void TextFileOutStream::Close() { static_cast<TextFileDst *>(dst)->Close(); }

@@ -64,12 +64,17 @@ class VESK_HDL_API TextFileOutStream : public OutStream {
 public:
     /// Keeps the name and opens the file as Open does; with null nothing is opened.
     TextFileOutStream(char const *fileName, bool append);
+    /// Keeps the name and opens nothing.
+    explicit TextFileOutStream(char const *fileName);
 
     /// Closes an open file as Close does, then opens the named one, at its end with `append`,
     /// otherwise replacing it. False if that fails; what is then written is dropped in silence.
     /// GetFileName goes on telling the name given to the constructor. Close first to learn about
     /// the former file from GetError.
     bool Open(char const *fileName, bool append);
+    /// As Open, into a descriptor open for writing, which the stream closes in the end. False for a
+    /// negative one; the error is then the `errno` that the caller found.
+    bool Adopt(int descriptor);
     /// Writes what is left, with an end of line, and closes the file.
     void Close();
     bool IsOpen() const;

@@ -16,11 +16,21 @@ using Basis::ViewOf;
 
 namespace {
 
+/// The range from `begin` up to, without, `end`.
+Basis_Range PlaceOf(std::size_t begin, std::size_t end) {
+    if (begin == end)
+        return {static_cast<unsigned int>(begin) + 1, static_cast<unsigned int>(begin)};
+    return {static_cast<unsigned int>(begin), static_cast<unsigned int>(end - 1)};
+}
+
 /// The quoted way of StringArray::Parse: one walk over the text, a character at a time.
 class QuotedParser {
 public:
-    QuotedParser(std::string_view separatorSet, bool skip, std::string_view pairs, StringArray &out)
-        : separators(separatorSet), skipEmpty(skip), quotePairs(pairs), tokens(out) {}
+    /// Null for places asks for none.
+    QuotedParser(std::string_view separatorSet, bool skip, std::string_view pairs, StringArray &out,
+                 std::vector<Basis_Range> *placesOut)
+        : separators(separatorSet), skipEmpty(skip), quotePairs(pairs), tokens(out),
+          places(placesOut) {}
 
     int Parse(std::string_view text) {
         std::size_t i = OpensAt(text, 0) ? 1 : 0;
@@ -28,7 +38,7 @@ public:
             i = inQuote ? StepInside(text, i) : StepOutside(text, i);
         // Only here a quoted part that ended does not count: an empty last token is lost.
         if (!token.empty())
-            AddToken();
+            AddToken(text.size());
         return count;
     }
 
@@ -69,12 +79,15 @@ private:
             return i + 1;
         }
         if (!token.empty() || !skipEmpty || hadQuote)
-            AddToken();
+            AddToken(i);
+        begin = i + 1;
         return OpensAt(text, i + 1) ? i + 2 : i + 1;
     }
 
-    void AddToken() {
+    void AddToken(std::size_t end) {
         tokens.Add(StringBase<char>(std::string_view(token)));
+        if (places)
+            places->push_back(PlaceOf(begin, end));
         token.clear();
         hadQuote = false;
         ++count;
@@ -84,7 +97,9 @@ private:
     bool skipEmpty;
     std::string_view quotePairs;
     StringArray &tokens;
+    std::vector<Basis_Range> *places;
     std::string token;
+    std::size_t begin = 0; ///< of the token, with its quote
     char close = '\0';
     bool inQuote = false;
     bool hadQuote = false; ///< a quoted part has ended: the token counts even if it is empty
@@ -153,15 +168,23 @@ void StringArray::Empty() { record->strings.clear(); }
 
 int StringArray::Parse(char const *text, char const *separators, bool skipEmpty,
                        char const *quotePairs) {
+    return Parse(text, separators, skipEmpty, quotePairs, nullptr);
+}
+
+int StringArray::Parse(char const *text, char const *separators, bool skipEmpty,
+                       char const *quotePairs, std::vector<Basis_Range> *places) {
     std::string_view const whole = ViewOf(text);
     std::string_view const set = ViewOf(separators);
     std::string_view const quotes = ViewOf(quotePairs);
     if (whole.find_first_of(quotes) != std::string_view::npos)
-        return QuotedParser(set, skipEmpty, quotes, *this).Parse(whole);
+        return QuotedParser(set, skipEmpty, quotes, *this, places).Parse(whole);
 
     int const before = GetSize();
-    for (Basis_Range range = {1, 0}; Basis::NextToken(whole, range, set, skipEmpty);)
+    for (Basis_Range range = {1, 0}; Basis::NextToken(whole, range, set, skipEmpty);) {
         record->strings.emplace_back(Basis::TokenIn(whole, range));
+        if (places)
+            places->push_back(range);
+    }
     return GetSize() - before;
 }
 

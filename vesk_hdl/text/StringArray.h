@@ -1,5 +1,7 @@
 #pragma once
 
+#include <vector>
+
 #include "vesk_hdl/text/basis/StringBase.h"
 
 namespace Vesk_Hdl {
@@ -43,6 +45,11 @@ public:
     /// become part of a token. A quoted token may be empty, but not as the last of the text. A
     /// quote that nobody closes runs to the end.
     int Parse(char const *text, char const *separators, bool skipEmpty, char const *quotePairs);
+    /// The same, and appends to `places` for each token the characters of `text` that it was read
+    /// from, its quotes included; for an empty one a range whose `first` is greater. Null asks for
+    /// none.
+    int Parse(char const *text, char const *separators, bool skipEmpty, char const *quotePairs,
+              std::vector<Basis_Range> *places);
 
     /// True if a string equals the argument, exactly or but for case.
     bool Contains(Basis::StringBase<char> const &string) const;

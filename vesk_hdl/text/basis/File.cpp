@@ -132,6 +132,17 @@ Stream *File::open(char const *name, Stream::Access access, bool) {
     return stream;
 }
 
+Stream *File::adopt(int descriptor) {
+    if (descriptor < 0) {
+        errno = EBADF;
+        return nullptr;
+    }
+    auto record = std::make_unique<Stream::Record>();
+    auto *const stream = new Stream(record.get());
+    record.release()->descriptor = descriptor; // last: on a failure it stays the caller's
+    return stream;
+}
+
 bool File::close(Stream *stream) {
     if (!stream)
         return true;

@@ -40,6 +40,9 @@ public:
     /// file whose reading breaks off. ACCESS_REPLACE and ACCESS_APPEND create a missing file.
     /// `fromStart` goes along with the access (true but for ACCESS_APPEND) and decides nothing.
     static Stream *open(char const *name, Stream::Access access, bool fromStart);
+    /// A new stream, owned by the caller, that writes to a descriptor and closes it in the end.
+    /// Null with `errno` EBADF for a negative one.
+    static Stream *adopt(int descriptor);
     /// Flushes, closes and deletes the stream; null is ignored. True if all its text reached the
     /// file; otherwise false with the `errno` of the first failure.
     static bool close(Stream *stream);

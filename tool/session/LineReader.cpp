@@ -1,4 +1,4 @@
-#include "tool/LineReader.h"
+#include "tool/session/LineReader.h"
 
 #include <cerrno>
 #include <fcntl.h>

@@ -1,0 +1,24 @@
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "vesk_hdl/Vesk_Hdl.h"
+
+/// A command line as the engine reads it: its tokens, and where in the line each stands.
+class LineTokens {
+public:
+    explicit LineTokens(std::string const &line);
+
+    Vesk_Hdl::StringArray const &GetTokens() const { return tokens; }
+    int GetSize() const { return tokens.GetSize(); }
+    std::string_view At(int index) const;
+    /// From 1, in bytes, of the token's first character or quote; 0 if there is no such token.
+    unsigned GetColumn(int index) const;
+    /// In bytes, quotes included.
+    unsigned GetLength(int index) const;
+
+private:
+    Vesk_Hdl::StringArray tokens;
+    std::vector<Basis_Range> places;
+};

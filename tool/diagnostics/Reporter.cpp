@@ -1,0 +1,206 @@
+#include "tool/diagnostics/Reporter.h"
+
+#include <algorithm>
+#include <array>
+#include <ostream>
+
+namespace {
+
+constexpr std::size_t MOST_SOURCE = 160; ///< bytes of a line that are shown around the caret
+constexpr std::size_t SOURCE_BEFORE = 60;
+constexpr char CLIPPED[] = "...";
+
+struct Word {
+    char const *text;
+    char const *colour;
+};
+constexpr Word ERROR_WORD = {"error", "\033[1;31m"};
+constexpr Word WARNING_WORD = {"warning", "\033[1;35m"};
+constexpr Word NOTE_WORD = {"note", "\033[1;36m"};
+constexpr Word HINT_WORD = {"hint", "\033[1;34m"};
+constexpr char BOLD[] = "\033[1m";
+constexpr char GREEN[] = "\033[1;32m";
+constexpr char PLAIN[] = "\033[m";
+
+Word const &WordOf(Severity severity) {
+    return severity == Severity::ERROR ? ERROR_WORD : WARNING_WORD;
+}
+
+bool IsControl(char c) { return static_cast<unsigned char>(c) < ' ' || c == '\x7f'; }
+bool Continues(char c) { return (static_cast<unsigned char>(c) & 0xC0) == 0x80; }
+
+/// Text of a file as a terminal may see it: nothing in it moves the cursor.
+std::string Harmless(std::string_view text) {
+    std::string shown(text);
+    std::replace(shown.begin(), shown.end(), '\t', ' ');
+    std::replace_if(shown.begin(), shown.end(), IsControl, '?');
+    return shown;
+}
+
+/// How many characters of UTF-8 a text has.
+std::size_t CharactersIn(std::string_view text) {
+    return text.size() -
+           static_cast<std::size_t>(std::count_if(text.begin(), text.end(), Continues));
+}
+
+/// Length of the UTF-8 sequence that begins here, 0 if it is none.
+std::size_t SequenceAt(std::string_view text) {
+    unsigned char const lead = static_cast<unsigned char>(text[0]);
+    std::size_t const length = lead < 0x80                   ? 1
+                               : lead >= 0xC2 && lead < 0xE0 ? 2
+                               : lead >= 0xE0 && lead < 0xF0 ? 3
+                               : lead >= 0xF0 && lead < 0xF5 ? 4
+                                                             : 0;
+    if (length == 0 || length > text.size() ||
+        !std::all_of(text.begin() + 1, text.begin() + static_cast<std::ptrdiff_t>(length),
+                     Continues))
+        return 0;
+    // Overlong forms, surrogates and what lies behind U+10FFFF.
+    unsigned char const second = length > 1 ? static_cast<unsigned char>(text[1]) : 0;
+    bool const bad = (lead == 0xE0 && second < 0xA0) || (lead == 0xED && second > 0x9F) ||
+                     (lead == 0xF0 && second < 0x90) || (lead == 0xF4 && second > 0x8F);
+    return bad ? 0 : length;
+}
+
+/// Writes the members of a JSON object, a comma between them.
+class JsonObject {
+public:
+    explicit JsonObject(std::ostream &output) : stream(output) { stream << '{'; }
+    JsonObject(JsonObject const &) = delete;
+    JsonObject &operator=(JsonObject const &) = delete;
+    ~JsonObject() { stream << '}'; }
+
+    std::ostream &Name(char const *name) {
+        stream << (first ? "" : ",") << '"' << name << "\":";
+        first = false;
+        return stream;
+    }
+    void Text(char const *name, std::string_view text) { Name(name) << JsonString(text); }
+    void Put(Place const &place) {
+        Text("file", place.file);
+        Name("line") << place.line;
+        Name("column") << place.column;
+        Name("length") << place.length;
+    }
+
+private:
+    std::ostream &stream;
+    bool first = true;
+};
+
+} // namespace
+
+std::string JsonString(std::string_view text) {
+    constexpr char HEX[] = "0123456789abcdef";
+    std::string json = "\"";
+    while (!text.empty()) {
+        std::size_t const length = SequenceAt(text);
+        char const c = text[0];
+        if (length == 0)
+            json += "\\ufffd";
+        else if (c == '"' || c == '\\')
+            json.append({'\\', c});
+        else if (IsControl(c))
+            json.append("\\u00").append({HEX[c >> 4], HEX[c & 15]});
+        else
+            json.append(text, 0, length);
+        text.remove_prefix(std::max<std::size_t>(length, 1));
+    }
+    return json + '"';
+}
+
+Reporter::Reporter(std::ostream &output, ReportStyle style) : stream(output), reportStyle(style) {}
+
+void Reporter::Report(Diagnostic const &diagnostic) {
+    ++(diagnostic.severity == Severity::ERROR ? errors : warnings);
+    if (reportStyle.format == ReportStyle::JSON)
+        ReportJson(diagnostic);
+    else
+        ReportText(diagnostic);
+    stream.flush();
+}
+
+void Reporter::ReportText(Diagnostic const &diagnostic) {
+    auto const colour = [this](char const *code) { return reportStyle.colour ? code : ""; };
+    auto const head = [&](Place const &place, Word const &word, std::string_view text) {
+        stream << colour(BOLD) << Harmless(place.file);
+        for (unsigned long const number : {place.line, static_cast<unsigned long>(place.column)})
+            if (number > 0)
+                stream << ':' << number;
+        stream << ": " << colour(PLAIN) << colour(word.colour) << word.text << ": " << colour(PLAIN)
+               << Harmless(text);
+    };
+
+    head(diagnostic.place, WordOf(diagnostic.severity), diagnostic.message);
+    if (!diagnostic.name.empty())
+        stream << " [" << diagnostic.name << ", " << diagnostic.language << ']';
+    stream << '\n';
+    ReportSource(diagnostic, colour(GREEN), colour(PLAIN));
+    for (std::string const &hint : diagnostic.hints)
+        stream << "  " << colour(HINT_WORD.colour) << HINT_WORD.text << ": " << colour(PLAIN)
+               << Harmless(hint) << '\n';
+    for (Diagnostic::Note const &note : diagnostic.notes) {
+        head(note.place, NOTE_WORD, note.text);
+        stream << '\n';
+    }
+}
+
+/// The line and, below it, a caret under what is to blame. Of a long line only the part around the
+/// caret is shown.
+void Reporter::ReportSource(Diagnostic const &diagnostic, char const *colour, char const *plain) {
+    if (diagnostic.place.column == 0 || diagnostic.source.empty())
+        return;
+    std::string_view source = diagnostic.source;
+    std::size_t at = std::min<std::size_t>(diagnostic.place.column - 1, source.size());
+    bool const clipFront = source.size() > MOST_SOURCE && at > SOURCE_BEFORE;
+    if (clipFront) {
+        std::size_t cut = at - SOURCE_BEFORE;
+        while (cut < at && Continues(source[cut]))
+            ++cut;
+        source.remove_prefix(cut);
+        at -= cut;
+    }
+    bool const clipBack = source.size() > MOST_SOURCE;
+    if (clipBack) {
+        std::size_t end = MOST_SOURCE;
+        while (end > 0 && Continues(source[end]))
+            --end;
+        source = source.substr(0, end);
+    }
+    std::size_t const marked = CharactersIn(source.substr(at, diagnostic.place.length));
+    stream << "  " << (clipFront ? CLIPPED : "") << Harmless(source) << (clipBack ? CLIPPED : "")
+           << '\n'
+           << std::string(2 + (clipFront ? sizeof CLIPPED - 1 : 0) +
+                              CharactersIn(source.substr(0, at)),
+                          ' ')
+           << colour << '^' << std::string(marked > 1 ? marked - 1 : 0, '~') << plain << '\n';
+}
+
+void Reporter::ReportJson(Diagnostic const &diagnostic) {
+    {
+        JsonObject object(stream);
+        object.Text("severity", WordOf(diagnostic.severity).text);
+        object.Put(diagnostic.place);
+        object.Text("message", diagnostic.message);
+        if (!diagnostic.name.empty()) {
+            object.Text("finding", diagnostic.name);
+            object.Text("language", diagnostic.language);
+        }
+        auto const list = [&](char const *name, auto const &elements, auto putElement) {
+            object.Name(name) << '[';
+            for (std::size_t i = 0; i < elements.size(); ++i) {
+                stream << (i > 0 ? "," : "");
+                putElement(elements[i]);
+            }
+            stream << ']';
+        };
+        list("hints", diagnostic.hints,
+             [this](std::string const &hint) { stream << JsonString(hint); });
+        list("notes", diagnostic.notes, [this](Diagnostic::Note const &note) {
+            JsonObject place(stream);
+            place.Put(note.place);
+            place.Text("message", note.text);
+        });
+    }
+    stream << '\n';
+}

@@ -1,0 +1,40 @@
+#pragma once
+
+#include <iosfwd>
+#include <string>
+#include <string_view>
+
+#include "tool/diagnostics/Diagnostic.h"
+
+/// How diagnostics are shown.
+struct ReportStyle {
+    enum Format { TEXT, JSON };
+
+    Format format = TEXT;
+    bool colour = false;
+};
+
+/// Shows diagnostics, as text for people and their editors or as one JSON object a line, and counts
+/// them.
+class Reporter {
+public:
+    /// The stream is not owned.
+    Reporter(std::ostream &output, ReportStyle style);
+
+    void Report(Diagnostic const &diagnostic);
+    unsigned long GetErrorCount() const { return errors; }
+    unsigned long GetWarningCount() const { return warnings; }
+
+private:
+    void ReportText(Diagnostic const &diagnostic);
+    void ReportSource(Diagnostic const &diagnostic, char const *colour, char const *plain);
+    void ReportJson(Diagnostic const &diagnostic);
+
+    std::ostream &stream;
+    ReportStyle reportStyle;
+    unsigned long errors = 0;
+    unsigned long warnings = 0;
+};
+
+/// Text as a JSON string, with its quotes. Bytes that are no UTF-8 become U+FFFD.
+std::string JsonString(std::string_view text);

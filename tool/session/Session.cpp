@@ -1,0 +1,37 @@
+#include "tool/session/Session.h"
+
+#include <cstring>
+
+#include "tool/diagnostics/Blame.h"
+
+using namespace Vesk_Hdl;
+
+namespace {
+
+/// Commands are kept as done until somebody clears them, and the tool never looks back.
+constexpr int MOST_DONE_COMMANDS = 4096;
+
+} // namespace
+
+Session::Session(std::string const &modelName) {
+    engine.CreateAndAddModel(modelName.c_str(), nullptr);
+    engine.UseModel(modelName.c_str());
+    model = engine.GetCurrentModel();
+}
+
+std::optional<Diagnostic> Session::RunLine(std::string const &line, Place const &place) {
+    if (std::size_t const at = line.find('\0'); at != std::string::npos)
+        return BlameNul(line, place, at);
+    int const writesBefore = model->GetLastWrite().number;
+    try {
+        engine.Execute(line.c_str());
+    } catch (Exception const &refusal) {
+        return BlameRefusal(line, place, refusal.getDescription(), *model);
+    }
+    if (model->GetCommandManager()->GetDoneCommandCount() >= MOST_DONE_COMMANDS)
+        model->GetCommandManager()->Clear();
+    WriteStatus const &write = model->GetLastWrite();
+    if (write.number == writesBefore || write.error == 0)
+        return std::nullopt;
+    return BlameWrite(line, place, write);
+}

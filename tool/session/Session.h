@@ -1,0 +1,23 @@
+#pragma once
+
+#include <optional>
+#include <string>
+
+#include "tool/diagnostics/Diagnostic.h"
+#include "vesk_hdl/Vesk_Hdl.h"
+
+/// One design, and the running of lines on it.
+class Session {
+public:
+    explicit Session(std::string const &modelName);
+
+    /// Runs a line. Tells what is wrong if it was refused, or if a file that it writes did not
+    /// reach the disk whole; the place comes back with the column of the token that is to blame.
+    std::optional<Diagnostic> RunLine(std::string const &line, Place const &place);
+
+    Vesk_Hdl::Model &GetModel() { return *model; }
+
+private:
+    Vesk_Hdl::Engine engine;
+    Vesk_Hdl::Model *model; ///< the engine's current one
+};

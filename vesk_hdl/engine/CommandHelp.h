@@ -1,0 +1,26 @@
+#pragma once
+
+#include "vesk_hdl/Api.h"
+
+namespace Vesk_Hdl {
+
+/// What a user of the command language is told of one command. All texts last as long as the
+/// library and are never null.
+struct CommandHelp {
+    char const *keyword; ///< as registered; matches in any case
+    /// What follows the keyword: words to be replaced, `[` `]` around what may be missing, `|`
+    /// between alternatives, `...` for words up to the end of the line.
+    char const *grammar;
+};
+
+/// The commands of the library, in the order of their registration.
+class VESK_HDL_API CommandReference {
+public:
+    static int GetCount();
+    /// Null for an index outside of 0 to GetCount() - 1.
+    static CommandHelp const *GetAt(int index);
+    /// By keyword in any case, its words separated by single blanks; null if there is none.
+    static CommandHelp const *Find(char const *keyword);
+};
+
+} // namespace Vesk_Hdl

@@ -11,35 +11,22 @@
 
 namespace {
 
-constexpr int USAGE_ERROR = 2;
-
 int ParseAndRun(int argc, char **argv) {
     CLI::App app("Turns files of design-entry commands into structural VHDL and Verilog.",
                  "vesk-hdl");
     app.set_version_flag("--version",
                          std::string("vesk-hdl ") + Vesk_Hdl::HdlUtilities::GetVersion().GetText());
     app.require_subcommand(1);
-    app.footer("Exit codes: 0 all lines ran; 1 a line was refused, a file could not be read or an "
+    app.footer("Exit codes: 0 all went well; 1 a line was refused, a file could not be read or an "
                "output\ncould not be written; 2 the command line is wrong.");
-
-    RunOptions options;
-    CLI::App *const run = app.add_subcommand("run", "Run the lines of command files on one design");
-    run->add_option("FILE", options.files, "Command files, in order; '-' is standard input")
-        ->required();
-    run->add_option("--model", options.modelName, "Name of the design")->capture_default_str();
-    run->add_option("--output-dir", options.outputDir,
-                    "Folder that relative names in WRITE lines are taken from")
-        ->check(CLI::ExistingDirectory)
-        ->default_str(".");
-    run->add_flag("--keep-going", options.keepGoing,
-                  "Go on after a refused line; the exit code still tells of it");
-
+    Action action;
+    AddRunCommand(app, action);
     try {
         app.parse(argc, argv);
     } catch (CLI::ParseError const &error) {
-        return app.exit(error) == 0 ? 0 : USAGE_ERROR;
+        return app.exit(error) == 0 ? ALL_WELL : USAGE_ERROR;
     }
-    return Run(options);
+    return action();
 }
 
 } // namespace
@@ -52,5 +39,5 @@ int main(int argc, char **argv) {
     } catch (...) {
         std::fputs("vesk-hdl: error: unknown failure\n", stderr);
     }
-    return 1;
+    return SOMETHING_REFUSED;
 }

@@ -1,19 +1,6 @@
 #pragma once
 
-#include <string>
-#include <vector>
+#include "tool/commands/Common.h"
 
-#include "tool/diagnostics/Reporter.h"
-
-/// What `vesk-hdl run` was asked for.
-struct RunOptions {
-    std::vector<std::string> files; ///< in order; "-" is standard input
-    std::string modelName = "hdlNetlist";
-    std::string outputDir; ///< empty for the current folder
-    bool keepGoing = false;
-    ReportStyle report;
-};
-
-/// Runs the lines of the files on one model. Tells each refused line, unreadable file and failed
-/// write on standard error. The exit code: 0 if all went well, otherwise 1.
-int Run(RunOptions const &options);
+/// `run`: the lines of command files, on one design.
+void AddRunCommand(CLI::App &app, Action &action);

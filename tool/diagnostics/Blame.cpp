@@ -1,6 +1,7 @@
 #include "tool/diagnostics/Blame.h"
 
 #include <algorithm>
+#include <cerrno>
 #include <cstring>
 #include <functional>
 #include <numeric>
@@ -86,6 +87,8 @@ public:
             BlameArguments();
         else
             BlameName();
+        if (diagnostic.source.find('\t') != std::string::npos)
+            Hint("words are separated by blanks: a tab is a letter like any other");
         return std::move(diagnostic);
     }
 
@@ -118,6 +121,7 @@ private:
     void Hint(std::string text) { diagnostic.hints.push_back(std::move(text)); }
 
     void BlameKeyword();
+    std::string WordsBehindLine() const;
     void BlameArguments();
     void BlameName();
     bool BlameOption(WordOption const &option);
@@ -160,6 +164,22 @@ int Distance(std::string_view left, std::string_view right) {
     return row[width - 1];
 }
 
+/// The words with which keywords go on where the line ends; empty if there are none.
+std::string Refusal::WordsBehindLine() const {
+    std::string const begin = std::string(tokens.GetTokens().Concatenate(" ").View()) + " ";
+    std::vector<std::string_view> words;
+    for (int i = 0; i < CommandReference::GetCount(); ++i) {
+        std::string_view rest = CommandReference::GetAt(i)->keyword;
+        if (!SameIgnoringCase(rest.substr(0, begin.size()), begin))
+            continue;
+        rest.remove_prefix(begin.size());
+        rest = rest.substr(0, rest.find(' '));
+        if (std::find(words.begin(), words.end(), rest) == words.end())
+            words.push_back(rest);
+    }
+    return Alternatives(words);
+}
+
 /// The nearest keyword to what the line begins with, if one is near enough to be meant.
 void Refusal::BlameKeyword() {
     constexpr std::size_t LONGEST_WORD = 40; // no word of a keyword comes near it
@@ -178,6 +198,11 @@ void Refusal::BlameKeyword() {
         }
     }
     Mark(0);
+    if (std::string const words = WordsBehindLine(); !words.empty()) {
+        MarkEnd();
+        Hint("the keyword goes on with " + words);
+        return;
+    }
     if (least > static_cast<int>(std::strlen(nearest->keyword)) / 3) {
         Hint("`vesk-hdl commands` lists all keywords");
         return;
@@ -257,30 +282,32 @@ bool Refusal::Fits(Placeholder const &placeholder, std::string_view token) {
 
 /// The first token that does not fit the grammar, or the place where one is missing.
 void Refusal::BlameArguments() {
+    std::vector<Placeholder> const grammar = Grammar();
+    auto required =
+        std::count_if(grammar.begin(), grammar.end(),
+                      [](Placeholder const &placeholder) { return !placeholder.optional; });
     int token = keywordWords;
-    bool found = false;
-    for (Placeholder const &placeholder : Grammar()) {
-        if (placeholder.optional && placeholder.word == "-TYPE=type") {
-            if (IsOption(tokens.At(token), TYPE))
-                ++token;
-            continue;
+    Mark(std::min(keywordWords, tokens.GetSize() - 1));
+    for (Placeholder const &placeholder : grammar) {
+        if (placeholder.optional) {
+            bool const given = placeholder.word == "-TYPE=type"
+                                   ? IsOption(tokens.At(token), TYPE)
+                                   : tokens.GetSize() - token > required;
+            if (!given)
+                continue;
+        } else {
+            --required;
         }
         if (token >= tokens.GetSize()) {
-            if (placeholder.optional)
-                break;
             MarkEnd();
-            found = true;
             break;
         }
         if (!Fits(placeholder, tokens.At(token))) {
             Mark(token);
-            found = true;
             break;
         }
         ++token;
     }
-    if (!found)
-        Mark(std::min(keywordWords, tokens.GetSize() - 1));
     Hint("the grammar is " + std::string(command->keyword) + (*command->grammar ? " " : "") +
          command->grammar);
 }
@@ -447,7 +474,9 @@ Diagnostic BlameWrite(std::string const &line, Place const &place, WriteStatus c
     LineTokens const tokens(line);
     Diagnostic diagnostic = At(line, place);
     std::string const file(write.fileName.View());
-    diagnostic.message = "cannot write " + file + ": " + std::strerror(write.error);
+    diagnostic.message = "cannot write " + file + ": " +
+                         (write.error == EXDEV ? "it lies outside the folder that --restrict names"
+                                               : std::strerror(write.error));
     for (int token = 2; token < tokens.GetSize(); ++token)
         if (tokens.At(token) == file) {
             diagnostic.place.column = tokens.GetColumn(token);

@@ -4,6 +4,8 @@
 #include <array>
 #include <ostream>
 
+#include "tool/diagnostics/Format.h"
+
 namespace {
 
 constexpr std::size_t MOST_SOURCE = 160; ///< bytes of a line that are shown around the caret
@@ -28,14 +30,6 @@ Word const &WordOf(Severity severity) {
 
 bool IsControl(char c) { return static_cast<unsigned char>(c) < ' ' || c == '\x7f'; }
 bool Continues(char c) { return (static_cast<unsigned char>(c) & 0xC0) == 0x80; }
-
-/// Text of a file as a terminal may see it: nothing in it moves the cursor.
-std::string Harmless(std::string_view text) {
-    std::string shown(text);
-    std::replace(shown.begin(), shown.end(), '\t', ' ');
-    std::replace_if(shown.begin(), shown.end(), IsControl, '?');
-    return shown;
-}
 
 /// How many characters of UTF-8 a text has.
 std::size_t CharactersIn(std::string_view text) {
@@ -135,6 +129,8 @@ void Reporter::ReportText(Diagnostic const &diagnostic) {
     if (!diagnostic.name.empty())
         stream << " [" << diagnostic.name << ", " << diagnostic.language << ']';
     stream << '\n';
+    if (reportStyle.brief)
+        return;
     ReportSource(diagnostic, colour(GREEN), colour(PLAIN));
     for (std::string const &hint : diagnostic.hints)
         stream << "  " << colour(HINT_WORD.colour) << HINT_WORD.text << ": " << colour(PLAIN)
@@ -203,4 +199,19 @@ void Reporter::ReportJson(Diagnostic const &diagnostic) {
         });
     }
     stream << '\n';
+}
+
+void Reporter::ReportCount() {
+    if (reportStyle.format == ReportStyle::JSON) {
+        JsonObject object(stream);
+        object.Text("severity", "count");
+        object.Name("errors") << errors;
+        object.Name("warnings") << warnings;
+    } else {
+        auto const plural = [](unsigned long count) { return count == 1 ? "" : "s"; };
+        stream << errors << " error" << plural(errors);
+        if (warnings > 0)
+            stream << ", " << warnings << " warning" << plural(warnings);
+    }
+    stream << std::endl;
 }

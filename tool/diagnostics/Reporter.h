@@ -12,6 +12,7 @@ struct ReportStyle {
 
     Format format = TEXT;
     bool colour = false;
+    bool brief = false; ///< a line each, without source, hints and notes
 };
 
 /// Shows diagnostics, as text for people and their editors or as one JSON object a line, and counts
@@ -22,6 +23,8 @@ public:
     Reporter(std::ostream &output, ReportStyle style);
 
     void Report(Diagnostic const &diagnostic);
+    /// How many there were, on a line of its own.
+    void ReportCount();
     unsigned long GetErrorCount() const { return errors; }
     unsigned long GetWarningCount() const { return warnings; }
 

@@ -35,3 +35,11 @@ std::optional<Diagnostic> Session::RunLine(std::string const &line, Place const 
         return std::nullopt;
     return BlameWrite(line, place, write);
 }
+
+int Session::Write(char const *language, std::string const &file) {
+    StringArray tokens;
+    for (char const *const token : {"WRITE", language, file.c_str()})
+        tokens.Add(token);
+    model->Execute(tokens);
+    return model->GetLastWrite().error;
+}

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cerrno>
+#include <climits>
 #include <cstring>
 #include <functional>
 #include <numeric>
@@ -183,8 +184,8 @@ std::string Refusal::WordsBehindLine() const {
 /// The nearest keyword to what the line begins with, if one is near enough to be meant.
 void Refusal::BlameKeyword() {
     constexpr std::size_t LONGEST_WORD = 40; // no word of a keyword comes near it
-    CommandHelp const *nearest = nullptr;
-    int least = 0;
+    CommandHelp const *nearest = CommandReference::GetAt(0);
+    int least = INT_MAX;
     for (int i = 0; i < CommandReference::GetCount(); ++i) {
         CommandHelp const &candidate = *CommandReference::GetAt(i);
         std::vector<std::string> const words = WordsOf(candidate.keyword);
@@ -192,7 +193,7 @@ void Refusal::BlameKeyword() {
         for (int word = 0; word < static_cast<int>(words.size()) && word < tokens.GetSize(); ++word)
             (begin += word > 0 ? " " : "") += tokens.At(word).substr(0, LONGEST_WORD);
         int const distance = Distance(begin, candidate.keyword);
-        if (!nearest || distance < least) {
+        if (distance < least) {
             nearest = &candidate;
             least = distance;
         }

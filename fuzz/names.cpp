@@ -1,0 +1,137 @@
+// The forms of names: all parsers against each other and against readings by regular expression.
+
+#include <climits>
+#include <regex>
+#include <vector>
+
+#include "fuzz/Fuzz.h"
+#include "vesk_hdl/Vesk_Hdl.h"
+
+using namespace Vesk_Hdl;
+using Text = Basis::StringBase<char>;
+
+namespace {
+
+constexpr std::size_t LONGEST = 300; // std::regex recurses for each character
+constexpr int MOST_BITS = 500;       // of a bus that is written down bit by bit
+
+std::regex const BASE("[A-Za-z'_][A-Za-z0-9_]*");
+std::regex const INTEGER("[+-]?[0-9]+");
+std::regex const BUS("([A-Za-z'_][A-Za-z0-9_]*)\\(([+-]?[0-9]+):([+-]?[0-9]+)\\)");
+std::regex const INDEX("([A-Za-z'_][A-Za-z0-9_]*)\\(([+-]?[0-9]+)\\)");
+
+bool Matches(std::string const &text, std::regex const &form) {
+    return std::regex_match(text, form);
+}
+
+std::vector<std::string> Members(std::string const &name) {
+    std::vector<std::string> members(1);
+    for (char const c : name)
+        if (c == ',' || c == '\\')
+            members.emplace_back();
+        else
+            members.back() += c;
+    std::erase(members, "");
+    return members;
+}
+
+std::string Normal(std::string name) {
+    for (char &c : name)
+        c = std::string_view("[{<").find(c) != std::string_view::npos   ? '('
+            : std::string_view("]}>").find(c) != std::string_view::npos ? ')'
+            : c == '-'                                                  ? ':'
+                                                                        : c;
+    return name;
+}
+
+/// Bits by position, written down one by one.
+void CheckBits(Text const &name, std::string const &base, int left, int right) {
+    long long const width = std::abs(static_cast<long long>(left) - right) + 1;
+    Bus const bus(name);
+    int const told = bus.GetWidth();
+    FUZZ_EXPECT(told == std::min<long long>(width, INT_MAX), "width %d", told);
+    FUZZ_EXPECT(bus.IsDownTo() == (left > right), "down");
+    if (width > MOST_BITS)
+        return;
+    StringArray bits;
+    FUZZ_EXPECT(Bus::ParseBusName(name, bits) && bits.GetSize() == width, "%d", bits.GetSize());
+    for (int i = 0; i < told; ++i) {
+        std::string const index = std::to_string(left > right ? left - i : left + i);
+        FUZZ_EXPECT(bits.At(i).View() == base + "(" + index + ")", "bit %d", i);
+        FUZZ_EXPECT(Bus::GetBusSliceName(name, i, 1) == bits.At(i), "slice %d", i);
+        Text const rest = Bus::GetBusSliceName(name, i, told - i);
+        std::string const last = std::to_string(right);
+        FUZZ_EXPECT(rest.View() == (told - i < 2 ? base + "(" + index + ")"
+                                                 : base + "(" + index + ":" + last + ")"),
+                    "rest %d", i);
+    }
+    FUZZ_EXPECT(Bus::GetBusSliceName(name, 1, told).IsEmpty(), "beyond");
+}
+
+void CheckBus(std::string const &text, Text const &name) {
+    Text base("was");
+    Text left;
+    Text right;
+    int leftBound = 77;
+    int rightBound = 77;
+    bool const isBus = Bus::ParseBusName(name, base, left, right);
+    FUZZ_EXPECT(isBus == Bus::ParseBusName(name, base, leftBound, rightBound), "overloads");
+    std::smatch parts;
+    bool const matches = std::regex_match(text, parts, BUS);
+    // The first marks decide in one test, the walk over tokens in the other: they may differ, but
+    // never on a text of the plain form.
+    if (matches) {
+        FUZZ_EXPECT(Bus::IsBusName(name) && isBus, "a bus");
+        FUZZ_EXPECT(base.View() == parts[1].str() && left.View() == parts[2].str() &&
+                        right.View() == parts[3].str(),
+                    "parts");
+        FUZZ_EXPECT(!BusIndex::IsBusIndexName(name), "both forms");
+        bool const staysSo = text.find('-') == std::string::npos; // in the name of an object
+        if (staysSo && left.GetLength() < 9 && right.GetLength() < 9)
+            CheckBits(name, base.GetText(), leftBound, rightBound);
+    } else {
+        FUZZ_EXPECT(!Bus::IsBusName(name), "no bus");
+        if (!isBus)
+            FUZZ_EXPECT(base.View() == "was" && leftBound == 77, "outputs");
+    }
+}
+
+} // namespace
+
+int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
+    std::string const raw = TextOf(data, std::min(size, LONGEST));
+    Text normalized(raw.c_str());
+    Object::NormalizeName(normalized);
+    FUZZ_EXPECT(normalized.View() == Normal(raw), "rewriting");
+
+    for (std::string const &text : {raw, Normal(raw)}) {
+        Text const name(text.c_str());
+        FUZZ_EXPECT(Object::IsValidBaseName(name) == Matches(text, BASE), "base");
+        FUZZ_EXPECT(Object::IsValidIntegerString(name) == Matches(text, INTEGER), "integer");
+        CheckBus(text, name);
+        if (Matches(text, INDEX))
+            FUZZ_EXPECT(BusIndex::IsBusIndexName(name), "an index");
+
+        std::vector<std::string> const members = Members(text);
+        bool compound = members.size() > 1;
+        for (std::string const &member : members)
+            compound &= Matches(member, BASE) || Bus::IsBusName(Text(member.c_str())) ||
+                        BusIndex::IsBusIndexName(Text(member.c_str()));
+        FUZZ_EXPECT(CompoundBus::IsCompoundBusName(name) == compound, "compound");
+        StringArray told;
+        CompoundBus::ParseCompoundBusName(name, told, false);
+        FUZZ_EXPECT(static_cast<std::size_t>(told.GetSize()) == (compound ? members.size() : 0),
+                    "members");
+        for (int i = 0; i < told.GetSize(); ++i)
+            FUZZ_EXPECT(told.At(i).View() == members[static_cast<std::size_t>(i)], "member %d", i);
+    }
+
+    std::string const normal = Normal(raw);
+    std::size_t const open = normal.find('(');
+    bool const hasBase = open != std::string::npos && normal.find(')') != std::string::npos &&
+                         normal.find(',') == std::string::npos;
+    FUZZ_EXPECT(Object::GetBaseName(raw.c_str()).View() ==
+                    (hasBase ? normal.substr(0, open) : normal),
+                "base of %s", raw.c_str());
+    return 0;
+}

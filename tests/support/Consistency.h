@@ -1,0 +1,16 @@
+#pragma once
+
+#include <string>
+
+#include "vesk_hdl/Vesk_Hdl.h"
+
+/// Walks over everything that hangs together in a netlist and tells the first thing that is not as
+/// it must be between two commands; "" if all is well. Under an address sanitizer the walk also
+/// finds each pointer that outlived its object.
+///
+/// - A name finds an object of that name, whatever its case; the object is one of the array's.
+/// - The signal of a pin lists the pin, unless they were joined one way: the signal has a constant,
+///   or a write made it for an open pin or took a dummy that had pins already.
+/// - A bus lists its slices and bits, and each of the netlist's is listed by the bus of its name.
+/// - No list holds null or the same pin twice.
+std::string Inconsistency(Vesk_Hdl::Netlist const &netlist);

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <atomic>
+#include <deque>
 #include <string>
 #include <utility>
 #include <vector>
@@ -34,8 +35,15 @@ VESK_HDL_COMMANDS(KEYWORD_OF)
 #undef KEYWORD_OF
 
 struct CommandFactory::Record {
-    IStringPtrMap<CommandCreator> creators; ///< by the keyword with single blanks
-    std::size_t longestKeyword = 0;         ///< in characters
+    /// What a line may begin with: a keyword, or a part of one that a blank follows, or both.
+    struct Beginning {
+        CommandCreator creator = nullptr;
+        bool goesOn = false; ///< a blank and more may follow
+    };
+
+    IStringPtrMap<Beginning *> beginnings; ///< by the text with single blanks
+    std::deque<Beginning> memory;
+    std::size_t longestKeyword = 0; ///< in characters
     std::atomic<unsigned int> owners{1};
 };
 
@@ -68,24 +76,42 @@ void CommandFactory::AddCommandCreator(char const *keyword, CommandCreator creat
 
 void CommandFactory::AddCommandCreator(StringArray const &words, CommandCreator creator) {
     StringBase<char> const key = words.Concatenate(" ");
-    record->creators.Add(key, creator);
+    auto const begin = [this](std::string_view text) -> Record::Beginning & {
+        if (Record::Beginning *const known = record->beginnings.Get(text))
+            return *known;
+        Record::Beginning &made = record->memory.emplace_back();
+        record->beginnings.Add(StringBase<char>(text), &made);
+        return made;
+    };
+    std::string_view const text = key.View();
+    for (std::size_t blank = text.find(' '); blank != text.npos; blank = text.find(' ', blank + 1))
+        begin(text.substr(0, blank)).goesOn = true;
+    begin(text).creator = creator;
     record->longestKeyword = std::max<std::size_t>(record->longestKeyword, key.GetLength());
 }
 
-/// Every beginning of the line is looked up and the last hit wins. The walk ends where the text
-/// is longer than any keyword, for nothing longer can match.
+/// Every beginning of the line is looked up and the last hit wins. The walk ends where no keyword
+/// goes on as the line does, for nothing longer can match.
 CommandCreator CommandFactory::GetCommandCreator(StringArray const &tokens) const {
-    std::string key;
-    key.reserve(record->longestKeyword);
+    char room[64];
+    std::unique_ptr<char[]> const largeRoom(
+        record->longestKeyword > sizeof room ? new char[record->longestKeyword] : nullptr);
+    char *const key = largeRoom ? largeRoom.get() : room;
+    std::size_t size = 0;
     CommandCreator found = nullptr;
     for (int i = 0; i < tokens.GetSize(); ++i) {
         std::string_view const token = tokens.At(i).View();
-        std::size_t const blank = i > 0 ? 1 : 0;
-        if (key.size() + blank + token.size() > record->longestKeyword)
+        if (size + (i > 0 ? 1 : 0) + token.size() > record->longestKeyword)
             break;
-        key.append(blank, ' ').append(token);
-        if (CommandCreator const creator = record->creators.Get(std::string_view(key)))
-            found = creator;
+        if (i > 0)
+            key[size++] = ' ';
+        size += token.copy(key + size, token.size());
+        Record::Beginning const *const beginning =
+            record->beginnings.Get(std::string_view(key, size));
+        if (beginning && beginning->creator)
+            found = beginning->creator;
+        if (!beginning || !beginning->goesOn)
+            break;
     }
     return found;
 }

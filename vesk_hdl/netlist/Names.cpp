@@ -1,5 +1,6 @@
 #include "vesk_hdl/netlist/Names.h"
 
+#include <array>
 #include <charconv>
 #include <climits>
 #include <limits>
@@ -17,6 +18,14 @@ using namespace Basis::Ascii;
 namespace {
 
 constexpr std::string_view::size_type NPOS = std::string_view::npos;
+
+constexpr std::array<bool, 256> MarkRewritten() {
+    std::array<bool, 256> marks = {};
+    for (unsigned char const c : {'[', ']', '{', '}', '<', '>', '-'})
+        marks[c] = true;
+    return marks;
+}
+constexpr std::array<bool, 256> IS_REWRITTEN = MarkRewritten();
 
 bool IsMember(std::string_view token) {
     std::string_view base;
@@ -141,20 +150,10 @@ StringBase<char> BitName(std::string_view base, int index) {
 }
 
 bool IsNormal(std::string_view name) {
+    bool isNormal = true;
     for (char const c : name)
-        switch (c) {
-        case '[':
-        case ']':
-        case '{':
-        case '}':
-        case '<':
-        case '>':
-        case '-':
-            return false;
-        default:
-            break;
-        }
-    return true;
+        isNormal &= !IS_REWRITTEN[static_cast<unsigned char>(c)];
+    return isNormal;
 }
 
 void Normalize(StringBase<char> &name) {

@@ -8,6 +8,7 @@
 #include <unordered_map>
 #include <vector>
 
+#include "vesk_hdl/netlist/As.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/NetlistRecord.h"
 #include "vesk_hdl/text/basis/Ascii.h"
@@ -24,7 +25,7 @@ class ScalarMembers {
 public:
     explicit ScalarMembers(PtrArray<Signal *> const &signals) {
         ForEach(signals, [this](Signal *signal) {
-            auto *const compound = dynamic_cast<CompoundBus *>(signal);
+            auto *const compound = As<CompoundBus>(signal);
             for (int i = 0; compound && i < compound->GetSize(); ++i)
                 if (dynamic_cast<ScalarSignal *>(compound->GetAt(i)))
                     places[Fold(compound->GetAt(i)->GetNameRef())].push_back({compound, i});
@@ -142,7 +143,7 @@ void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
             addDummy(dummy, old);
             link(old, dummy);
             scalarMembers.Replace(name, dummy);
-        } else if (Bus *const oldBus = FindBus(Object::GetBaseName(name).View())) {
+        } else if (Bus *const oldBus = FindBus(Names::Key(Object::GetBaseName(name).View()))) {
             Bus *const dummy = oldBus->CreateDummySignal();
             addDummy(dummy, oldBus);
             link(oldBus, dummy);

@@ -2,6 +2,7 @@
 
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/ObjectRecord.h"
+#include "vesk_hdl/text/basis/Counting.h"
 #include "vesk_hdl/text/basis/Functions.h"
 
 namespace Vesk_Hdl {
@@ -11,14 +12,13 @@ using Basis::StringBase;
 Object::Object() : record(new Record) {}
 
 Object::Object(Object const &other) : record(other.record) {
-    record->owners.fetch_add(1, std::memory_order_relaxed);
+    Basis::Counting::Join(record->owners);
 }
 
 Object::~Object() { Release(); }
 
 void Object::Release() {
-    if (record->owners.load(std::memory_order_acquire) == 1 ||
-        record->owners.fetch_sub(1, std::memory_order_acq_rel) == 1)
+    if (Basis::Counting::Leave(record->owners))
         delete record;
 }
 
@@ -50,7 +50,7 @@ Object &Object::operator=(Object const &other) {
 
 /// Takes over everything.
 void Object::Share(Object const &other) {
-    other.record->owners.fetch_add(1, std::memory_order_relaxed);
+    Basis::Counting::Join(other.record->owners);
     Release();
     record = other.record;
 }

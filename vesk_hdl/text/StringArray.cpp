@@ -16,6 +16,8 @@ using Basis::ViewOf;
 
 namespace {
 
+constexpr std::size_t NPOS = std::string_view::npos;
+
 /// The quoted way of StringArray::Parse: one walk over the text, a character at a time.
 class QuotedParser {
 public:
@@ -91,6 +93,21 @@ private:
     int count = 0;
 };
 
+/// Whether the text holds one of a few characters.
+bool HoldsOneOf(std::string_view text, std::string_view characters) {
+    for (std::size_t i = 0; i < characters.size(); ++i)
+        if (characters.find(characters[i]) == i && text.find(characters[i]) != NPOS)
+            return true;
+    return false;
+}
+
+/// The plain way of StringArray::Parse.
+template <class Act>
+void ForEachToken(std::string_view text, std::string_view separators, bool skipEmpty, Act act) {
+    for (Basis_Range range = {1, 0}; Basis::NextToken(text, range, separators, skipEmpty);)
+        act(Basis::TokenIn(text, range));
+}
+
 } // namespace
 
 /// A slot that nobody assigned reads as the empty string, and that is what it holds.
@@ -156,13 +173,33 @@ int StringArray::Parse(char const *text, char const *separators, bool skipEmpty,
     std::string_view const whole = ViewOf(text);
     std::string_view const set = ViewOf(separators);
     std::string_view const quotes = ViewOf(quotePairs);
-    if (whole.find_first_of(quotes) != std::string_view::npos)
+    if (HoldsOneOf(whole, quotes))
         return QuotedParser(set, skipEmpty, quotes, *this).Parse(whole);
 
     int const before = GetSize();
-    for (Basis_Range range = {1, 0}; Basis::NextToken(whole, range, set, skipEmpty);)
-        record->strings.emplace_back(Basis::TokenIn(whole, range));
+    ForEachToken(whole, set, skipEmpty,
+                 [this](std::string_view token) { record->strings.emplace_back(token); });
     return GetSize() - before;
+}
+
+void StringArray::ParseAnew(char const *text, char const *separators, bool skipEmpty,
+                            char const *quotePairs) {
+    std::string_view const whole = ViewOf(text);
+    if (HoldsOneOf(whole, ViewOf(quotePairs))) {
+        Empty();
+        Parse(text, separators, skipEmpty, quotePairs);
+        return;
+    }
+    std::vector<StringBase<char>> &strings = record->strings;
+    std::size_t count = 0;
+    ForEachToken(whole, ViewOf(separators), skipEmpty, [&](std::string_view token) {
+        if (count == strings.size())
+            strings.emplace_back(token);
+        else if (strings[count].View() != token)
+            strings[count].Assign(token);
+        ++count;
+    });
+    strings.resize(count);
 }
 
 bool StringArray::Contains(StringBase<char> const &string) const {

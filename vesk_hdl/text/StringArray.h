@@ -4,6 +4,8 @@
 
 namespace Vesk_Hdl {
 
+class Model;
+
 /// An ordered, growable array of strings that it owns, and the tokenizer of command lines.
 /// Indexes count from 0. Reading outside gives the empty string, never a failure. Copies are deep.
 class VESK_HDL_API StringArray {
@@ -65,6 +67,13 @@ public:
               void *context);
 
 private:
+    friend class Model;
+
+    /// Empty and Parse in one. A string that the text repeats at its place stays, and the memory of
+    /// the others serves anew: lines of commands mostly begin as the line before.
+    void ParseAnew(char const *text, char const *separators, bool skipEmpty,
+                   char const *quotePairs);
+
     struct Record;
     Record *record;
 };

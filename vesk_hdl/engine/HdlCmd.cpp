@@ -11,8 +11,9 @@
 #include "vesk_hdl/engine/JoinTokens.h"
 #include "vesk_hdl/engine/PinReference.h"
 #include "vesk_hdl/model/HdlModel.h"
-#include "vesk_hdl/text/IStringPtrMap.h"
 #include "vesk_hdl/text/Raise.h"
+#include "vesk_hdl/text/StringTable.h"
+#include "vesk_hdl/text/basis/Ascii.h"
 
 #define RAISE(...) VESK_HDL_RAISE("HdlCmd", __VA_ARGS__)
 
@@ -41,7 +42,7 @@ struct CommandFactory::Record {
         bool goesOn = false; ///< a blank and more may follow
     };
 
-    IStringPtrMap<Beginning *> beginnings; ///< by the text with single blanks
+    StringTable beginnings{StringTable::CASE_IGNORED, 193}; ///< by the text with single blanks
     std::deque<Beginning> memory;
     std::size_t longestKeyword = 0; ///< in characters
     std::atomic<unsigned int> owners{1};
@@ -77,10 +78,11 @@ void CommandFactory::AddCommandCreator(char const *keyword, CommandCreator creat
 void CommandFactory::AddCommandCreator(StringArray const &words, CommandCreator creator) {
     StringBase<char> const key = words.Concatenate(" ");
     auto const begin = [this](std::string_view text) -> Record::Beginning & {
-        if (Record::Beginning *const known = record->beginnings.Get(text))
-            return *known;
+        if (StringTable::Node const *const known = record->beginnings.Find(text))
+            return *static_cast<Record::Beginning *>(known->value);
         Record::Beginning &made = record->memory.emplace_back();
-        record->beginnings.Add(StringBase<char>(text), &made);
+        record->beginnings.GrowForOneMore();
+        record->beginnings.Insert(StringBase<char>(text), &made);
         return made;
     };
     std::string_view const text = key.View();
@@ -98,19 +100,28 @@ CommandCreator CommandFactory::GetCommandCreator(StringArray const &tokens) cons
         record->longestKeyword > sizeof room ? new char[record->longestKeyword] : nullptr);
     char *const key = largeRoom ? largeRoom.get() : room;
     std::size_t size = 0;
+    std::uint32_t hash = StringTable::FIRST_HASH; // of the text so far
     CommandCreator found = nullptr;
     for (int i = 0; i < tokens.GetSize(); ++i) {
         std::string_view const token = tokens.At(i).View();
         if (size + (i > 0 ? 1 : 0) + token.size() > record->longestKeyword)
             break;
+        auto const append = [&](char c) {
+            key[size++] = c;
+            hash = StringTable::AddToHash(hash, Basis::Ascii::ToUpper(c));
+        };
         if (i > 0)
-            key[size++] = ' ';
-        size += token.copy(key + size, token.size());
-        Record::Beginning const *const beginning =
-            record->beginnings.Get(std::string_view(key, size));
-        if (beginning && beginning->creator)
+            append(' ');
+        for (char const c : token)
+            append(c);
+        StringTable::Node const *const node =
+            record->beginnings.Find(std::string_view(key, size), hash);
+        if (!node)
+            break;
+        auto const *const beginning = static_cast<Record::Beginning const *>(node->value);
+        if (beginning->creator)
             found = beginning->creator;
-        if (!beginning || !beginning->goesOn)
+        if (!beginning->goesOn)
             break;
     }
     return found;
@@ -163,10 +174,11 @@ namespace {
 
 /// The index of the point that ends the first part, NOT_FOUND if the text is no pin reference.
 unsigned int FindPoint(StringBase<char> const &text) {
-    Basis_Range range = {1, 0};
-    if (!text.NextTokenRange(range, ".", StringBase<char>::PARSE_SKIPPING_EMPTY))
-        return Basis::NOT_FOUND;
-    return range.last + 2 < text.GetLength() ? range.last + 1 : Basis::NOT_FOUND;
+    std::string_view const whole = text.View();
+    std::size_t const begin = whole.find_first_not_of('.');
+    std::size_t const point = begin == whole.npos ? begin : whole.find('.', begin);
+    return point != whole.npos && point + 1 < whole.size() ? static_cast<unsigned int>(point)
+                                                           : Basis::NOT_FOUND;
 }
 
 } // namespace
@@ -179,8 +191,8 @@ bool SplitPinReference(StringBase<char> const &text, StringBase<char> &left,
     unsigned int const point = FindPoint(whole);
     if (point == Basis::NOT_FOUND)
         return false;
-    left = whole.Extract({0, point - 1});
-    right = whole.Extract({point + 1, whole.GetLength() - 1});
+    left = StringBase<char>(whole.View().substr(0, point));
+    right = StringBase<char>(whole.View().substr(point + 1));
     return true;
 }
 

@@ -99,7 +99,7 @@ void Object::SetNameText(StringBase<char> const &name) { Own().name = name; }
 void Object::SetNormalizedName(char const *name) {
     StringBase<char> text(name);
     Names::Normalize(text);
-    SetNameText(text);
+    Own().name = std::move(text);
 }
 
 ObjectVisitor::~ObjectVisitor() = default;

@@ -11,12 +11,11 @@
 
 namespace Vesk_Hdl {
 
+using Basis::OrEmpty;
 using Basis::StringBase;
 using Basis::ViewOf;
 
 namespace {
-
-constexpr std::size_t NPOS = std::string_view::npos;
 
 /// The quoted way of StringArray::Parse: one walk over the text, a character at a time.
 class QuotedParser {
@@ -93,20 +92,48 @@ private:
     int count = 0;
 };
 
-/// Whether the text holds one of a few characters.
-bool HoldsOneOf(std::string_view text, std::string_view characters) {
-    for (std::size_t i = 0; i < characters.size(); ++i)
-        if (characters.find(characters[i]) == i && text.find(characters[i]) != NPOS)
-            return true;
-    return false;
-}
+/// The plain way of StringArray::Parse, where empty tokens do not count and no quote stands in the
+/// text: the tokens are the runs of characters that are no separators.
+class PlainText {
+public:
+    PlainText(char const *plain, std::string_view separators, std::string_view quotes)
+        : text(plain) {
+        for (char const c : separators)
+            KindOf(c) |= SEPARATOR;
+        for (char const c : quotes)
+            KindOf(c) |= QUOTE;
+        KindOf('\0') = END;
+    }
 
-/// The plain way of StringArray::Parse.
-template <class Act>
-void ForEachToken(std::string_view text, std::string_view separators, bool skipEmpty, Act act) {
-    for (Basis_Range range = {1, 0}; Basis::NextToken(text, range, separators, skipEmpty);)
-        act(Basis::TokenIn(text, range));
-}
+    bool HoldsQuote() {
+        unsigned char met = 0;
+        for (char const *at = text; !(met & END); ++at)
+            met |= KindOf(*at);
+        return met & QUOTE;
+    }
+
+    template <class Act> void ForEachToken(Act act) {
+        char const *at = text;
+        for (;;) {
+            while (KindOf(*at) == SEPARATOR)
+                ++at;
+            if (KindOf(*at) == END)
+                return;
+            char const *const begin = at;
+            while (KindOf(*at) == PLAIN)
+                ++at;
+            act(std::string_view(begin, static_cast<std::size_t>(at - begin)));
+        }
+    }
+
+private:
+    enum Kind : unsigned char { PLAIN = 0, SEPARATOR = 1, QUOTE = 2, END = 4 };
+
+    unsigned char &KindOf(char c) { return kinds[static_cast<unsigned char>(c)]; }
+
+    char const *text;
+    unsigned char kinds[256] = {};
+};
 
 } // namespace
 
@@ -170,36 +197,42 @@ void StringArray::Empty() { record->strings.clear(); }
 
 int StringArray::Parse(char const *text, char const *separators, bool skipEmpty,
                        char const *quotePairs) {
-    std::string_view const whole = ViewOf(text);
     std::string_view const set = ViewOf(separators);
     std::string_view const quotes = ViewOf(quotePairs);
-    if (HoldsOneOf(whole, quotes))
-        return QuotedParser(set, skipEmpty, quotes, *this).Parse(whole);
+    PlainText plain(OrEmpty(text), set, quotes);
+    if (plain.HoldsQuote())
+        return QuotedParser(set, skipEmpty, quotes, *this).Parse(ViewOf(text));
 
     int const before = GetSize();
-    ForEachToken(whole, set, skipEmpty,
-                 [this](std::string_view token) { record->strings.emplace_back(token); });
+    auto const add = [this](std::string_view token) { record->strings.emplace_back(token); };
+    if (skipEmpty) {
+        plain.ForEachToken(add);
+    } else {
+        std::string_view const whole = ViewOf(text);
+        for (Basis_Range range = {1, 0}; Basis::NextToken(whole, range, set, false);)
+            add(Basis::TokenIn(whole, range));
+    }
     return GetSize() - before;
 }
 
-void StringArray::ParseAnew(char const *text, char const *separators, bool skipEmpty,
-                            char const *quotePairs) {
-    std::string_view const whole = ViewOf(text);
-    if (HoldsOneOf(whole, ViewOf(quotePairs))) {
+void StringArray::ParseAnew(char const *text, char const *separators, char const *quotePairs) {
+    PlainText plain(OrEmpty(text), ViewOf(separators), ViewOf(quotePairs));
+    if (plain.HoldsQuote()) {
         Empty();
-        Parse(text, separators, skipEmpty, quotePairs);
+        Parse(text, separators, true, quotePairs);
         return;
     }
     std::vector<StringBase<char>> &strings = record->strings;
     std::size_t count = 0;
-    ForEachToken(whole, ViewOf(separators), skipEmpty, [&](std::string_view token) {
+    plain.ForEachToken([&](std::string_view token) {
         if (count == strings.size())
             strings.emplace_back(token);
-        else if (strings[count].View() != token)
+        else
             strings[count].Assign(token);
         ++count;
     });
-    strings.resize(count);
+    while (strings.size() > count)
+        strings.pop_back();
 }
 
 bool StringArray::Contains(StringBase<char> const &string) const {

@@ -69,10 +69,9 @@ public:
 private:
     friend class Model;
 
-    /// Empty and Parse in one. A string that the text repeats at its place stays, and the memory of
-    /// the others serves anew: lines of commands mostly begin as the line before.
-    void ParseAnew(char const *text, char const *separators, bool skipEmpty,
-                   char const *quotePairs);
+    /// Empty and Parse, skipping empty tokens, in one: the strings that nobody else holds give
+    /// their memory to the new ones.
+    void ParseAnew(char const *text, char const *separators, char const *quotePairs);
 
     struct Record;
     Record *record;

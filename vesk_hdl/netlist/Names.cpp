@@ -65,6 +65,8 @@ int ToInt(std::string_view integer) {
 }
 
 bool IsBusName(std::string_view name) {
+    if (!name.ends_with(')'))
+        return false;
     std::size_t const open = name.find('(');
     std::size_t const close = name.find(')');
     std::size_t const colon = name.find(':');
@@ -94,6 +96,8 @@ bool SplitBusName(std::string_view name, BusParts &parts) {
 }
 
 bool SplitBusIndexName(std::string_view name, std::string_view &base, std::string_view &index) {
+    if (!name.ends_with(')'))
+        return false; // as the walk would find, for no token can then end in front of a last ")"
     Basis_Range range = {1, 0};
     if (!NextToken(name, range, "(", true))
         return false;

@@ -112,7 +112,7 @@ private:
     void KnowReferrer(Signal *target, Signal *referrer);
 
     void GetWiredOrOutputSignals(StringSet &names);
-    void GetFeedBackSignals(bool outPortToInPin, StringSet &names);
+    void GetFeedBackSignals(StringSet &read, PtrArray<Signal *> &driven);
     void AddDummySignals(bool portTakesDummy, StringSet &names);
     // Lookups with a key that was made once. A bus is found by its base name.
     bool IsNameUsed(Names::Key const &key) const;

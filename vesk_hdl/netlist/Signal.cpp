@@ -2,6 +2,7 @@
 
 #include <limits>
 
+#include "vesk_hdl/netlist/As.h"
 #include "vesk_hdl/netlist/ListIndex.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/Pin.h"
@@ -170,7 +171,7 @@ Iterator<Signal *> Signal::GetSignalIterator() const {
 }
 
 void Signal::GetBaseName(StringSet &names) const {
-    if (auto const *const compound = dynamic_cast<CompoundBus const *>(this)) {
+    if (auto const *const compound = As<CompoundBus>(this)) {
         AddIfAbsent(names, GetNameRef());
         ForEach(compound->GetBusMemberIterator(),
                 [&names](Signal *member) { AddIfAbsent(names, BaseNameOf(*member)); });

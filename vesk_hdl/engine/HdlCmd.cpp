@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <atomic>
+#include <deque>
 #include <string>
 #include <utility>
 #include <vector>
@@ -10,8 +11,9 @@
 #include "vesk_hdl/engine/JoinTokens.h"
 #include "vesk_hdl/engine/PinReference.h"
 #include "vesk_hdl/model/HdlModel.h"
-#include "vesk_hdl/text/IStringPtrMap.h"
 #include "vesk_hdl/text/Raise.h"
+#include "vesk_hdl/text/StringTable.h"
+#include "vesk_hdl/text/basis/Ascii.h"
 
 #define RAISE(...) VESK_HDL_RAISE("HdlCmd", __VA_ARGS__)
 
@@ -34,8 +36,15 @@ VESK_HDL_COMMANDS(KEYWORD_OF)
 #undef KEYWORD_OF
 
 struct CommandFactory::Record {
-    IStringPtrMap<CommandCreator> creators; ///< by the keyword with single blanks
-    std::size_t longestKeyword = 0;         ///< in characters
+    /// What a line may begin with: a keyword, or a part of one that a blank follows, or both.
+    struct Beginning {
+        CommandCreator creator = nullptr;
+        bool goesOn = false; ///< a blank and more may follow
+    };
+
+    StringTable beginnings{StringTable::CASE_IGNORED, 193}; ///< by the text with single blanks
+    std::deque<Beginning> memory;
+    std::size_t longestKeyword = 0; ///< in characters
     std::atomic<unsigned int> owners{1};
 };
 
@@ -68,24 +77,52 @@ void CommandFactory::AddCommandCreator(char const *keyword, CommandCreator creat
 
 void CommandFactory::AddCommandCreator(StringArray const &words, CommandCreator creator) {
     StringBase<char> const key = words.Concatenate(" ");
-    record->creators.Add(key, creator);
+    auto const begin = [this](std::string_view text) -> Record::Beginning & {
+        if (StringTable::Node const *const known = record->beginnings.Find(text))
+            return *static_cast<Record::Beginning *>(known->value);
+        Record::Beginning &made = record->memory.emplace_back();
+        record->beginnings.GrowForOneMore();
+        record->beginnings.Insert(StringBase<char>(text), &made);
+        return made;
+    };
+    std::string_view const text = key.View();
+    for (std::size_t blank = text.find(' '); blank != text.npos; blank = text.find(' ', blank + 1))
+        begin(text.substr(0, blank)).goesOn = true;
+    begin(text).creator = creator;
     record->longestKeyword = std::max<std::size_t>(record->longestKeyword, key.GetLength());
 }
 
-/// Every beginning of the line is looked up and the last hit wins. The walk ends where the text
-/// is longer than any keyword, for nothing longer can match.
+/// Every beginning of the line is looked up and the last hit wins. The walk ends where no keyword
+/// goes on as the line does, for nothing longer can match.
 CommandCreator CommandFactory::GetCommandCreator(StringArray const &tokens) const {
-    std::string key;
-    key.reserve(record->longestKeyword);
+    char room[64];
+    std::unique_ptr<char[]> const largeRoom(
+        record->longestKeyword > sizeof room ? new char[record->longestKeyword] : nullptr);
+    char *const key = largeRoom ? largeRoom.get() : room;
+    std::size_t size = 0;
+    std::uint32_t hash = StringTable::FIRST_HASH; // of the text so far
     CommandCreator found = nullptr;
     for (int i = 0; i < tokens.GetSize(); ++i) {
         std::string_view const token = tokens.At(i).View();
-        std::size_t const blank = i > 0 ? 1 : 0;
-        if (key.size() + blank + token.size() > record->longestKeyword)
+        if (size + (i > 0 ? 1 : 0) + token.size() > record->longestKeyword)
             break;
-        key.append(blank, ' ').append(token);
-        if (CommandCreator const creator = record->creators.Get(std::string_view(key)))
-            found = creator;
+        auto const append = [&](char c) {
+            key[size++] = c;
+            hash = StringTable::AddToHash(hash, Basis::Ascii::ToUpper(c));
+        };
+        if (i > 0)
+            append(' ');
+        for (char const c : token)
+            append(c);
+        StringTable::Node const *const node =
+            record->beginnings.Find(std::string_view(key, size), hash);
+        if (!node)
+            break;
+        auto const *const beginning = static_cast<Record::Beginning const *>(node->value);
+        if (beginning->creator)
+            found = beginning->creator;
+        if (!beginning->goesOn)
+            break;
     }
     return found;
 }
@@ -137,10 +174,11 @@ namespace {
 
 /// The index of the point that ends the first part, NOT_FOUND if the text is no pin reference.
 unsigned int FindPoint(StringBase<char> const &text) {
-    Basis_Range range = {1, 0};
-    if (!text.NextTokenRange(range, ".", StringBase<char>::PARSE_SKIPPING_EMPTY))
-        return Basis::NOT_FOUND;
-    return range.last + 2 < text.GetLength() ? range.last + 1 : Basis::NOT_FOUND;
+    std::string_view const whole = text.View();
+    std::size_t const begin = whole.find_first_not_of('.');
+    std::size_t const point = begin == whole.npos ? begin : whole.find('.', begin);
+    return point != whole.npos && point + 1 < whole.size() ? static_cast<unsigned int>(point)
+                                                           : Basis::NOT_FOUND;
 }
 
 } // namespace
@@ -153,8 +191,8 @@ bool SplitPinReference(StringBase<char> const &text, StringBase<char> &left,
     unsigned int const point = FindPoint(whole);
     if (point == Basis::NOT_FOUND)
         return false;
-    left = whole.Extract({0, point - 1});
-    right = whole.Extract({point + 1, whole.GetLength() - 1});
+    left = StringBase<char>(whole.View().substr(0, point));
+    right = StringBase<char>(whole.View().substr(point + 1));
     return true;
 }
 

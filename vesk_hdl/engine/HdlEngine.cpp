@@ -25,6 +25,7 @@ struct Model::Record {
     HdlOptions options;
     CommandManager commandManager;
     CommandFactory *commandFactory;
+    std::unique_ptr<StringArray> spareTokens;
 };
 
 Model::Model(CommandFactory *factory) : record(std::make_unique<Record>(factory)) {}
@@ -49,7 +50,16 @@ bool Model::Execute(StringArray const &tokens) {
            record->commandManager.CreateAndExecute(tokens, this, record->commandFactory);
 }
 
-bool Model::Execute(char const *line) { return Execute(StringArray(line, " ", true, "\"\"''")); }
+/// The tokens of a line serve for the next one; a line that a command runs meanwhile makes its own.
+bool Model::Execute(char const *line) {
+    std::unique_ptr<StringArray> tokens = std::move(record->spareTokens);
+    if (!tokens)
+        tokens = std::make_unique<StringArray>();
+    tokens->ParseAnew(line, " ", "\"\"''");
+    bool const result = Execute(*tokens);
+    record->spareTokens = std::move(tokens);
+    return result;
+}
 
 /// The stream is never closed here, and need not be: a stream opened for reading holds the text and
 /// no descriptor, so that none piles up, whether the lines run to the end or one of them fails.

@@ -7,7 +7,7 @@
 #include "vesk_hdl/hdl/Translate.h"
 #include "vesk_hdl/hdl/VerilogStatements.h"
 #include "vesk_hdl/netlist/Netlist.h"
-#include "vesk_hdl/text/basis/Functions.h"
+#include "vesk_hdl/text/basis/Ascii.h"
 
 using namespace Vesk_Hdl;
 using Text = Basis::StringBase<char>;
@@ -69,7 +69,8 @@ public:
 
 private:
     static bool IsOpen(Signal const &signal) {
-        return signal.GetNameRef().IsEmpty() || Basis::stricmp(signal.GetNameRef(), "open") == 0;
+        std::string_view const name = signal.GetNameRef().View();
+        return name.empty() || Basis::Ascii::EqualIgnoringCase(name, "open");
     }
 
     void WriteBracketed(Signal const &signal, Text name) {

@@ -11,7 +11,7 @@
 #include "vesk_hdl/model/HdlOptions.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/Netlist.h"
-#include "vesk_hdl/text/basis/Functions.h"
+#include "vesk_hdl/text/basis/Ascii.h"
 
 using namespace Vesk_Hdl;
 using Text = Basis::StringBase<char>;
@@ -34,7 +34,7 @@ public:
     void SetFormal(Text const &name) {
         formal = name;
         formalIsPlain = !Bus::IsBusName(name);
-        if (Names::IsOneBitBus(name.View())) {
+        if (!formalIsPlain && Names::IsOneBitBus(name.View())) {
             formal = OneBit(name);
             formalIsPlain = true;
         }
@@ -52,7 +52,7 @@ public:
         WriteFormal();
         stream << "=>";
         if (IsOpen(name))
-            stream << OrOpen(name);
+            WriteOrOpen(name);
         else
             statements.WriteBus(name);
     }
@@ -72,7 +72,8 @@ public:
     /// A pin on no signal: a scalar or a bus without a name.
     void AssociateBit(Text const &name) {
         BeginAssociation();
-        Put(stream, formal, "=>", OrOpen(name));
+        Put(stream, formal, "=>");
+        WriteOrOpen(name);
     }
 
     void AssociateBus(Text const &name) {
@@ -83,7 +84,7 @@ public:
             WriteFormal();
         stream << "=>";
         if (IsOpen(name))
-            stream << OrOpen(name);
+            WriteOrOpen(name);
         else if (Names::IsOneBitBus(name.View()))
             stream << OneBit(name);
         else
@@ -109,9 +110,14 @@ private:
     }
 
     static bool IsOpen(Text const &name) {
-        return name.IsEmpty() || Basis::stricmp(name, "open") == 0;
+        return name.IsEmpty() || Basis::Ascii::EqualIgnoringCase(name.View(), "open");
     }
-    static Text OrOpen(Text const &name) { return name.IsEmpty() ? Text("open") : name; }
+    void WriteOrOpen(Text const &name) {
+        if (name.IsEmpty())
+            stream << "open";
+        else
+            stream << name;
+    }
 
     /// The name of the bit of a one-bit bus: D(3) for D(3:3).
     static Text OneBit(Text const &name) { return Bus::GetBusSliceName(name, 0, 1); }

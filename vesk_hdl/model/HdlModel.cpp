@@ -1,6 +1,7 @@
 #include "vesk_hdl/model/HdlModel.h"
 
 #include "vesk_hdl/model/Messages.h"
+#include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/Netlist.h"
 #include "vesk_hdl/text/Raise.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
@@ -13,10 +14,7 @@ using Basis::OrEmpty;
 using Basis::StringBase;
 
 /// Names are shared by components, instances and signals; those of pins and attributes are not.
-bool Model::IsNamedUsed(char const *name) {
-    Netlist const &netlist = *GetNetlist();
-    return netlist.GetComponent(name) || netlist.GetInstance(name) || netlist.GetSignal(name);
-}
+bool Model::IsNamedUsed(char const *name) { return GetNetlist()->IsNameUsed(Names::Key(name)); }
 
 bool Model::AddComponent(char const *name) {
     if (!name)
@@ -62,17 +60,14 @@ bool Model::AddSignal(char const *name) {
         RAISE(Messages::INVALID_NAME);
     if (IsNamedUsed(name))
         RAISE(Messages::IDENTIFIER_DEFINED, name);
-    StringBase<char> copy(name);
-    Object::NormalizeName(copy);
+    Names::Key const key(name);
     Netlist &netlist = *GetNetlist();
-    if (Bus::IsBusName(copy)) {
-        if (netlist.GetParentBus(copy))
+    if (Names::IsBusName(key.View())) {
+        if (netlist.GetParentBus(name))
             RAISE(Messages::SIGNAL_DECLARED, name);
-        netlist.Add(new Bus(copy));
+        netlist.Add(new Bus(name));
     } else {
-        if (netlist.GetSignal(copy))
-            RAISE(Messages::SIGNAL_DECLARED, name);
-        netlist.Add(new ScalarSignal(copy));
+        netlist.Add(new ScalarSignal(name));
     }
     SetModifiedFlag(true);
     return true;

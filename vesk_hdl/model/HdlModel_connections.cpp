@@ -62,9 +62,9 @@ namespace Vesk_Hdl {
 /// Null for a bit of an unknown bus: a bit never makes its bus. The forms are tested on the name as
 /// it was typed, so that "a[3]" makes a scalar that is called a(3).
 Signal *Model::GetOrCreateSignal(char const *name, InHand &inHand) {
-    Text const typed(name);
     if (Signal *const signal = GetSignal(name))
         return signal;
+    Text const typed(name);
     if (BusIndex::IsBusIndexName(typed))
         return CreateAndAddBusIndexSignal(name);
     if (Bus::IsBusName(typed))

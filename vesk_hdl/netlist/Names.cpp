@@ -1,5 +1,6 @@
 #include "vesk_hdl/netlist/Names.h"
 
+#include <array>
 #include <charconv>
 #include <climits>
 #include <limits>
@@ -17,6 +18,14 @@ using namespace Basis::Ascii;
 namespace {
 
 constexpr std::string_view::size_type NPOS = std::string_view::npos;
+
+constexpr std::array<bool, 256> MarkRewritten() {
+    std::array<bool, 256> marks = {};
+    for (unsigned char const c : {'[', ']', '{', '}', '<', '>', '-'})
+        marks[c] = true;
+    return marks;
+}
+constexpr std::array<bool, 256> IS_REWRITTEN = MarkRewritten();
 
 bool IsMember(std::string_view token) {
     std::string_view base;
@@ -56,6 +65,8 @@ int ToInt(std::string_view integer) {
 }
 
 bool IsBusName(std::string_view name) {
+    if (!name.ends_with(')'))
+        return false;
     std::size_t const open = name.find('(');
     std::size_t const close = name.find(')');
     std::size_t const colon = name.find(':');
@@ -85,6 +96,8 @@ bool SplitBusName(std::string_view name, BusParts &parts) {
 }
 
 bool SplitBusIndexName(std::string_view name, std::string_view &base, std::string_view &index) {
+    if (!name.ends_with(')'))
+        return false; // as the walk would find, for no token can then end in front of a last ")"
     Basis_Range range = {1, 0};
     if (!NextToken(name, range, "(", true))
         return false;
@@ -141,20 +154,10 @@ StringBase<char> BitName(std::string_view base, int index) {
 }
 
 bool IsNormal(std::string_view name) {
+    bool isNormal = true;
     for (char const c : name)
-        switch (c) {
-        case '[':
-        case ']':
-        case '{':
-        case '}':
-        case '<':
-        case '>':
-        case '-':
-            return false;
-        default:
-            break;
-        }
-    return true;
+        isNormal &= !IS_REWRITTEN[static_cast<unsigned char>(c)];
+    return isNormal;
 }
 
 void Normalize(StringBase<char> &name) {

@@ -2,6 +2,7 @@
 
 #include <string_view>
 
+#include "vesk_hdl/text/StringTable.h"
 #include "vesk_hdl/text/basis/StringBase.h"
 
 /// The grammar of names, in one place and free of all classes. Everything here but the rewriting
@@ -70,8 +71,8 @@ std::string_view BaseName(std::string_view name);
 bool EndsInDummyTag(std::string_view name);
 inline constexpr char const *DUMMY_TAG = "_DUMMY";
 
-/// A name as the maps know it: the text itself if it is normal, else a rewritten copy. Null counts
-/// as empty. Valid as long as this object and the text.
+/// A name as the tables know it: the text itself if it is normal, else a rewritten copy, and its
+/// hash. Null counts as empty. Valid as long as this object and the text.
 class Key {
 public:
     explicit Key(char const *name) : Key(std::string_view(name ? name : "")) {}
@@ -81,14 +82,17 @@ public:
             Normalize(rewritten);
             view = rewritten.View();
         }
+        hash = StringTable::HashIgnoringCase(view);
     }
     Key(Key const &) = delete;
     Key &operator=(Key const &) = delete;
     std::string_view View() const { return view; }
+    std::uint32_t GetHash() const { return hash; }
 
 private:
     Basis::StringBase<char> rewritten;
     std::string_view view;
+    std::uint32_t hash;
 };
 
 } // namespace Vesk_Hdl::Names

@@ -22,40 +22,93 @@ using NaturalHead = std::array<std::uint64_t, 2>;
 NaturalHead HeadOf(char const *name);
 
 /// Sorts objects by polarity, then by name. `polarityOf` gives an object's polarity; objects that
-/// have none sort by name alone when it always gives the same. An array in strictly ascending order
-/// has no other and stays as it is.
-template <class T, class PolarityOf> void SortNaturally(PtrArray<T> &array, PolarityOf polarityOf) {
+/// have none sort by name alone when it always gives the same. Where all names of each polarity
+/// stand in strictly ascending order, the only order there is takes no sort: polarities apart.
+template <class T, class PolarityOf> class NaturalSort {
+public:
+    static void Sort(PtrArray<T> &array, PolarityOf polarityOf) {
+        NaturalSort sort{array, polarityOf};
+        if (sort.GetSize() > 1 && !sort.Part())
+            sort.SortAll();
+    }
+
+private:
     struct Key {
         int polarity;
         char const *name;
         T item;
         NaturalHead head;
     };
-    auto const keyOf = [&polarityOf](T item) {
-        return item ? Key{polarityOf(item).GetValue(), item->GetNameRef(), item, {}}
-                    : Key{Polarity::INVALID, "", item, {}};
-    };
-    auto less = [](Key const &a, Key const &b) {
-        if (a.polarity != b.polarity)
-            return a.polarity < b.polarity;
-        return a.head != b.head ? a.head < b.head : NaturalCompare(a.name, b.name) < 0;
-    };
-    int ascending = 1;
-    while (ascending < array.GetSize() &&
-           less(keyOf(array.GetAt(ascending - 1)), keyOf(array.GetAt(ascending))))
-        ++ascending;
-    if (ascending >= array.GetSize())
-        return;
+    static constexpr int PARTS = 4; ///< INVALID, INPUT, OUTPUT, BIDIRECTIONAL
 
-    std::vector<Key> keys;
-    keys.reserve(static_cast<std::size_t>(array.GetSize()));
-    for (int i = 0; i < array.GetSize(); ++i) {
-        keys.push_back(keyOf(array.GetAt(i)));
-        keys.back().head = HeadOf(keys.back().name);
+    NaturalSort(PtrArray<T> &sorted, PolarityOf &polarity) : array(sorted), polarityOf(polarity) {}
+
+    int GetSize() const { return array.GetSize(); }
+    int PolarityAt(int i) const {
+        T const item = array.GetAt(i);
+        return item ? polarityOf(item).GetValue() : Polarity::INVALID;
     }
-    IntroSort<Key, decltype(less)>::Sort(keys.data(), keys.data() + keys.size(), less);
-    for (int i = 0; i < array.GetSize(); ++i)
-        array.SetAt(i, keys[static_cast<std::size_t>(i)].item);
+    char const *NameAt(int i) const {
+        T const item = array.GetAt(i);
+        return item ? item->GetNameRef().GetText() : "";
+    }
+
+    /// False, and all as it was, unless the names of each polarity ascend.
+    bool Part() {
+        char const *last[PARTS] = {};
+        int count[PARTS] = {};
+        int highest = 0;
+        bool isParted = true;
+        for (int i = 0; i < GetSize(); ++i) {
+            int const part = PolarityAt(i) - Polarity::INVALID;
+            if (part < 0 || part >= PARTS)
+                return false;
+            char const *const name = NameAt(i);
+            if (last[part] && NaturalCompare(last[part], name) >= 0)
+                return false;
+            last[part] = name;
+            ++count[part];
+            isParted = isParted && part >= highest;
+            highest = std::max(highest, part);
+        }
+        if (!isParted)
+            MoveParts(count);
+        return true;
+    }
+
+    void MoveParts(int const (&count)[PARTS]) {
+        int next[PARTS] = {};
+        for (int part = 1; part < PARTS; ++part)
+            next[part] = next[part - 1] + count[part - 1];
+        std::vector<T> parted(static_cast<std::size_t>(GetSize()));
+        for (int i = 0; i < GetSize(); ++i)
+            parted[static_cast<std::size_t>(next[PolarityAt(i) - Polarity::INVALID]++)] =
+                array.GetAt(i);
+        for (int i = 0; i < GetSize(); ++i)
+            array.SetAt(i, parted[static_cast<std::size_t>(i)]);
+    }
+
+    void SortAll() {
+        auto less = [](Key const &a, Key const &b) {
+            if (a.polarity != b.polarity)
+                return a.polarity < b.polarity;
+            return a.head != b.head ? a.head < b.head : NaturalCompare(a.name, b.name) < 0;
+        };
+        std::vector<Key> keys;
+        keys.reserve(static_cast<std::size_t>(GetSize()));
+        for (int i = 0; i < GetSize(); ++i)
+            keys.push_back({PolarityAt(i), NameAt(i), array.GetAt(i), HeadOf(NameAt(i))});
+        IntroSort<Key, decltype(less)>::Sort(keys.data(), keys.data() + keys.size(), less);
+        for (int i = 0; i < GetSize(); ++i)
+            array.SetAt(i, keys[static_cast<std::size_t>(i)].item);
+    }
+
+    PtrArray<T> &array;
+    PolarityOf &polarityOf;
+};
+
+template <class T, class PolarityOf> void SortNaturally(PtrArray<T> &array, PolarityOf polarityOf) {
+    NaturalSort<T, PolarityOf>::Sort(array, polarityOf);
 }
 
 } // namespace Vesk_Hdl

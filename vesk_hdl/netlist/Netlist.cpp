@@ -1,5 +1,6 @@
 #include "vesk_hdl/netlist/Netlist.h"
 
+#include "vesk_hdl/netlist/As.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/NaturalOrder.h"
 #include "vesk_hdl/netlist/NetlistRecord.h"
@@ -15,14 +16,14 @@ namespace {
 int Length(StringBase<char> const &name) { return static_cast<int>(name.GetLength()); }
 
 /// Array first: should the map fail to grow, the object is owned all the same.
-template <class T> void File(OwnPtrArray<T *> &array, IStringPtrMap<T *> &map, T *object) {
+template <class T> void File(OwnPtrArray<T *> &array, NameTable<T> &map, T *object) {
     std::unique_ptr<T> held(object);
     array.Add(object);
     held.release();
     map.Add(object->GetNameRef(), object);
 }
 
-template <class T> void Unfile(OwnPtrArray<T *> &array, IStringPtrMap<T *> &map, T *object) {
+template <class T> void Unfile(OwnPtrArray<T *> &array, NameTable<T> &map, T *object) {
     if (array.GetTail() == object)
         array.RemoveTail();
     else
@@ -37,7 +38,7 @@ template <class Test> int LongestName(Iterator<Signal *> &signals, Test test) {
         Signal const *const signal = signals.Current();
         if (!signal || !test(*signal))
             continue;
-        auto const *const bus = dynamic_cast<Bus const *>(signal);
+        auto const *const bus = As<Bus>(signal);
         longest = std::max(longest, Length(bus ? bus->GetBaseName() : signal->GetNameRef()));
     }
     return longest;
@@ -63,9 +64,9 @@ void Netlist::Add(Signal *signal) {
     if (!signal)
         return;
     File(record->signals, record->signalMap, signal);
-    if (auto const *const bus = dynamic_cast<Bus const *>(signal))
+    if (auto const *const bus = As<Bus>(signal))
         record->busMap.Add(bus->GetBaseName(), signal);
-    else if (auto const *const compound = dynamic_cast<CompoundBus const *>(signal))
+    else if (auto const *const compound = As<CompoundBus>(signal))
         ForEach(compound->GetBusMemberIterator(),
                 [this, signal](Signal *member) { KnowReferrer(member, signal); });
 }
@@ -86,7 +87,7 @@ void Netlist::Remove(Signal *signal) {
     Unfile(record->signals, record->signalMap, signal);
     record->referrers.Forget(signal);
     signal->DisconnectAll();
-    if (auto const *const bus = dynamic_cast<Bus const *>(signal))
+    if (auto const *const bus = As<Bus>(signal))
         record->busMap.Remove(bus->GetBaseName());
     delete signal;
 }
@@ -105,24 +106,31 @@ void Netlist::Remove(Component *component) {
     delete component;
 }
 
-Signal *Netlist::FindSignal(std::string_view name) const { return record->signalMap.Get(name); }
-
-Bus *Netlist::FindBus(std::string_view baseName) const {
-    return static_cast<Bus *>(record->busMap.Get(baseName));
+bool Netlist::IsNameUsed(Names::Key const &key) const {
+    return FindComponent(key) || FindInstance(key) || FindSignal(key);
 }
 
-Signal *Netlist::GetSignal(char const *name) const { return FindSignal(Names::Key(name).View()); }
+Signal *Netlist::FindSignal(Names::Key const &key) const { return record->signalMap.Get(key); }
 
-Instance *Netlist::GetInstance(char const *name) const {
-    return record->instanceMap.Get(Names::Key(name).View());
+Instance *Netlist::FindInstance(Names::Key const &key) const {
+    return record->instanceMap.Get(key);
 }
 
-Component *Netlist::GetComponent(char const *name) const {
-    return record->componentMap.Get(Names::Key(name).View());
+Component *Netlist::FindComponent(Names::Key const &key) const {
+    return record->componentMap.Get(key);
 }
+
+Bus *Netlist::FindBus(Names::Key const &key) const {
+    return static_cast<Bus *>(record->busMap.Get(key));
+}
+
+Signal *Netlist::GetSignal(char const *name) const { return FindSignal(Names::Key(name)); }
+Instance *Netlist::GetInstance(char const *name) const { return FindInstance(Names::Key(name)); }
+Component *Netlist::GetComponent(char const *name) const { return FindComponent(Names::Key(name)); }
 
 Bus *Netlist::GetParentBus(char const *name) const {
-    return FindBus(Names::BaseName(Names::Key(name).View()));
+    Names::Key const whole(name);
+    return FindBus(Names::Key(Names::BaseName(whole.View())));
 }
 
 Iterator<Signal *> Netlist::GetSignalIterator() const {
@@ -191,7 +199,7 @@ void Netlist::KnowReferrer(Signal *target, Signal *referrer) {
 
 void Netlist::ReplaceReferencesIn(Signal *referrer, Signal *former, Signal *now) {
     referrer->ReplaceAssigned(former, now);
-    if (auto *const compound = dynamic_cast<CompoundBus *>(referrer))
+    if (auto *const compound = As<CompoundBus>(referrer))
         for (int i = 0; i < compound->GetSize(); ++i)
             if (compound->GetAt(i) == former)
                 compound->SetAt(i, now);

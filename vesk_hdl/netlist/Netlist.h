@@ -7,6 +7,10 @@
 
 namespace Vesk_Hdl {
 
+namespace Names {
+class Key;
+}
+
 /// A whole design: the owner of its components, instances and signals; its attributes are those of
 /// the module.
 ///
@@ -108,10 +112,14 @@ private:
     void KnowReferrer(Signal *target, Signal *referrer);
 
     void GetWiredOrOutputSignals(StringSet &names);
-    void GetFeedBackSignals(bool outPortToInPin, StringSet &names);
+    void GetFeedBackSignals(StringSet &read, PtrArray<Signal *> &driven);
     void AddDummySignals(bool portTakesDummy, StringSet &names);
-    Signal *FindSignal(std::string_view name) const;
-    Bus *FindBus(std::string_view baseName) const;
+    // Lookups with a key that was made once. A bus is found by its base name.
+    bool IsNameUsed(Names::Key const &key) const;
+    Signal *FindSignal(Names::Key const &key) const;
+    Instance *FindInstance(Names::Key const &key) const;
+    Component *FindComponent(Names::Key const &key) const;
+    Bus *FindBus(Names::Key const &key) const;
     void ReplaceReferences(Signal *former, Signal *now);
     void ReplaceReferencesIn(Signal *referrer, Signal *former, Signal *now);
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "vesk_hdl/netlist/NameTable.h"
 #include "vesk_hdl/netlist/Netlist.h"
 #include "vesk_hdl/netlist/Referrers.h"
 
@@ -12,10 +13,10 @@ struct Netlist::Record {
     OwnPtrArray<Instance *> instances;
     OwnPtrArray<Signal *> widenedSlices; ///< what stands for buses that a wider one replaced
     OwnPtrArray<Signal *> signals;
-    IStringPtrMap<Component *> componentMap;
-    IStringPtrMap<Instance *> instanceMap;
-    IStringPtrMap<Signal *> signalMap; ///< by full name
-    IStringPtrMap<Signal *> busMap;    ///< each Bus by its base name
+    NameTable<Component> componentMap;
+    NameTable<Instance> instanceMap;
+    NameTable<Signal> signalMap; ///< by full name
+    NameTable<Signal> busMap;    ///< each Bus by its base name
     Basis::StringBase<char> sourceFileName;
     Referrers referrers; ///< links and compounds that list a bus
 };

@@ -8,6 +8,7 @@
 #include <unordered_map>
 #include <vector>
 
+#include "vesk_hdl/netlist/As.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/NetlistRecord.h"
 #include "vesk_hdl/text/basis/Ascii.h"
@@ -24,9 +25,9 @@ class ScalarMembers {
 public:
     explicit ScalarMembers(PtrArray<Signal *> const &signals) {
         ForEach(signals, [this](Signal *signal) {
-            auto *const compound = dynamic_cast<CompoundBus *>(signal);
+            auto *const compound = As<CompoundBus>(signal);
             for (int i = 0; compound && i < compound->GetSize(); ++i)
-                if (dynamic_cast<ScalarSignal *>(compound->GetAt(i)))
+                if (As<ScalarSignal>(compound->GetAt(i)))
                     places[Fold(compound->GetAt(i)->GetNameRef())].push_back({compound, i});
         });
     }
@@ -62,25 +63,36 @@ private:
     std::unordered_map<std::string, std::vector<Place>> places;
 };
 
+void AddNames(PtrArray<Signal *> const &signals, StringSet &names) {
+    ForEach(signals, [&names](Signal const *signal) { signal->GetBaseName(names); });
+}
+
 /// The dummy of a slice or index of a bus, on the bus's own dummy; null for any other class.
 Signal *MakeSliceDummy(Signal const *member, Bus *parent) {
-    if (auto const *const slice = dynamic_cast<BusSlice const *>(member))
+    if (auto const *const slice = As<BusSlice>(member))
         return slice->CreateDummySignal(parent);
-    if (auto const *const index = dynamic_cast<BusIndex const *>(member))
+    if (auto const *const index = As<BusIndex>(member))
         return index->CreateDummySignal(parent);
     return nullptr;
 }
 
 } // namespace
 
+/// In ports are looked for together with out ports, and again only if the latter changed anything.
 void Netlist::CreateVhdlDummySignals() {
     // One set for all stages: emptied, it still keeps the names that a stage handled out of the
     // later ones.
     StringSet names;
-    GetFeedBackSignals(true, names);
-    AddDummySignals(true, names);
-    names.Empty();
-    GetFeedBackSignals(false, names);
+    PtrArray<Signal *> driven;
+    GetFeedBackSignals(names, driven);
+    if (!names.IsEmpty()) {
+        AddDummySignals(true, names);
+        names.Empty();
+        driven.Empty(); // the netlist is another one now
+        StringSet ignored;
+        GetFeedBackSignals(ignored, driven);
+    }
+    AddNames(driven, names);
     AddDummySignals(false, names);
     names.Empty();
     GetWiredOrOutputSignals(names);
@@ -89,21 +101,32 @@ void Netlist::CreateVhdlDummySignals() {
 
 void Netlist::CreateVerilogDummySignals() {
     StringSet names;
-    GetFeedBackSignals(false, names);
+    StringSet ignored;
+    PtrArray<Signal *> driven;
+    GetFeedBackSignals(ignored, driven);
+    AddNames(driven, names);
     AddDummySignals(false, names);
 }
 
-/// Collects the out ports that an instance reads, or the in ports that an instance drives.
-void Netlist::GetFeedBackSignals(bool outPortToInPin, StringSet &names) {
-    PtrArray<Pin *> pins;
-    ForEach(record->instances, [&](Instance const *instance) {
-        pins.Empty();
-        if (outPortToInPin)
-            instance->GetOutPortConnectedToInPin(pins);
+/// Collects the names of the out ports that an instance reads, and the in ports that one drives.
+/// It is Instance::GetOutPortConnectedToInPin and GetInPortConnectedToOutPin in one walk.
+void Netlist::GetFeedBackSignals(StringSet &read, PtrArray<Signal *> &driven) {
+    auto const look = [&read, &driven](Pin const *pin) {
+        Signal *const signal = pin->GetSignal();
+        Polarity const port = signal ? signal->GetPortPolarity() : Polarity();
+        if (port != Polarity::OUTPUT && port != Polarity::INPUT)
+            return;
+        Polarity const own = pin->GetPolarity();
+        bool const isRead = port == Polarity::OUTPUT;
+        if (own != Polarity::BIDIRECTIONAL && own != (isRead ? Polarity::INPUT : Polarity::OUTPUT))
+            return;
+        if (isRead)
+            signal->GetBaseName(read);
         else
-            instance->GetInPortConnectedToOutPin(pins);
-        ForEach(pins, [&names](Pin const *pin) { pin->GetSignal()->GetBaseName(names); });
-    });
+            driven.Add(signal);
+    };
+    ForEach(record->instances,
+            [&look](Instance const *instance) { ForEach(instance->GetPinIterator(), look); });
 }
 
 /// Collects the out ports with several drivers.
@@ -137,12 +160,12 @@ void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
     for (StringSetIterator it = names.GetBeginPos(); it != end; ++it) {
         StringBase<char> const name = *it;
         Signal *const found = GetSignal(name);
-        if (auto *const old = dynamic_cast<ScalarSignal *>(found)) {
+        if (auto *const old = As<ScalarSignal>(found)) {
             ScalarSignal *const dummy = old->CreateDummySignal();
             addDummy(dummy, old);
             link(old, dummy);
             scalarMembers.Replace(name, dummy);
-        } else if (Bus *const oldBus = FindBus(Object::GetBaseName(name).View())) {
+        } else if (Bus *const oldBus = FindBus(Names::Key(Object::GetBaseName(name).View()))) {
             Bus *const dummy = oldBus->CreateDummySignal();
             addDummy(dummy, oldBus);
             link(oldBus, dummy);
@@ -151,7 +174,7 @@ void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
                 if (Signal *const part = MakeSliceDummy(member, dummy))
                     addDummy(part, member);
             });
-        } else if (auto *const compound = dynamic_cast<CompoundBus *>(found)) {
+        } else if (auto *const compound = As<CompoundBus>(found)) {
             compounds.Add(compound);
         }
     }

@@ -1,38 +1,24 @@
 #include "vesk_hdl/netlist/Object.h"
 
-#include <atomic>
-
 #include "vesk_hdl/netlist/Names.h"
+#include "vesk_hdl/netlist/ObjectRecord.h"
+#include "vesk_hdl/text/basis/Counting.h"
 #include "vesk_hdl/text/basis/Functions.h"
 
 namespace Vesk_Hdl {
 
 using Basis::StringBase;
 
-/// Shared between copies: the pins of a million instances are called what their components' pins
-/// are called.
-struct Object::Record {
-    Record() = default;
-    Record(Record const &other)
-        : name(other.name), comment(other.comment), objectType(other.objectType) {}
-
-    StringBase<char> name;
-    StringBase<char> comment;
-    ObjectType objectType = ObjectType();
-    std::atomic<unsigned int> owners{1};
-};
-
 Object::Object() : record(new Record) {}
 
 Object::Object(Object const &other) : record(other.record) {
-    record->owners.fetch_add(1, std::memory_order_relaxed);
+    Basis::Counting::Join(record->owners);
 }
 
 Object::~Object() { Release(); }
 
 void Object::Release() {
-    if (record->owners.load(std::memory_order_acquire) == 1 ||
-        record->owners.fetch_sub(1, std::memory_order_acq_rel) == 1)
+    if (Basis::Counting::Leave(record->owners))
         delete record;
 }
 
@@ -46,29 +32,43 @@ Object::Record &Object::Own() {
     return *record;
 }
 
+/// What makes a pin a pin stays behind; where that is alike, all the rest can be shared.
 Object &Object::operator=(Object const &other) {
-    if (record != other.record) {
-        other.record->owners.fetch_add(1, std::memory_order_relaxed);
-        Release();
-        record = other.record;
+    if (record == other.record)
+        return *this;
+    if (record->IsSamePin(*other.record)) {
+        Share(other);
+        return *this;
     }
+    Record &own = Own();
+    own.name = other.record->name;
+    own.objectType = other.record->objectType;
+    if (HasComment() || other.HasComment())
+        own.OwnRare().comment = other.record->GetComment();
     return *this;
 }
 
+/// Takes over everything.
+void Object::Share(Object const &other) {
+    Basis::Counting::Join(other.record->owners);
+    Release();
+    record = other.record;
+}
+
 bool Object::operator==(Object const &other) const {
-    return record->comment == other.record->comment && record->name == other.record->name &&
-           record->objectType == other.record->objectType;
+    return record->GetComment() == other.record->GetComment() &&
+           record->name == other.record->name && record->objectType == other.record->objectType;
 }
 
 void Object::SetName(char const *name) { SetNormalizedName(name); }
 
 StringBase<char> Object::GetName() const { return record->name; }
 StringBase<char> const &Object::GetNameRef() const { return record->name; }
-StringBase<char> Object::GetComment() const { return record->comment; }
-bool Object::HasComment() const { return !record->comment.IsEmpty(); }
+StringBase<char> Object::GetComment() const { return record->GetComment(); }
+bool Object::HasComment() const { return record->rare && !record->rare->comment.IsEmpty(); }
 
 void Object::AddComment(char const *text) {
-    StringBase<char> &comment = Own().comment;
+    StringBase<char> &comment = Own().OwnRare().comment;
     comment += text;
     comment += '\n';
 }
@@ -88,16 +88,18 @@ bool Object::IsValidIntegerString(StringBase<char> const &text) {
     return Names::IsInteger(text.View());
 }
 
-Object::ObjectType Object::GetStoredObjectType() const { return record->objectType; }
+Object::ObjectType Object::GetStoredObjectType() const {
+    return static_cast<ObjectType>(record->objectType);
+}
 
-void Object::SetObjectType(ObjectType type) { Own().objectType = type; }
+void Object::SetObjectType(ObjectType type) { Own().objectType = static_cast<short>(type); }
 
 void Object::SetNameText(StringBase<char> const &name) { Own().name = name; }
 
 void Object::SetNormalizedName(char const *name) {
     StringBase<char> text(name);
     Names::Normalize(text);
-    SetNameText(text);
+    Own().name = std::move(text);
 }
 
 ObjectVisitor::~ObjectVisitor() = default;

@@ -68,8 +68,10 @@ protected:
     void SetNormalizedName(char const *name);
 
 private:
+    friend class Pin;
     struct Record;
     Record &Own();
+    void Share(Object const &other);
     void Release();
 
     Record *record; ///< shared with copies

@@ -5,7 +5,9 @@
 
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/NaturalOrder.h"
+#include "vesk_hdl/netlist/ObjectRecord.h"
 #include "vesk_hdl/netlist/Signal.h"
+#include "vesk_hdl/text/LentPtrArray.h"
 #include "vesk_hdl/text/StringTable.h"
 #include "vesk_hdl/text/basis/Ascii.h"
 
@@ -81,22 +83,15 @@ void FindOnPorts(PtrArray<Pin *> const &pins, Polarity::Value pinPolarity,
 
 } // namespace
 
-struct Pin::Record {
-    Polarity polarity;
-    Signal *signal = nullptr;
-    BitVectorValue defaultValue;
-};
-
-Pin::Pin(char const *name, Polarity const &polarity)
-    : record(new Record{polarity, nullptr, BitVectorValue()}) {
+Pin::Pin(char const *name, Polarity const &polarity) : signal(nullptr) {
     SetNormalizedName(name);
     SetObjectType(OBJECT_PIN);
+    SetPolarity(polarity);
 }
 
-Pin::Pin(Pin const &other)
-    : Object(other), AttributeHolder(other), record(new Record(*other.record)) {
-    if (record->signal)
-        record->signal->NoteTie();
+Pin::Pin(Pin const &other) : Object(other), AttributeHolder(other), signal(other.GetSignal()) {
+    if (signal)
+        signal->NoteTie();
 }
 
 Pin::~Pin() = default;
@@ -113,28 +108,41 @@ Pin &Pin::operator=(Pin const &other) {
         return *this;
     somePinWasRenamed = somePinWasRenamed || !IsCalled(this, other.GetNameRef().View());
     AttributeHolder::operator=(other);
-    Object::operator=(other);
-    record->polarity = other.record->polarity;
-    Connect(other.record->signal);
-    record->defaultValue = other.record->defaultValue;
+    Share(other);
+    Connect(other.GetSignal());
     return *this;
 }
 
-void Pin::Connect(Signal *signal) {
-    record->signal = signal;
-    if (signal)
-        signal->NoteTie();
+/// What a pin points at that is on no signal but was on one. It is compared and never looked into.
+Signal *Pin::Former() {
+    alignas(Signal) static char place;
+    return reinterpret_cast<Signal *>(&place);
 }
 
-void Pin::SetListedSignal(Signal *signal) { record->signal = signal; }
-void Pin::Disconnect() { record->signal = nullptr; }
-Signal *Pin::GetSignal() const { return record->signal; }
-void Pin::SetPolarity(Polarity const &polarity) { record->polarity = polarity; }
-Polarity Pin::GetPolarity() const { return record->polarity; }
-StringBase<char> Pin::GetPolarityName() const { return record->polarity.GetValueName(); }
-void Pin::SetDefaultValue(BitVectorValue const &value) { record->defaultValue = value; }
-void Pin::SetDefaultValue(char const *text) { record->defaultValue.SetValue(text); }
-BitVectorValue Pin::GetDefaultValue() const { return record->defaultValue; }
+void Pin::Connect(Signal *newSignal) {
+    if (!newSignal)
+        return Disconnect();
+    signal = newSignal;
+    signal->NoteTie();
+}
+
+void Pin::Disconnect() {
+    if (signal)
+        signal = Former();
+}
+
+Signal *Pin::GetSignal() const { return signal == Former() ? nullptr : signal; }
+void Pin::SetPolarity(Polarity const &polarity) {
+    Object::Own().polarity = static_cast<short>(polarity.GetValue());
+}
+Polarity Pin::GetPolarity() const { return static_cast<Polarity::Value>(Object::record->polarity); }
+StringBase<char> Pin::GetPolarityName() const { return GetPolarity().GetValueName(); }
+void Pin::SetDefaultValue(BitVectorValue const &value) {
+    BitVectorValue const held(value); // it may be this pin's own
+    Object::Own().OwnRare().defaultValue = held;
+}
+void Pin::SetDefaultValue(char const *text) { SetDefaultValue(BitVectorValue(text)); }
+BitVectorValue Pin::GetDefaultValue() const { return Object::record->GetDefaultValue(); }
 
 ScalarPin::ScalarPin(char const *name, Polarity const &polarity) : Pin(name, polarity) {}
 ScalarPin::ScalarPin(ScalarPin const &other) = default;
@@ -242,25 +250,76 @@ Pin *Component::GetPin(char const *name) const {
 
 Iterator<Pin *> Component::GetPinIterator() const { return Iterator<Pin *>(&record->pins); }
 
+/// An instance's pins stand in one block with this record, behind it, each in a room of its own:
+/// nobody adds or removes one.
 struct Instance::Record {
-    Component *component = nullptr;
-    OwnPtrArray<Pin *> pins;
+    static Record *Make(Component *component);
+    static void Delete(Record *record);
+
+    explicit Record(Component *placed) : component(placed) {}
+
+    Component *const component;
+    LentPtrArray<Pin *> pins;
 };
 
-Instance::Instance(char const *name, Component *component) : record(std::make_unique<Record>()) {
-    record->component = component;
-    SetNormalizedName(name);
-    SetObjectType(OBJECT_INSTANCE);
-    if (!component)
-        return;
-    ForEach(component->record->pins, [this](Pin const *pin) {
-        std::unique_ptr<Pin> copy(pin->ClonePin());
-        record->pins.Add(copy.get());
-        copy.release();
-    });
+namespace {
+
+union PinRoom {
+    ScalarPin scalar;
+    BusPin bus;
+    BusIndexPin index;
+};
+
+/// Pin::ClonePin into a room.
+Pin *ClonePinInto(PinRoom *room, Pin const &pin) {
+    switch (pin.GetPinType()) {
+    case Pin::PIN_BUS:
+        return new (room) BusPin(static_cast<BusPin const &>(pin));
+    case Pin::PIN_BUS_INDEX:
+        return new (room) BusIndexPin(static_cast<BusIndexPin const &>(pin));
+    case Pin::PIN_SCALAR:
+        break;
+    }
+    return new (room) ScalarPin(static_cast<ScalarPin const &>(pin));
 }
 
-Instance::~Instance() = default;
+} // namespace
+
+Instance::Record *Instance::Record::Make(Component *component) {
+    int const count = component ? component->record->pins.GetSize() : 0;
+    auto const size = static_cast<std::size_t>(count);
+    std::size_t const arrayBytes = LentPtrArray<Pin *>::BytesFor(count);
+    void *const memory = ::operator new(sizeof(Record) + arrayBytes + size * sizeof(PinRoom));
+    auto *const made = new (memory) Record(component);
+    if (count == 0)
+        return made;
+    void *const array = made + 1;
+    made->pins.Borrow(array, count);
+    auto *room = reinterpret_cast<PinRoom *>(static_cast<char *>(array) + arrayBytes);
+    try {
+        for (int i = 0; i < count; ++i)
+            made->pins.Add(ClonePinInto(room++, *component->record->pins.GetAt(i)));
+    } catch (...) {
+        Delete(made);
+        throw;
+    }
+    return made;
+}
+
+void Instance::Record::Delete(Record *record) {
+    for (int i = record->pins.GetSize() - 1; i >= 0; --i)
+        record->pins.GetAt(i)->~Pin();
+    record->~Record();
+    ::operator delete(record);
+}
+
+Instance::Instance(char const *name, Component *component) : record(nullptr) {
+    SetNormalizedName(name);
+    SetObjectType(OBJECT_INSTANCE);
+    record = Record::Make(component);
+}
+
+Instance::~Instance() { Record::Delete(record); }
 
 Object::ObjectType Instance::GetObjectType() const { return GetStoredObjectType(); }
 void Instance::AcceptObject(ObjectVisitor &visitor) { visitor.VisitInstance(this); }

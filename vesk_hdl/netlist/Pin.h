@@ -50,12 +50,14 @@ protected:
 
 private:
     friend class Signal;
-    struct Record;
 
     /// What Connect does, for a signal that lists the pin.
-    void SetListedSignal(Signal *signal);
+    void SetListedSignal(Signal *newSignal) { signal = newSignal; }
+    /// False only if no signal ever listed the pin, which then need not be looked for.
+    bool MayBeListed() const { return signal != nullptr; }
+    static Signal *Former();
 
-    std::unique_ptr<Record> record;
+    Signal *signal; ///< Former() once there was one; all else is shared with copies
 };
 
 /// A pin of one bit, or one whose name is no other form.
@@ -182,7 +184,7 @@ public:
 
 private:
     struct Record;
-    std::unique_ptr<Record> record;
+    Record *record;
 };
 
 } // namespace Vesk_Hdl

@@ -2,9 +2,11 @@
 
 #include <limits>
 
-#include "vesk_hdl/netlist/ListedOnce.h"
+#include "vesk_hdl/netlist/As.h"
+#include "vesk_hdl/netlist/ListIndex.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/Pin.h"
+#include "vesk_hdl/text/LentPtrArray.h"
 #include "vesk_hdl/text/basis/Tokens.h"
 
 namespace Vesk_Hdl {
@@ -54,12 +56,36 @@ void AddIfAbsent(StringSet &names, StringBase<char> const &name) {
 
 } // namespace
 
+/// Three pins find room here: one that drives and two that read, as most nets of a design have.
 struct Signal::Record {
     BitVectorValue constantValue;
-    ListedOnce<Pin *> pins;
-    ListedOnce<Signal *> signals;
+    InlinePtrArray<Pin *, 3> pins;
+    PtrArray<Signal *> signals;
+    std::unique_ptr<ListIndex> index; ///< of both lists, once one of them was long when searched
     int unknownReferences = 0;
     bool tied = false;
+
+    template <class T> bool Contains(PtrArray<T *> const &list, T *item) {
+        if (list.GetSize() <= ListIndex::LONGEST_SCAN)
+            return list.Contains(item);
+        if (!index) {
+            index = std::make_unique<ListIndex>();
+            index->AddAll(pins);
+            index->AddAll(signals);
+        }
+        return index->Contains(item);
+    }
+
+    template <class T> void Append(PtrArray<T *> &list, T *item) {
+        list.Add(item);
+        if (index)
+            index->Add(item);
+    }
+
+    template <class T> void Remove(PtrArray<T *> &list, T *item) {
+        if (list.Remove(item) && index && !list.Contains(item))
+            index->Remove(item);
+    }
 };
 
 Signal::Signal() : record(std::make_unique<Record>()) { SetObjectType(OBJECT_SIGNAL); }
@@ -76,44 +102,52 @@ int Signal::GetUnknownReferences() const { return record->unknownReferences; }
 bool Signal::IsTied() const { return record->tied; }
 
 void Signal::Connect(Pin *pin) {
-    if (!pin || record->pins.Contains(pin))
+    if (!pin || (pin->MayBeListed() && record->Contains(record->pins, pin)))
         return;
-    record->pins.Append(pin);
+    record->Append(record->pins, pin);
     pin->SetListedSignal(this);
 }
 
 void Signal::Connect(Signal *other) {
-    if (!other || record->signals.Contains(other))
+    if (!other || record->Contains(record->signals, other))
         return;
-    record->signals.Append(other);
+    record->Append(record->signals, other);
     other->NoteReference();
 }
 
-void Signal::ReplaceAssigned(Signal *former, Signal *now) { record->signals.Replace(former, now); }
+void Signal::ReplaceAssigned(Signal *former, Signal *now) {
+    PtrArray<Signal *> &signals = record->signals;
+    for (int i = 0; i < signals.GetSize(); ++i)
+        if (signals.GetAt(i) == former)
+            signals.SetAt(i, now);
+    if (record->index && record->index->Remove(former))
+        record->index->Add(now);
+}
 
 void Signal::Disconnect(Pin *pin) {
     if (!pin)
         return;
-    record->pins.Remove(pin);
+    record->Remove(record->pins, pin);
     pin->Disconnect();
 }
 
-void Signal::Disconnect(Signal *other) { record->signals.Remove(other); }
+void Signal::Disconnect(Signal *other) { record->Remove(record->signals, other); }
 
 void Signal::DisconnectAll() {
-    ForEach(record->pins.Items(), [](Pin *pin) { pin->Disconnect(); });
+    ForEach(record->pins, [](Pin *pin) { pin->Disconnect(); });
     record->pins.Empty();
     record->signals.Empty();
+    record->index.reset();
 }
 
 void Signal::CloneConnection(Signal *source) {
     DisconnectAll();
     if (!source)
         return;
-    ForEach(source->record->pins.Items(), [this](Pin *pin) { record->pins.Append(pin); });
-    ForEach(source->record->signals.Items(), [this](Signal *s) { record->signals.Append(s); });
+    ForEach(source->record->pins, [this](Pin *pin) { record->Append(record->pins, pin); });
+    ForEach(source->record->signals, [this](Signal *s) { record->Append(record->signals, s); });
     source->DisconnectAll();
-    ForEach(record->pins.Items(), [this](Pin *pin) { pin->SetListedSignal(this); });
+    ForEach(record->pins, [this](Pin *pin) { pin->SetListedSignal(this); });
 }
 
 void Signal::AssignConstantValue(char const *text) { record->constantValue.SetValue(text); }
@@ -123,21 +157,21 @@ bool Signal::HasConstantValue() const { return !record->constantValue.IsEmpty();
 
 bool Signal::HasMultiDriver() const {
     int drivers = 0;
-    PtrArray<Pin *> const &pins = record->pins.Items();
+    PtrArray<Pin *> const &pins = record->pins;
     for (int i = 0; i < pins.GetSize() && drivers < 2; ++i)
         if (Pin const *const pin = pins.GetAt(i))
             drivers += pin->GetPolarity() == Polarity::OUTPUT ? 1 : 0;
     return drivers > 1;
 }
 
-Iterator<Pin *> Signal::GetPinIterator() const { return Iterator<Pin *>(&record->pins.Items()); }
+Iterator<Pin *> Signal::GetPinIterator() const { return Iterator<Pin *>(&record->pins); }
 
 Iterator<Signal *> Signal::GetSignalIterator() const {
-    return Iterator<Signal *>(&record->signals.Items());
+    return Iterator<Signal *>(&record->signals);
 }
 
 void Signal::GetBaseName(StringSet &names) const {
-    if (auto const *const compound = dynamic_cast<CompoundBus const *>(this)) {
+    if (auto const *const compound = As<CompoundBus>(this)) {
         AddIfAbsent(names, GetNameRef());
         ForEach(compound->GetBusMemberIterator(),
                 [&names](Signal *member) { AddIfAbsent(names, BaseNameOf(*member)); });

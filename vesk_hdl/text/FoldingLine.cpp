@@ -1,5 +1,7 @@
 #include "vesk_hdl/text/FoldingLine.h"
 
+#include <algorithm>
+
 namespace Vesk_Hdl {
 
 namespace {
@@ -13,53 +15,67 @@ void WriteBlanks(Basis::Stream &file, std::size_t count) {
 
 } // namespace
 
-void FoldingLine::Append(std::string_view token) {
-    std::size_t const base = text.size();
-    char before = base > start ? text.back() : ' ';
-    text.append(token);
-    if (comment)
-        return;
-    for (std::size_t i = 0; i < token.size(); ++i) {
-        char const c = token[i];
-        if (c == ' ')
-            lastBlank = base + i;
-        else if (c == ',')
-            lastComma = base + i;
-        else if (c == '/' || (c == '-' && before == '-'))
-            comment = true;
-        before = c;
+void FoldingLine::Grow() {
+    std::size_t const grown = std::max<std::size_t>(2 * capacity, 256);
+    auto larger = std::make_unique<char[]>(grown);
+    std::copy_n(text.get(), size, larger.get());
+    text = std::move(larger);
+    capacity = grown;
+}
+
+/// Whether the text in front of the last piece holds a comment mark.
+bool FoldingLine::IsComment() {
+    for (; !comment && searched < pieceBegin; ++searched) {
+        char const c = text[searched];
+        comment = c == '/' || (c == '-' && searched > start && text[searched - 1] == '-');
     }
+    return comment;
+}
+
+/// The place of a character in front of the last piece, not before `from`.
+std::size_t FoldingLine::FindLast(char c, std::size_t from) const {
+    for (std::size_t at = pieceBegin; at > from; --at)
+        if (text[at - 1] == c)
+            return at - 1;
+    return NONE;
 }
 
 void FoldingLine::Fold(Basis::Stream &file, std::size_t indentation) {
     WriteBlanks(file, blanks);
+    std::size_t const lastBlank = FindLast(' ', std::max(start, withoutBlank));
     std::size_t end = start; // unless the text holds a blank, the last one stands in front of it
-    if (lastBlank != NONE)
+    if (lastBlank != NONE) {
         end = lastBlank + 1;
-    else if (blanks == 0)
-        end = lastComma != NONE ? lastComma + 1 : text.size();
-    file.Write(std::string_view(text).substr(start, end - start)).Write("\n");
-    start = end;
-    blanks = indentation + FOLD_INDENT;
-    lastBlank = lastComma = NONE; // blanks stand in front now, so that no comma will be asked for
-    if (start == text.size()) {
-        text.clear();
-        start = 0;
+    } else if (blanks == 0) {
+        std::size_t const lastComma = FindLast(',', start);
+        end = lastComma != NONE ? lastComma + 1 : pieceBegin;
     }
+    file.Write(std::string_view(text.get() + start, end - start)).Write("\n");
+    start = end;
+    blanks = indentation + FOLD_INDENT; // now in front, so that no comma will be asked for
+    withoutBlank = pieceBegin;
+    searched = std::max(searched, start);
+    if (start >= size - start)
+        DropWritten();
 }
 
-void FoldingLine::Write(Basis::Stream &file) {
+/// So that a line that folds a million times takes no more memory than one that folds once.
+void FoldingLine::DropWritten() {
+    std::copy(text.get() + start, text.get() + size, text.get());
+    for (std::size_t *const place : {&size, &pieceBegin, &searched, &withoutBlank})
+        *place -= start;
+    start = 0;
+}
+
+void FoldingLine::Write(Basis::Stream &file, std::string_view end) {
     WriteBlanks(file, blanks);
-    file.Write(std::string_view(text).substr(start));
-    text.clear();
-    blanks = start = 0;
-    lastBlank = lastComma = NONE;
+    file.Write(std::string_view(text.get() + start, size - start)).Write(end);
+    blanks = size = start = pieceBegin = searched = withoutBlank = 0;
     comment = false;
 }
 
 void FoldingLine::Break(Basis::Stream &file, std::size_t indentation) {
-    Write(file);
-    file.Write("\n");
+    Write(file, "\n");
     blanks = indentation + FOLD_INDENT;
 }
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include <string>
+#include <memory>
 
 #include "vesk_hdl/text/basis/File.h"
 
@@ -8,39 +8,63 @@ namespace Vesk_Hdl {
 
 /// The current line of a text file, which folds where it would pass 80 columns.
 ///
-/// A line is some blanks and the text behind them. Each character is looked at once, when it comes:
-/// the line remembers its last blank, its last comma and whether it holds a comment mark, so that
-/// neither a comment of a megabyte nor a name of that size is ever read again.
+/// A line is some blanks and the text behind them. Most lines end before that column, so that
+/// nothing is known of a text until it matters: only then is it searched for comment marks, for its
+/// last blank, else its last comma, and no part of it twice. Neither a comment of a megabyte nor a
+/// name of that size is ever read again.
 class FoldingLine {
 public:
     static constexpr std::size_t MAX_LENGTH = 80;
     static constexpr std::size_t FOLD_INDENT = 6;
 
     bool IsEmpty() const { return GetLength() == 0; }
-    std::size_t GetLength() const { return blanks + text.size() - start; }
+    std::size_t GetLength() const { return blanks + size - start; }
 
     /// Begins an empty line with blanks.
     void Indent(std::size_t count) { blanks = count; }
 
-    void Append(std::string_view token);
-    /// Whether the line is inside a comment and so does not fold: it holds "/" or "--" anywhere.
-    bool IsComment() const { return comment; }
-    /// Writes the line up to its last blank, else its last comma, else whole, and an end of line.
-    /// The rest goes on behind `indentation` and six more blanks.
-    void Fold(Basis::Stream &file, std::size_t indentation);
-    /// Writes the line whole and leaves it empty.
-    void Write(Basis::Stream &file);
-    /// The same with an end of line; the line then begins with `indentation` and six blanks.
+    /// Appends a text up to its first end of line, if it has one, and tells where it stopped.
+    char const *Append(char const *token) {
+        pieceBegin = size;
+        for (;;) {
+            char *to = text.get() + size;
+            char *const end = text.get() + capacity;
+            while (to != end && *token != '\0' && *token != '\n')
+                *to++ = *token++;
+            size = static_cast<std::size_t>(to - text.get());
+            if (to != end)
+                return token;
+            Grow();
+        }
+    }
+    /// Folds in front of what was appended last if that leads too far, unless the line is inside a
+    /// comment there: holds "/" or "--" anywhere.
+    void FoldIfTooLong(Basis::Stream &file, std::size_t indentation) {
+        if (GetLength() > MAX_LENGTH && size > pieceBegin && !IsComment())
+            Fold(file, indentation);
+    }
+    /// Writes the line whole and `end` behind it, and leaves it empty.
+    void Write(Basis::Stream &file, std::string_view end);
+    /// Writes it with an end of line; the line then begins with `indentation` and six blanks.
     void Break(Basis::Stream &file, std::size_t indentation);
 
 private:
+    void Grow();
+    bool IsComment();
+    void Fold(Basis::Stream &file, std::size_t indentation);
+    void DropWritten();
+    std::size_t FindLast(char c, std::size_t from) const;
+
     static constexpr std::size_t NONE = static_cast<std::size_t>(-1);
 
     std::size_t blanks = 0;
-    std::string text; ///< from `start` on; what stands before it has been written
+    std::unique_ptr<char[]> text; ///< from `start` to `size`; what stands before has been written
+    std::size_t capacity = 0;
+    std::size_t size = 0;
     std::size_t start = 0;
-    std::size_t lastBlank = NONE; ///< index in `text`, not before `start`
-    std::size_t lastComma = NONE;
+    std::size_t pieceBegin = 0;   ///< where the piece appended last begins
+    std::size_t searched = 0;     ///< no comment mark ends in front of it, unless `comment`
+    std::size_t withoutBlank = 0; ///< no blank stands between `start` and here
     bool comment = false;
 };
 

@@ -1,6 +1,8 @@
 #include "vesk_hdl/text/OutStream.h"
 
 #include <cerrno>
+#include <charconv>
+#include <string>
 
 #include "vesk_hdl/text/FoldingLine.h"
 
@@ -36,24 +38,28 @@ public:
         file->flush();
     }
 
-    void Write(char const *text) override { WriteText(text); }
-    void Write(int value) override {
+    void WriteNewLine() override {
         if (file)
-            AppendToken(std::to_string(value));
+            EndLine();
     }
 
     /// What stands in front of a "\n" in one piece ends the line unfolded.
-    void WriteText(std::string_view rest) {
+    void Write(char const *text) override {
         if (!file)
             return;
-        for (std::size_t end; (end = rest.find('\n')) != std::string_view::npos;) {
+        while (*text != '\0') {
             IndentNewLine();
-            line.Write(*file);
-            file->Write(rest.substr(0, end + 1));
-            rest.remove_prefix(end + 1);
+            text = line.Append(text);
+            if (*text == '\0')
+                return line.FoldIfTooLong(*file, Indentation());
+            EndLine();
+            ++text;
         }
-        if (!rest.empty())
-            AppendToken(rest);
+    }
+    void Write(int value) override {
+        char digits[16];
+        *std::to_chars(digits, digits + sizeof digits - 1, value).ptr = '\0';
+        Write(digits);
     }
 
     bool Open(char const *name, bool append) {
@@ -98,11 +104,9 @@ private:
             line.Indent(Indentation());
     }
 
-    void AppendToken(std::string_view token) {
+    void EndLine() {
         IndentNewLine();
-        if (!line.IsComment() && line.GetLength() + token.size() > FoldingLine::MAX_LENGTH)
-            line.Fold(*file, Indentation());
-        line.Append(token);
+        line.Write(*file, "\n");
     }
 
     Stream *file = nullptr;

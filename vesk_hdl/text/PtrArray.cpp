@@ -11,16 +11,27 @@ namespace Vesk_Hdl {
 
 PtrArrayBase::PtrArrayBase() : block(nullptr) {}
 
-PtrArrayBase::~PtrArrayBase() { std::free(block); }
+PtrArrayBase::~PtrArrayBase() {
+    if (!IsBorrowed())
+        std::free(block);
+}
+
+void PtrArrayBase::Borrow(void *memory, int count) { block = new (memory) Block{0, ~count}; }
+
+int PtrArrayBase::GetCapacity() const {
+    return !block ? 0 : IsBorrowed() ? ~block->capacity : block->capacity;
+}
 
 void PtrArrayBase::Reserve(int capacity) {
     if (capacity <= 0)
         throw std::bad_alloc(); // the size would pass what an int can count
     int const size = GetSize();
-    std::size_t const bytes = sizeof(Block) + static_cast<std::size_t>(capacity) * sizeof(void *);
-    void *const memory = std::realloc(block, bytes);
+    bool const wasBorrowed = IsBorrowed();
+    void *const memory = std::realloc(wasBorrowed ? nullptr : block, BytesFor(capacity));
     if (!memory)
         throw std::bad_alloc();
+    if (wasBorrowed)
+        std::memcpy(memory, block, BytesFor(size));
     block = static_cast<Block *>(memory);
     block->size = size;
     block->capacity = capacity;
@@ -46,7 +57,7 @@ void PtrArrayBase::Sort(bool (*compare)(void *, void *, void *), void *context) 
 
 int PtrArrayBase::Add(void *item) {
     int const size = GetSize();
-    if (!block || size == block->capacity)
+    if (size == GetCapacity())
         Reserve(GrownCapacity());
     Items()[size] = item;
     block->size = size + 1;
@@ -81,7 +92,7 @@ void PtrArrayBase::SetAt(int index, void *item) {
     if (index >= GetSize()) {
         if (index == std::numeric_limits<int>::max())
             throw std::bad_alloc();
-        if (!block || index >= block->capacity)
+        if (index >= GetCapacity())
             Reserve(std::max(index + 1, GrownCapacity()));
         std::fill(Items() + GetSize(), Items() + index + 1, nullptr);
         block->size = index + 1;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstddef>
 #include <type_traits>
 
 #include "vesk_hdl/Api.h"
@@ -46,14 +47,22 @@ protected:
 
     void **Items() const { return reinterpret_cast<void **>(block + 1); }
 
+    static constexpr std::size_t BytesFor(int count) {
+        return sizeof(Block) + static_cast<std::size_t>(count) * sizeof(void *);
+    }
+    /// Has an array without a block begin in memory that is not its own, for `count` elements.
+    void Borrow(void *memory, int count);
+
 private:
     /// Stands in front of the elements, in one block with them. There is none while nothing was
     /// ever added: most arrays of a design stay empty.
     struct Block {
         int size;
-        int capacity;
+        int capacity; ///< of borrowed memory its complement, below 0
     };
 
+    int GetCapacity() const;
+    bool IsBorrowed() const { return block && block->capacity < 0; }
     int GrownCapacity() const;
     void Reserve(int capacity);
 

@@ -11,6 +11,7 @@
 
 namespace Vesk_Hdl {
 
+using Basis::OrEmpty;
 using Basis::StringBase;
 using Basis::ViewOf;
 
@@ -106,6 +107,49 @@ private:
     int count = 0;
 };
 
+/// The plain way of StringArray::Parse, where empty tokens do not count and no quote stands in the
+/// text: the tokens are the runs of characters that are no separators.
+class PlainText {
+public:
+    PlainText(char const *plain, std::string_view separators, std::string_view quotes)
+        : text(plain) {
+        for (char const c : separators)
+            KindOf(c) |= SEPARATOR;
+        for (char const c : quotes)
+            KindOf(c) |= QUOTE;
+        KindOf('\0') = END;
+    }
+
+    bool HoldsQuote() {
+        unsigned char met = 0;
+        for (char const *at = text; !(met & END); ++at)
+            met |= KindOf(*at);
+        return met & QUOTE;
+    }
+
+    template <class Act> void ForEachToken(Act act) {
+        char const *at = text;
+        for (;;) {
+            while (KindOf(*at) == SEPARATOR)
+                ++at;
+            if (KindOf(*at) == END)
+                return;
+            char const *const begin = at;
+            while (KindOf(*at) == PLAIN)
+                ++at;
+            act(std::string_view(begin, static_cast<std::size_t>(at - begin)));
+        }
+    }
+
+private:
+    enum Kind : unsigned char { PLAIN = 0, SEPARATOR = 1, QUOTE = 2, END = 4 };
+
+    unsigned char &KindOf(char c) { return kinds[static_cast<unsigned char>(c)]; }
+
+    char const *text;
+    unsigned char kinds[256] = {};
+};
+
 } // namespace
 
 /// A slot that nobody assigned reads as the empty string, and that is what it holds.
@@ -173,19 +217,49 @@ int StringArray::Parse(char const *text, char const *separators, bool skipEmpty,
 
 int StringArray::Parse(char const *text, char const *separators, bool skipEmpty,
                        char const *quotePairs, std::vector<Basis_Range> *places) {
-    std::string_view const whole = ViewOf(text);
     std::string_view const set = ViewOf(separators);
     std::string_view const quotes = ViewOf(quotePairs);
-    if (whole.find_first_of(quotes) != std::string_view::npos)
-        return QuotedParser(set, skipEmpty, quotes, *this, places).Parse(whole);
+    PlainText plain(OrEmpty(text), set, quotes);
+    if (plain.HoldsQuote())
+        return QuotedParser(set, skipEmpty, quotes, *this, places).Parse(ViewOf(text));
 
     int const before = GetSize();
-    for (Basis_Range range = {1, 0}; Basis::NextToken(whole, range, set, skipEmpty);) {
-        record->strings.emplace_back(Basis::TokenIn(whole, range));
-        if (places)
-            places->push_back(range);
+    auto const add = [&](std::string_view token) {
+        record->strings.emplace_back(token);
+        if (places) {
+            auto const begin = static_cast<std::size_t>(token.data() - text);
+            places->push_back(PlaceOf(begin, begin + token.size()));
+        }
+    };
+    if (skipEmpty) {
+        plain.ForEachToken(add);
+    } else {
+        std::string_view const whole = ViewOf(text);
+        for (Basis_Range range = {1, 0}; Basis::NextToken(whole, range, set, false);)
+            add(range.first > range.last ? whole.substr(range.last, 0)
+                                         : Basis::TokenIn(whole, range));
     }
     return GetSize() - before;
+}
+
+void StringArray::ParseAnew(char const *text, char const *separators, char const *quotePairs) {
+    PlainText plain(OrEmpty(text), ViewOf(separators), ViewOf(quotePairs));
+    if (plain.HoldsQuote()) {
+        Empty();
+        Parse(text, separators, true, quotePairs);
+        return;
+    }
+    std::vector<StringBase<char>> &strings = record->strings;
+    std::size_t count = 0;
+    plain.ForEachToken([&](std::string_view token) {
+        if (count == strings.size())
+            strings.emplace_back(token);
+        else
+            strings[count].Assign(token);
+        ++count;
+    });
+    while (strings.size() > count)
+        strings.pop_back();
 }
 
 bool StringArray::Contains(StringBase<char> const &string) const {

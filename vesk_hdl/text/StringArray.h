@@ -6,6 +6,8 @@
 
 namespace Vesk_Hdl {
 
+class Model;
+
 /// An ordered, growable array of strings that it owns, and the tokenizer of command lines.
 /// Indexes count from 0. Reading outside gives the empty string, never a failure. Copies are deep.
 class VESK_HDL_API StringArray {
@@ -72,6 +74,12 @@ public:
               void *context);
 
 private:
+    friend class Model;
+
+    /// Empty and Parse, skipping empty tokens, in one: the strings that nobody else holds give
+    /// their memory to the new ones.
+    void ParseAnew(char const *text, char const *separators, char const *quotePairs);
+
     struct Record;
     Record *record;
 };

@@ -27,28 +27,24 @@ std::uint32_t BucketCountFor(std::size_t wanted) {
 StringTable::StringTable(CaseRule rule, std::uint32_t wanted)
     : caseRule(rule), bucketCount(BucketCountFor(wanted)) {}
 
+std::uint32_t StringTable::HashIgnoringCase(std::string_view key) {
+    std::uint32_t hash = FIRST_HASH;
+    for (char const c : key)
+        hash = AddToHash(hash, Basis::Ascii::ToUpper(c));
+    return hash;
+}
+
 std::uint32_t StringTable::Hash(std::string_view key) const {
-    std::uint32_t hash = 5381;
-    for (char const c : key) {
-        auto const byte =
-            static_cast<signed char>(caseRule == CASE_EXACT ? c : Basis::Ascii::ToUpper(c));
-        hash = hash * 33 + static_cast<std::uint32_t>(static_cast<std::int32_t>(byte));
-    }
+    if (caseRule == CASE_IGNORED)
+        return HashIgnoringCase(key);
+    std::uint32_t hash = FIRST_HASH;
+    for (char const c : key)
+        hash = AddToHash(hash, c);
     return hash;
 }
 
 bool StringTable::Equal(std::string_view a, std::string_view b) const {
-    return caseRule == CASE_EXACT ? a == b : Basis::Ascii::EqualIgnoringCase(a, b);
-}
-
-StringTable::Node *StringTable::Find(std::string_view key) const {
-    if (buckets.empty())
-        return nullptr;
-    std::uint32_t const hash = Hash(key);
-    Node *node = buckets[BucketOf(hash)];
-    while (node && (node->hash != hash || !Equal(node->key.View(), key)))
-        node = node->next;
-    return node;
+    return a == b || (caseRule == CASE_IGNORED && Basis::Ascii::EqualIgnoringCase(a, b));
 }
 
 void StringTable::GrowForOneMore() {
@@ -88,11 +84,12 @@ StringTable::Node *StringTable::NewNode() {
     return node;
 }
 
-StringTable::Node *StringTable::Insert(Basis::StringBase<char> const &key, void *value) {
+StringTable::Node *StringTable::Insert(Basis::StringBase<char> const &key, std::uint32_t hash,
+                                       void *value) {
     Node *const node = NewNode();
     node->key = key;
     node->value = value;
-    node->hash = Hash(key.View());
+    node->hash = hash;
     Node *&first = buckets[BucketOf(node->hash)];
     // The oldest text of a bucket stays in front; a new one goes directly behind it.
     Node *&place = first ? first->next : first;

@@ -31,11 +31,30 @@ public:
     StringTable(CaseRule caseRule, std::uint32_t buckets);
 
     std::size_t GetCount() const { return count; }
-    Node *Find(std::string_view key) const;
+    Node *Find(std::string_view key) const { return Find(key, Hash(key)); }
+    /// With the key's hash, where the caller has it already.
+    Node *Find(std::string_view key, std::uint32_t hash) const {
+        if (buckets.empty())
+            return nullptr;
+        Node *node = buckets[BucketOf(hash)];
+        while (node && (node->hash != hash || !Equal(node->key.View(), key)))
+            node = node->next;
+        return node;
+    }
+    /// The hash of tables that ignore case.
+    static std::uint32_t HashIgnoringCase(std::string_view key);
+    static std::uint32_t AddToHash(std::uint32_t hash, char c) {
+        auto const byte = static_cast<signed char>(c);
+        return hash * 33 + static_cast<std::uint32_t>(static_cast<std::int32_t>(byte));
+    }
+    static constexpr std::uint32_t FIRST_HASH = 5381;
     /// Makes the table as large as one more text demands.
     void GrowForOneMore();
     /// Adds a text that the table does not hold, behind GrowForOneMore.
-    Node *Insert(Basis::StringBase<char> const &key, void *value);
+    Node *Insert(Basis::StringBase<char> const &key, void *value) {
+        return Insert(key, Hash(key.View()), value);
+    }
+    Node *Insert(Basis::StringBase<char> const &key, std::uint32_t hash, void *value);
     void Remove(std::string_view key);
     /// Removes all texts; the bucket count stays.
     void Empty();

@@ -9,6 +9,7 @@
 #include <utility>
 
 #include "vesk_hdl/text/basis/Ascii.h"
+#include "vesk_hdl/text/basis/Counting.h"
 #include "vesk_hdl/text/basis/File.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
 #include "vesk_hdl/text/basis/Printf.h"
@@ -35,11 +36,7 @@ StringBase<char>::Rep *StringBase<char>::NewRep(std::size_t capacity) {
 }
 
 void StringBase<char>::Release(Rep *rep) noexcept {
-    if (rep == &empty.rep)
-        return;
-    // Somebody who holds the only copy need not take part in the counting.
-    if (rep->owners.load(std::memory_order_acquire) == 1 ||
-        rep->owners.fetch_sub(1, std::memory_order_acq_rel) == 1)
+    if (rep != &empty.rep && Counting::Leave(rep->owners))
         std::free(rep);
 }
 
@@ -70,7 +67,7 @@ StringBase<char>::StringBase(std::string_view text) : rep(&empty.rep) {
 
 StringBase<char>::StringBase(StringBase const &other) noexcept : rep(other.rep) {
     if (rep != &empty.rep)
-        rep->owners.fetch_add(1, std::memory_order_relaxed);
+        Counting::Join(rep->owners);
 }
 
 StringBase<char>::StringBase(StringBase &&other) noexcept : rep(other.rep) {
@@ -121,6 +118,14 @@ StringBase<char> &StringBase<char>::Append(StringBase const &text) { return *thi
 StringBase<char> &StringBase<char>::Append(char const *text, unsigned int count) {
     std::string_view const whole = ViewOf(text);
     return *this += whole.substr(0, count == NOT_FOUND ? whole.size() : count);
+}
+
+void StringBase<char>::Assign(std::string_view text) {
+    if (text.empty() || text.size() > rep->capacity ||
+        rep->owners.load(std::memory_order_acquire) != 1)
+        *this = StringBase(text);
+    else
+        std::memcpy(Writable(text.size()), text.data(), text.size());
 }
 
 void StringBase<char>::Empty() {

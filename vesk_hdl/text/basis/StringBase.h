@@ -7,6 +7,10 @@
 
 class Basis_Regexp;
 
+namespace Vesk_Hdl {
+class StringArray;
+}
+
 /// A pair of character indices, both inclusive. `first` greater than `last` is an empty range;
 /// (1, 0) is where every walk with NextTokenRange starts.
 struct Basis_Range {
@@ -123,6 +127,10 @@ private:
         char terminator[4];
     };
 
+    friend class Vesk_Hdl::StringArray;
+
+    /// Replaces the text, in its memory if that serves, by one that is no piece of it.
+    void Assign(std::string_view text);
     static Rep *NewRep(std::size_t capacity);
     static void Release(Rep *rep) noexcept;
     char *Writable(std::size_t length);

@@ -48,12 +48,15 @@ struct CommandFactory::Record {
     std::atomic<unsigned int> owners{1};
 };
 
-CommandFactory::CommandFactory() : record(new Record) {
+CommandFactory::CommandFactory() : record(nullptr) {
+    auto made = std::make_unique<Record>(); // stays owned until all commands are known
+    record = made.get();
 #define REGISTER(keyword, Class, grammar)                                                          \
     AddCommandCreator(                                                                             \
         keyword, [](Model *model, StringArray const &) -> Command * { return new Class(model); });
     VESK_HDL_COMMANDS(REGISTER)
 #undef REGISTER
+    made.release();
 }
 
 CommandFactory::~CommandFactory() {

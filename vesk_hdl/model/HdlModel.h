@@ -26,8 +26,8 @@ struct WriteStatus {
 class VESK_HDL_API WriteOpener {
 public:
     virtual ~WriteOpener();
-    /// A descriptor open for writing, which the library closes; or -1 with `errno` set, and the text
-    /// is dropped as for a file that cannot be opened. The name is as the command gave it.
+    /// A descriptor open for writing, which the library closes; or -1 with `errno` set, and the
+    /// text is dropped as for a file that cannot be opened. The name is as the command gave it.
     virtual int Open(char const *fileName, bool append) = 0;
 };
 

@@ -1,7 +1,9 @@
 // vesk-hdl: a command-line client of the library like any other.
 
+#include <csignal>
 #include <cstdio>
 #include <exception>
+#include <new>
 #include <string>
 
 #include <CLI/CLI.hpp>
@@ -32,8 +34,11 @@ int ParseAndRun(int argc, char **argv) {
 } // namespace
 
 int main(int argc, char **argv) {
+    std::signal(SIGXFSZ, SIG_IGN); // a file that may not grow is an error like any other
     try {
         return ParseAndRun(argc, argv);
+    } catch (std::bad_alloc const &) {
+        std::fputs("vesk-hdl: error: out of memory\n", stderr);
     } catch (std::exception const &error) {
         std::fprintf(stderr, "vesk-hdl: error: %s\n", error.what());
     } catch (...) {

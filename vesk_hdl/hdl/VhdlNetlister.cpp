@@ -51,8 +51,9 @@ Text BaseNameOf(Object const &object) { return Object::GetBaseName(object.GetNam
 
 namespace Vesk_Hdl {
 
-VhdlNetlister::VhdlNetlister(OutStream &out)
-    : statements(new SharedStatements(out)), stream(&out) {}
+VhdlNetlister::VhdlNetlister(OutStream &out) : statements(nullptr), stream(&out) {
+    statements = new SharedStatements(out); // last: nobody but the destructor gives it back
+}
 
 VhdlNetlister::VhdlNetlister(VhdlNetlister &other)
     : statements(other.statements), stream(other.stream), declaredAttrs(other.declaredAttrs) {

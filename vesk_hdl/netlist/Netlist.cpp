@@ -15,12 +15,17 @@ namespace {
 
 int Length(StringBase<char> const &name) { return static_cast<int>(name.GetLength()); }
 
-/// Array first: should the map fail to grow, the object is owned all the same.
+/// Enters an object whole or, when memory runs out, not at all; then it is deleted.
 template <class T> void File(OwnPtrArray<T *> &array, NameTable<T> &map, T *object) {
     std::unique_ptr<T> held(object);
     array.Add(object);
+    try {
+        map.Add(object->GetNameRef(), object);
+    } catch (...) {
+        array.RemoveTail();
+        throw;
+    }
     held.release();
-    map.Add(object->GetNameRef(), object);
 }
 
 template <class T> void Unfile(OwnPtrArray<T *> &array, NameTable<T> &map, T *object) {
@@ -63,12 +68,32 @@ StringBase<char> Netlist::GetSourceFileName() const { return record->sourceFileN
 void Netlist::Add(Signal *signal) {
     if (!signal)
         return;
-    File(record->signals, record->signalMap, signal);
-    if (auto const *const bus = As<Bus>(signal))
-        record->busMap.Add(bus->GetBaseName(), signal);
-    else if (auto const *const compound = As<CompoundBus>(signal))
-        ForEach(compound->GetBusMemberIterator(),
-                [this, signal](Signal *member) { KnowReferrer(member, signal); });
+    std::unique_ptr<Signal> held(signal);
+    record->signals.Add(signal);
+    try {
+        if (auto const *const bus = As<Bus>(signal))
+            record->busMap.Add(bus->GetBaseName(), signal);
+        else if (auto const *const compound = As<CompoundBus>(signal))
+            ForEach(compound->GetBusMemberIterator(),
+                    [this, signal](Signal *member) { KnowReferrer(member, signal); });
+        record->signalMap.Add(signal->GetNameRef(), signal);
+    } catch (...) {
+        record->signals.RemoveTail();
+        Forget(signal);
+        throw;
+    }
+    held.release();
+}
+
+/// Everything that finds a signal but the array and the map of names.
+void Netlist::Forget(Signal *signal) {
+    record->referrers.Forget(signal);
+    if (auto const *const bus = As<Bus>(signal)) {
+        record->busMap.Remove(bus->GetBaseName());
+    } else if (As<BusSlice>(signal) || As<BusIndex>(signal)) {
+        if (Bus *const parent = GetParentBus(signal->GetNameRef()))
+            parent->RemoveBusSlice(signal);
+    }
 }
 
 void Netlist::Add(Instance *instance) {

@@ -110,6 +110,7 @@ private:
     void Link(Signal *left, Signal *right);
     void MoveConnections(Signal *from, Signal *to);
     void KnowReferrer(Signal *target, Signal *referrer);
+    void Forget(Signal *signal);
 
     void GetWiredOrOutputSignals(StringSet &names);
     void GetFeedBackSignals(StringSet &read, PtrArray<Signal *> &driven);

@@ -1,0 +1,95 @@
+// Memory that runs out at any single place of a design's life: the failure passes to the client,
+// nothing leaks (the address sanitizer looks), nothing dangles, and the engine goes on.
+
+#include <new>
+
+#include <gtest/gtest.h>
+
+#include "tests/support/Consistency.h"
+#include "tests/support/Lines.h"
+#include "tests/support/MemoryFile.h"
+
+extern long allocationsLeft; // of FailingNew.cpp
+
+namespace {
+
+using namespace Vesk_Hdl;
+
+/// Every family of commands, all forms of names, widening, and writes that rewrite.
+Lines const DESIGN = CellsAnd({"ADD PORT q out",
+                               "ADD PORT d(7:0) in",
+                               "ADD SIGNAL bus(7:0)",
+                               "CONNECT SIGNAL q u1.Y",
+                               "CONNECT SIGNAL q u2.A",
+                               "CONNECT SIGNAL bus(3:0) u1.B(3:0)",
+                               "CONNECT SIGNAL bus(0) u2.Y",
+                               "CONNECT SIGNAL bus(2),q,d(1:0) u2.B(3:0)",
+                               "CONNECT SIGNAL d(7:0) u1.W(7:0)",
+                               "CONNECT SIGNAL bus(15:0) q",
+                               "CONNECT SIGNAL bus(9:6) bus(3:0)",
+                               "ASSIGN CONSTANT u3.A 1",
+                               "ASSIGN CONSTANT u3.B(3:0) 4:h:A",
+                               "ASSIGN CONSTANT net 0",
+                               "ADD MODULE ATTRIBUTE -TYPE=Integer W 8",
+                               "SET MODULE ATTRIBUTE OPTION W -GENERIC=SYN",
+                               "ADD COMPONENT ATTRIBUTE CELL -TYPE=BitVector INIT 4:b:1010",
+                               "SET INSTANCE ATTRIBUTE VALUE u1 INIT 4:b:0101",
+                               "ADD INSTANCE PIN ATTRIBUTE u1.A K v",
+                               "ADD SIGNAL ATTRIBUTE q -TYPE=User U on",
+                               "SET SIGNAL ATTRIBUTE USERTYPE q U STATE",
+                               "ADD NOTES some words",
+                               "ADD SIGNAL COMMENT q words",
+                               "ADD LIBRARY lib",
+                               "ADD INCLUDE a.v",
+                               "SET SYNTHESIS SYNPLICITY",
+                               "Set Open Pin false",
+                               "Set Purpose to fail",
+                               "WRITE VERILOG x",
+                               "WRITE VHDL x"});
+
+/// Runs the design; the allocation of that number fails once. False if it was never reached.
+bool RunWithFailure(long number, std::string &line) {
+    allocationsLeft = number;
+    bool failed = false;
+    CommandFactory *factory = nullptr;
+    Model *model = nullptr;
+    Capture capture;
+    while (!model) {
+        try {
+            if (!factory)
+                factory = new CommandFactory;
+            model = new Model(factory);
+        } catch (std::bad_alloc const &) {
+            failed = true;
+        }
+    }
+    model->SetWriteOpener(&capture);
+    for (std::size_t i = 0; i < DESIGN.size(); ++i) {
+        line = DESIGN[i];
+        try {
+            model->Execute(line.c_str());
+        } catch (std::bad_alloc const &) {
+            failed = true;
+            EXPECT_EQ(Inconsistency(*model->GetNetlist()), "") << number << ": " << line;
+            --i; // once more: what is there already is refused, everything else is done
+        } catch (Exception const &refusal) {
+            EXPECT_TRUE(failed) << line << ": " << refusal.getDescription();
+        }
+    }
+    bool const reached = allocationsLeft < 0; // a sort that gets no memory makes do without
+    allocationsLeft = -1;
+    EXPECT_EQ(Inconsistency(*model->GetNetlist()), "") << number;
+    delete model;
+    delete factory;
+    return reached;
+}
+
+TEST(Faults, AnAllocationFails) {
+    std::string line;
+    long number = 0;
+    while (RunWithFailure(number, line) && !HasFailure())
+        ++number;
+    EXPECT_GT(number, 300);
+}
+
+} // namespace

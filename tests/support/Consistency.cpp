@@ -77,8 +77,8 @@ private:
         if (type != Signal::SIGNAL_BUS_SLICE && type != Signal::SIGNAL_BUS_INDEX)
             return;
         Bus const *const bus = netlist.GetParentBus(signal->GetName());
-        if (!bus)
-            return; // of a signal that a dummy or a client made without one
+        if (!bus || IsMadeByWrite(signal)) // of a dummy there may be two
+            return;
         bool listed = false;
         ForEach(bus->GetBusSliceIterator(), [&](Signal *slice) { listed |= slice == signal; });
         if (!listed)

@@ -1,0 +1,117 @@
+// Files that cannot be read or written: a client learns of each, nothing is lost and no descriptor
+// is left open.
+
+#include <cerrno>
+#include <csignal>
+#include <filesystem>
+#include <sys/resource.h>
+
+#include <gtest/gtest.h>
+
+#include "tests/support/Lines.h"
+#include "tests/support/ReadFile.h"
+#include "tests/support/TempDir.h"
+
+using namespace Vesk_Hdl;
+namespace fs = std::filesystem;
+
+namespace {
+
+/// A limit of this process, put back in the end.
+class Limit {
+public:
+    Limit(__rlimit_resource kind, rlim_t value) : resource(kind) {
+        ::getrlimit(resource, &former);
+        rlimit const now = {value, former.rlim_max};
+        ::setrlimit(resource, &now);
+    }
+    ~Limit() { ::setrlimit(resource, &former); }
+    Limit(Limit const &) = delete;
+    Limit &operator=(Limit const &) = delete;
+
+private:
+    __rlimit_resource resource;
+    rlimit former = {};
+};
+
+std::size_t OpenDescriptors() {
+    auto const all = fs::directory_iterator("/proc/self/fd");
+    return static_cast<std::size_t>(std::distance(begin(all), end(all)));
+}
+
+TEST(Faults, AWriteThatFailsIsToldAndLosesNothing) {
+    TempDir folder;
+    std::signal(SIGXFSZ, SIG_IGN);
+    WriteFile(folder.Path("file"), "");
+    struct Row {
+        std::string file;
+        int error;
+        rlim_t largest = RLIM_INFINITY;
+        rlim_t descriptors = 1024;
+    };
+    for (Row const &row :
+         {Row{"/dev/full", ENOSPC}, Row{folder.Path(""), EISDIR}, Row{folder.Path("no/x"), ENOENT},
+          Row{folder.Path("file") + "/x", ENOTDIR}, Row{folder.Path("large"), EFBIG, 300},
+          Row{folder.Path("late"), EMFILE, RLIM_INFINITY, 3}}) {
+        SCOPED_TRACE(row.file);
+        Design design(CellsAnd({"CONNECT SIGNAL a u1.A", "ADD PORT q out", "CONNECT SIGNAL q u1.Y",
+                                "CONNECT SIGNAL q u2.A"}));
+        std::size_t const open = OpenDescriptors();
+        {
+            Limit const size(RLIMIT_FSIZE, row.largest);
+            Limit const descriptors(RLIMIT_NOFILE, row.descriptors);
+            design.model.Execute(("WRITE VHDL -NOHEADER \"" + row.file + "\"").c_str());
+        }
+        EXPECT_EQ(design.model.GetLastWrite().error, row.error);
+        EXPECT_EQ(OpenDescriptors(), open);
+        for (std::string const &path : {folder.Path("again"), folder.Path("as ever")})
+            design.model.Execute(("WRITE VHDL -NOHEADER \"" + path + "\"").c_str());
+        EXPECT_EQ(design.model.GetLastWrite().error, 0);
+        EXPECT_EQ(ReadFile(folder.Path("again")), ReadFile(folder.Path("as ever")));
+        EXPECT_NE(ReadFile(folder.Path("again")).find("q <= q_DUMMY;"), std::string::npos);
+    }
+}
+
+TEST(Faults, ReadsWithoutEndLeaveNoDescriptor) {
+    TempDir folder;
+    WriteFile(folder.Path("good"), "NOOP\n");
+    WriteFile(folder.Path("bad"), "NOOP\nbogus\nNOOP\n");
+    Design design;
+    std::size_t const open = OpenDescriptors();
+    for (int i = 0; i < 2000; ++i) {
+        EXPECT_TRUE(design.model.Read(folder.Path("good").c_str()));
+        EXPECT_EQ(MessageOf([&] { design.model.Read(folder.Path("bad").c_str()); }),
+                  "Command not find.\n");
+        EXPECT_FALSE(design.model.Read(folder.Path("none").c_str()));
+        EXPECT_FALSE(design.model.Read(folder.Path("").c_str()));
+    }
+    EXPECT_EQ(OpenDescriptors(), open);
+    {
+        Limit const none(RLIMIT_NOFILE, 3);
+        EXPECT_FALSE(design.model.Read(folder.Path("good").c_str()));
+    }
+    EXPECT_TRUE(design.model.Read(folder.Path("good").c_str()));
+}
+
+/// Whom a client names opens the files instead of the library.
+TEST(Faults, AClientOpensTheFiles) {
+    struct Opener : WriteOpener {
+        std::string asked;
+        int error = 0;
+        int Open(char const *fileName, bool append) override {
+            asked += fileName + std::string(append ? "+ " : " ");
+            errno = error;
+            return -1;
+        }
+    } opener;
+    Design design;
+    design.model.SetWriteOpener(&opener);
+    opener.error = EPERM;
+    design.model.Execute("WRITE VHDL /no/where");
+    EXPECT_EQ(design.model.GetLastWrite().error, EPERM);
+    design.model.Execute("WRITE VERILOG -APPEND elsewhere");
+    EXPECT_EQ(opener.asked, "/no/where elsewhere+ ");
+    EXPECT_STREQ(design.model.GetLastWrite().fileName, "elsewhere");
+}
+
+} // namespace

@@ -102,7 +102,7 @@ TEST(CommandLanguage, HasSixtyOneKeywordsEachWithItsClass) {
         char const *className;
         std::type_info const &type;
     };
-#define ROW(keyword, Class, grammar) {keyword, #Class, typeid(Class)},
+#define ROW(keyword, Class, ...) {keyword, #Class, typeid(Class)},
     std::vector<Row> const table = {VESK_HDL_COMMANDS(ROW)};
 #undef ROW
     std::vector<Keyword> const language = Language();

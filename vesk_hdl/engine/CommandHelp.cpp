@@ -9,7 +9,7 @@ namespace Vesk_Hdl {
 
 namespace {
 
-#define HELP(keyword, Class, grammar) {keyword, grammar},
+#define HELP(name, Class, ...) {.keyword = name, .grammar = __VA_ARGS__},
 constexpr CommandHelp COMMANDS[] = {VESK_HDL_COMMANDS(HELP)};
 #undef HELP
 

@@ -9,7 +9,7 @@ namespace Vesk_Hdl {
 // which stands with the bodies in the file of its family: DesignCommands.cpp,
 // AttributeCommands.cpp, OptionCommands.cpp, WriteCommands.cpp. GetKeyword comes from the table, in
 // HdlCmd.cpp.
-#define VESK_HDL_DECLARE_COMMAND(keyword, Class, grammar)                                          \
+#define VESK_HDL_DECLARE_COMMAND(keyword, Class, ...)                                              \
     class Class : public Command {                                                                 \
     public:                                                                                        \
         explicit Class(Model *owner);                                                              \

@@ -30,7 +30,7 @@ Model &Command::RequireModel() const {
     return *commandModel;
 }
 
-#define KEYWORD_OF(keyword, Class, grammar)                                                        \
+#define KEYWORD_OF(keyword, Class, ...)                                                            \
     char const *Class::GetKeyword() const { return keyword; }
 VESK_HDL_COMMANDS(KEYWORD_OF)
 #undef KEYWORD_OF
@@ -51,7 +51,7 @@ struct CommandFactory::Record {
 CommandFactory::CommandFactory() : record(nullptr) {
     auto made = std::make_unique<Record>(); // stays owned until all commands are known
     record = made.get();
-#define REGISTER(keyword, Class, grammar)                                                          \
+#define REGISTER(keyword, Class, ...)                                                              \
     AddCommandCreator(                                                                             \
         keyword, [](Model *model, StringArray const &) -> Command * { return new Class(model); });
     VESK_HDL_COMMANDS(REGISTER)

@@ -78,19 +78,4 @@ TEST(File, ReadsWholeInSpiteOfSignals) {
     writer.join();
 }
 
-TEST(File, TellsFailures) {
-    EXPECT_EQ(OpenToRead("/nowhere/in"), nullptr);
-    EXPECT_EQ(errno, ENOENT);
-    Stream *const full = File::open("/dev/full", Stream::ACCESS_REPLACE, true);
-    *full << "text";
-    EXPECT_EQ(full->flush().GetError(), ENOSPC);
-    EXPECT_FALSE(File::close(full));
-}
-
-TEST(FileName, TellsTheLastComponent) {
-    for (auto const &[path, tail] :
-         {std::pair{"", ""}, {"a.v", "a.v"}, {"/x/a.v", "a.v"}, {"x/", ""}, {"c:\\a.v", "c:\\a.v"}})
-        EXPECT_STREQ(Basis::FileName(path).GetTail(), tail) << path;
-}
-
 } // namespace

@@ -86,9 +86,12 @@ void ExpectAttrs(std::string const &family, std::vector<AttrRow> const &rows) {
                 std::string const message = row.message ? row.message : Invalid(keyword);
                 std::string const attrs = row.attrs ? row.attrs : "U()=on NONE NONE";
                 EXPECT_EQ(message, Refusal(design.model, {line})) << line;
-                EXPECT_EQ((attrs[0] == 'W' ? "" : "W=8 NONE NONE; ") + attrs,
-                          AttrsOf(owner.Attrs(design.model)))
-                    << line;
+                for (Owner const &each : Owners())
+                    EXPECT_EQ(each.words != owner.words ? "W=8 NONE NONE; U()=on NONE NONE"
+                              : attrs[0] == 'W'         ? attrs
+                                                        : "W=8 NONE NONE; " + attrs,
+                              AttrsOf(each.Attrs(design.model)))
+                        << line << " " << each.words;
                 EXPECT_EQ(message.empty() || row.attrs, design.model.IsModified()) << line;
             }
 }
@@ -154,6 +157,7 @@ TEST(CommandLanguage, Comments) {
             std::string const line = keyword + " " + owners[i].Name() + " " + words;
             EXPECT_EQ(comment ? "" : Invalid(keyword), Refusal(design.model, {line})) << line;
             EXPECT_STREQ(comment ? comment : "old\n", object.GetComment()) << line;
+            EXPECT_FALSE(design.model.IsModified()) << line;
         }
 }
 

@@ -13,37 +13,7 @@ namespace {
 /// Six owners without attributes, in a model that counts as unchanged.
 struct Bare : Design {
     Bare() : Design(CellsAnd("sig s")) { model.SetModifiedFlag(false); }
-
-    /// Whether the model changed since the last call.
-    bool TakeModified() {
-        bool const modified = model.IsModified();
-        model.SetModifiedFlag(false);
-        return modified;
-    }
 };
-
-TEST(ModelAttributes, EachOperationChangesItsOwnerAlone) {
-    for (Owner const &owner : Owners()) {
-        Bare design;
-        for (char const *const pattern :
-             {"ADD @ ATTRIBUTE % -TYPE=user A[1] x", "ADD @ ATTRIBUTE % a(1) z",
-              "SET @ ATTRIBUTE VALUE % a(1) y", "SET @ ATTRIBUTE OPTION % a(1) -GENERIC=nosyn",
-              "SET @ ATTRIBUTE OPTION % a(1) -SYNATTR=assignnodec",
-              "SET @ ATTRIBUTE USERTYPE % a(1) STATE"}) {
-            EXPECT_EQ("", Refusal(design.model, {owner.Line(pattern)}));
-            EXPECT_TRUE(design.TakeModified()) << owner.Line(pattern);
-        }
-        EXPECT_EQ("", Refusal(design.model, {owner.Line("ADD @ COMMENT % c")}));
-        EXPECT_FALSE(design.TakeModified()) << owner.words;
-        for (Owner const &other : Owners()) {
-            bool const own = other.words == owner.words;
-            EXPECT_EQ(own ? "A(1)(STATE)=y NOSYN ASSIGNNODEC" : "",
-                      AttrsOf(other.Attrs(design.model)))
-                << owner.words << " " << other.words;
-            EXPECT_STREQ(own ? "c\n" : "", other.find(design.model).GetComment()) << owner.words;
-        }
-    }
-}
 
 TEST(ModelAttributes, MissingOwners) {
     Bare design;
@@ -133,10 +103,10 @@ TEST(ModelAttributes, AnInstanceChangesItsOwnCopy) {
         EXPECT_EQ("", Refusal(m, {"ADD COMPONENT ATTRIBUTE CELL -TYPE=Integer W 8",
                                   "SET COMPONENT ATTRIBUTE OPTION CELL W -GENERIC=SYN "
                                   "-SYNATTR=ASSIGN"}));
-        design.TakeModified();
         for (int times = 0; times < 2; ++times) { // the second changes the same copy
+            m.SetModifiedFlag(false);
             EXPECT_EQ(message, Refusal(m, {std::string("SET INSTANCE ATTRIBUTE ") + line}));
-            EXPECT_EQ(*message == '\0', design.TakeModified());
+            EXPECT_EQ(*message == '\0', m.IsModified());
             EXPECT_EQ(own, AttrsOf(*m.GetInstance("u1")));
         }
         EXPECT_EQ("", AttrsOf(*m.GetInstance("u2")));

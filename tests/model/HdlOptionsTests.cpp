@@ -34,28 +34,19 @@ TEST(HdlOptions, Words) {
 }
 
 TEST(HdlOptions, CopiesTakeAllButTheMacroFlag) {
-    HdlOptions o;
-    HdlOptions::VhdlOption &v = o.vhdlOption;
-    HdlOptions::VerilogOption &w = o.verilogOption;
-    v.suppressConfiguration = v.flattenBus = v.useAttrType = v.suppressComponent = true;
-    v.useDefaultLibrary = v.openPin = o.writeHeader = o.portOnePerLine = false;
-    v.libraries.Add("l");
-    v.useLibraries.Add("u");
-    w.includes.Add("i");
-    w.SetSynthesisType("SYNOPSYS");
-    w.signalCase = HdlOptions::VerilogOption::CASE_UPPER;
-    w.instanceCase = w.componentCase = HdlOptions::VerilogOption::CASE_LOWER;
-    o.application = "a";
-    o.commandStr = "c";
-    o.device = "d";
-    o.purpose = "p";
-    o.reference = "r";
+    Design design(Pieces(
+        "SUPPRESS CONFIGURATION; FLATTEN BUS; USE ATTRTYPE; SUPPRESS COMPONENT; Set Device d;"
+        "USE DEFAULT LIBRARY false; Set Open Pin false; ADD LIBRARY l; ADD USE LIBRARY u;"
+        "ADD INCLUDE i; SET SYNTHESIS SYNOPSYS; UPPERCASE siganl; LOWERCASE instance;"
+        "LOWERCASE component; Set Application a; Set Command c; Set Purpose p; Set Reference r"));
+    HdlOptions &o = *design.model.GetOptions();
+    o.writeHeader = o.portOnePerLine = false;
     o.macroNetlist = true;
     HdlOptions const copy(o);
     HdlOptions assigned;
     assigned = o;
     o = *&o;
-    v.libraries.Add("more");
+    o.vhdlOption.libraries.Add("more");
     for (HdlOptions const *const each : std::vector<HdlOptions const *>{&copy, &assigned}) {
         EXPECT_EQ("noconfig=1 flat=1 default=0 type=1 open=0 nocomp=1 syn=3 signal=11 instance=12 "
                   "component=12 header=0 oneperline=0 lib=l use=u include=i app=a command=c "
@@ -63,7 +54,7 @@ TEST(HdlOptions, CopiesTakeAllButTheMacroFlag) {
                   Changed(*each));
         EXPECT_FALSE(each->macroNetlist);
     }
-    EXPECT_TRUE(o.macroNetlist && v.libraries.GetSize() == 2);
+    EXPECT_TRUE(o.macroNetlist && o.vhdlOption.libraries.GetSize() == 2);
 }
 
 } // namespace

@@ -105,21 +105,17 @@ TEST(NetlistPasses, OpenInputPinsGetSignalsOfTheirOwn) {
 }
 
 TEST(NetlistPasses, VendorCellsBecomeBlackBoxes) {
-    struct Row {
-        char const *attribute, *attributes; ///< one attribute, and all of them afterwards
-    };
-    for (Row const &row :
-         {Row{"LEVEL orvane", "LEVEL=orvane NONE NONE; BOX_TYPE=BLACK_BOX NONE ASSIGN"},
-          Row{"LEVEL ORVANE2", "LEVEL=ORVANE2 NONE NONE"}, Row{"X ORVANE", "X=ORVANE NONE NONE"}}) {
-        Design design({"ADD COMPONENT C", std::string("ADD COMPONENT ATTRIBUTE C ") + row.attribute,
-                       "ADD COMPONENT OWN", "ADD COMPONENT ATTRIBUTE OWN Level ORVANE",
-                       "ADD COMPONENT ATTRIBUTE OWN Box_Type WHITE"});
-        for (int round = 0; round < 2; ++round)
-            design.netlist.SetBoxTypeAttribute();
-        EXPECT_EQ(row.attributes, AttrsOf(*design.model.GetComponent("C")));
-        EXPECT_EQ("Level=ORVANE NONE NONE; Box_Type=WHITE NONE NONE",
-                  AttrsOf(*design.model.GetComponent("OWN")));
-    }
+    Design design(Short("ADD COMPONENT C; ADD COMPONENT ATTRIBUTE C LEVEL orvane; ADD COMPONENT D;"
+                        "ADD COMPONENT ATTRIBUTE D Level ORVANE2; ADD COMPONENT OWN;"
+                        "ADD COMPONENT ATTRIBUTE OWN Level ORVANE;"
+                        "ADD COMPONENT ATTRIBUTE OWN Box_Type WHITE"));
+    for (int round = 0; round < 2; ++round)
+        design.netlist.SetBoxTypeAttribute();
+    for (auto const &[name, attributes] :
+         {std::pair{"C", "LEVEL=orvane NONE NONE; BOX_TYPE=BLACK_BOX NONE ASSIGN"},
+          {"D", "Level=ORVANE2 NONE NONE"},
+          {"OWN", "Level=ORVANE NONE NONE; Box_Type=WHITE NONE NONE"}})
+        EXPECT_EQ(attributes, AttrsOf(*design.model.GetComponent(name)));
 }
 
 } // namespace

@@ -28,11 +28,10 @@ std::unique_ptr<Stream> OpenToRead(std::string const &path) {
 TEST(File, ReadsLinesWithoutTheirEnds) {
     TempDir const folder;
     std::string const longLine(200000, 'x');
-    for (auto const &[bytes, expected] : {std::pair{"", ""},
-                                          {"a\n", "a|"},
-                                          {"\n\na\n\n", "||a||"},
-                                          {"\xFF\n\xE4\n", "\xFF|\xE4|"},
-                                          {"a\r\n\r\nb\rc\n", "a||b\rc|"}}) {
+    using Row = std::pair<char const *, char const *>;
+    for (auto const &[bytes, expected] :
+         {Row{"", ""}, Row{"\n\na\n\n", "||a||"}, Row{"\xFF\n\xE4\n", "\xFF|\xE4|"},
+          Row{"a\r\n\r\nb\rc\n", "a||b\rc|"}}) {
         WriteFile(folder.Path("in"), bytes + longLine); // which no line end follows
         auto const stream = OpenToRead(folder.Path("in"));
         std::string lines;

@@ -63,10 +63,7 @@ TEST(StringArray, IndexesOutsideAreHarmless) {
     array.SetAt(1, "c");
     StringArray const copy(array);
     array.SetAt(4, array.At(0)); // the array moves under its own string
-    EXPECT_EQ(Bars(array), "a|c|||a|");
-    EXPECT_EQ(Bars(copy), "a|c|");
-    StringArray &same = array;
-    array = same;
+    array = *&array;
     EXPECT_EQ(array.Add(array.At(1)), 5);
     array.Add(copy);
     EXPECT_STREQ(array.Concatenate(", "), "a, c, , , a, c, a, c");

@@ -165,10 +165,11 @@ TEST(IStringPtrMap, AnswersLikeANaiveMap) {
     IStringPtrMap<int *> assigned;
     assigned.Add("no letters of those", values.data());
     assigned = map;
+    IStringPtrMap<int *> const copy(map);
     map.Empty();
     EXPECT_TRUE(map.IsEmpty() && !assigned.Contains("no letters of those"));
     for (auto const &[name, pointer] : naive)
-        ASSERT_EQ(assigned.Get(name.c_str()), pointer) << name;
+        ASSERT_TRUE(assigned.Get(name.c_str()) == pointer && copy.Get(name.c_str()) == pointer);
 }
 
 } // namespace

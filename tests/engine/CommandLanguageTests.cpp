@@ -1,12 +1,13 @@
 #include <cctype>
-#include <set>
-#include <typeinfo>
+#include <memory>
 
 #include <gtest/gtest.h>
 
 #include "tests/support/Lines.h"
+#include "tests/support/MemoryFile.h"
+#include "tests/support/Options.h"
 #include "tests/support/Owners.h"
-#include "vesk_hdl/engine/Commands.h"
+#include "vesk_hdl/engine/CommandTable.h"
 
 using namespace Vesk_Hdl;
 
@@ -20,348 +21,219 @@ std::string Lower(std::string text) {
 
 std::string Invalid(std::string const &keyword) { return keyword + ": Invalid Arguments.\n"; }
 
-/// The text with `with` in place of the mark.
-std::string Put(std::string text, char mark, std::string const &with) {
-    std::size_t const at = text.find(mark);
-    return at == std::string::npos ? text : text.replace(at, 1, with);
-}
-
-/// A line for an owner, from a pattern with `@` for its words and `%` for its name.
-std::string LineOf(Owner const &owner, std::string const &pattern) {
-    return Put(Put(pattern, '@', owner.words), '%', owner.Name());
-}
-
-/// Lines of a design in which each owner has an integer attribute W and a user attribute U.
-Lines Owned() {
-    Lines lines = CellsAnd({"ADD SIGNAL s"});
-    for (Owner const &owner : Owners()) {
-        lines.push_back(LineOf(owner, "ADD @ ATTRIBUTE % -TYPE=Integer W 8"));
-        lines.push_back(LineOf(owner, "ADD @ ATTRIBUTE % -TYPE=User U on"));
+/// A design in which each owner has an integer attribute W and a user attribute U.
+struct Owned : Design {
+    Owned() : Design(CellsAnd("sig s")) {
+        for (Owner const &owner : Owners())
+            EXPECT_EQ("", Refusal(model, {owner.Line("ADD @ ATTRIBUTE % -TYPE=Integer W 8"),
+                                          owner.Line("ADD @ ATTRIBUTE % -TYPE=User U on")}));
+        model.SetModifiedFlag(false);
     }
-    return lines;
-}
-
-/// A keyword, the class of its command, and arguments that are just enough.
-struct Keyword {
-    std::string keyword;
-    std::string className;
-    std::string arguments;
 };
 
-/// The whole language, in the order of its registration.
-std::vector<Keyword> Language() {
-    std::vector<Keyword> all = {{"NOOP", "NoOperationCommand", ""},
-                                {"SET NETLIST NAME", "SetNetlistNameCommand", "n"},
-                                {"SET SOURCE FILE", "SetSourceFileCommand", "f"},
-                                {"ADD COMPONENT", "AddComponentCommand", "C"},
-                                {"ADD PIN", "AddPinCommand", "CELL p in"},
-                                {"ADD INSTANCE", "AddInstanceCommand", "CELL u9"},
-                                {"ADD PORT", "AddPortCommand", "p out"},
-                                {"ADD SIGNAL", "AddSignalCommand", "t"},
-                                {"CONNECT SIGNAL", "ConnectSignalCommand", "s u1.A"},
-                                {"ASSIGN CONSTANT", "AssignConstantCommand", "s 1"},
-                                {"WRITE VERILOG", "WriteVerilogCommand", "/dev/null"},
-                                {"ADD INCLUDE", "AddIncludeCommand", "i.v"},
-                                {"SET SYNTHESIS", "SetSynthesisCommand", "QRT"},
-                                {"UPPERCASE", "UppercaseCommand", "siganl"},
-                                {"LOWERCASE", "LowercaseCommand", "signal"},
-                                {"WRITE VHDL", "WriteVhdlCommand", "/dev/null"},
-                                {"FLATTEN BUS", "FlattenBusCommand", ""},
-                                {"SUPPRESS CONFIGURATION", "SuppressConfigurationCommand", ""},
-                                {"SUPPRESS COMPONENT", "SuppressComponentCommand", ""},
-                                {"USE DEFAULT LIBRARY", "UseDefaultLibraryCommand", ""},
-                                {"ADD LIBRARY", "AddLibraryCommand", "l"},
-                                {"ADD USE LIBRARY", "AddUseLibraryCommand", "l.p.ALL"},
-                                {"ADD NOTES", "AddNotesCommand", "note"},
-                                {"SET PORT ONEPERLINE", "SetPortOnePerLineCommand", ""}};
-    for (Keyword const &family : std::vector<Keyword>{
-             {"ADD @ COMMENT", "Add@CommentCommand", "% c"},
-             {"ADD @ ATTRIBUTE", "Add@AttrCommand", "% N"},
-             {"SET @ ATTRIBUTE VALUE", "Set@AttrValueCommand", "% U v"},
-             {"SET @ ATTRIBUTE USERTYPE", "Set@AttrUserTypeCommand", "% U t"},
-             {"SET @ ATTRIBUTE OPTION", "Set@AttrOptionCommand", "% U -GENERIC=SYN"}})
-        for (Owner const &owner : Owners())
-            all.push_back({LineOf(owner, family.keyword),
-                           Put(family.className, '@', owner.className),
-                           LineOf(owner, family.arguments)});
-    for (Keyword const &keyword :
-         std::vector<Keyword>{{"Use AttrType", "UseAttrTypeCommand", ""},
-                              {"Set Application", "SetApplicationCommand", "a"},
-                              {"Set Command", "SetCommandStrCommand", "c"},
-                              {"Set Device", "SetDeviceCommand", "d"},
-                              {"Set Purpose", "SetPurposeCommand", "p"},
-                              {"Set Reference", "SetReferenceCommand", "r"},
-                              {"Set Open Pin", "SetOpenPinCommand", ""}})
-        all.push_back(keyword);
-    return all;
+/// The whole language: keywords, each with arguments that are just enough.
+std::vector<std::pair<std::string, std::string>> Language() {
+    std::string language =
+        "NOOP=; SET NETLIST NAME=n; SET SOURCE FILE=f; ADD COMPONENT=C; ADD PIN=CELL p in;"
+        "ADD INSTANCE=CELL u9; ADD PORT=p out; ADD SIGNAL=t; CONNECT SIGNAL=s u1.A;"
+        "ASSIGN CONSTANT=s 1; WRITE VERILOG=/dev/null; ADD INCLUDE=i.v; SET SYNTHESIS=QRT;"
+        "UPPERCASE=siganl; LOWERCASE=signal; WRITE VHDL=/dev/null; FLATTEN BUS=;"
+        "SUPPRESS CONFIGURATION=; SUPPRESS COMPONENT=; USE DEFAULT LIBRARY=; ADD LIBRARY=l;"
+        "ADD USE LIBRARY=l.p.ALL; ADD NOTES=note; SET PORT ONEPERLINE=; Use AttrType=;"
+        "Set Application=a; Set Command=c; Set Device=d; Set Purpose=p; Set Reference=r;"
+        "Set Open Pin=";
+    for (Owner const &owner : Owners())
+        for (char const *const family :
+             {";ADD @ COMMENT=% c", ";ADD @ ATTRIBUTE=% N", ";SET @ ATTRIBUTE VALUE=% U v",
+              ";SET @ ATTRIBUTE USERTYPE=% U t", ";SET @ ATTRIBUTE OPTION=% U -GENERIC=SYN"})
+            language += owner.Line(family);
+    return Pairs(language);
 }
 
-TEST(CommandLanguage, HasSixtyOneKeywordsEachWithItsClass) {
-    struct Row {
-        char const *keyword;
-        char const *className;
-        std::type_info const &type;
-    };
-#define ROW(keyword, Class, ...) {keyword, #Class, typeid(Class)},
-    std::vector<Row> const table = {VESK_HDL_COMMANDS(ROW)};
-#undef ROW
-    std::vector<Keyword> const language = Language();
-    ASSERT_EQ(61U, language.size());
-    ASSERT_EQ(61U, table.size());
-    std::set<std::string> seen;
-    for (std::size_t i = 0; i < language.size(); ++i) {
-        EXPECT_EQ(language[i].keyword, table[i].keyword);
-        EXPECT_EQ(language[i].className, table[i].className);
-        std::string const line = Lower(table[i].keyword);
-        EXPECT_TRUE(seen.insert(line).second) << line;
-        std::unique_ptr<Command> const made(CommandFactory().CreateCommand(nullptr, line.c_str()));
-        Command const &command = *made;
-        EXPECT_EQ(table[i].type, typeid(command)) << line;
-        EXPECT_EQ(language[i].keyword, command.GetKeyword());
-    }
-}
-
-TEST(CommandLanguage, EachCommandRunsOnJustEnoughArgumentsAndNeedsAModel) {
-    for (Keyword const &row : Language()) {
-        std::string const line = Lower(row.keyword) + " " + row.arguments;
-        Design design(Owned());
+TEST(CommandLanguage, EachKeywordRunsOnJustEnoughArgumentsAndNeedsAModel) {
+    EXPECT_EQ(static_cast<std::size_t>(CommandReference::GetCount()), Language().size());
+    for (auto const &[keyword, arguments] : Language()) {
+        std::string const line = Lower(keyword) + " " + arguments;
+        Owned design;
+        std::unique_ptr<Command> const made(design.factory.CreateCommand(nullptr, line.c_str()));
+        EXPECT_STREQ(keyword.c_str(), made ? made->GetKeyword() : "none") << line;
         EXPECT_EQ("", Refusal(design.model, {line})) << line;
-        EXPECT_EQ(row.arguments.empty() ? "" : Invalid(row.keyword),
+        EXPECT_EQ(arguments.empty() ? "" : Invalid(keyword),
                   Refusal(design.model, {line.substr(0, line.rfind(' '))}))
             << line;
         StringArray const tokens(line.c_str(), " ", true, "\"\"''");
         CommandManager manager;
-        EXPECT_EQ(row.keyword == "NOOP" ? "" : "Missing Model.\n",
+        EXPECT_EQ(keyword == "NOOP" ? "" : "Missing Model.\n",
                   MessageOf([&] { manager.CreateAndExecute(tokens, nullptr, &design.factory); }))
             << line;
     }
 }
 
-// What the families make of their words, on all six owners.
-
 struct AttrRow {
-    char const *words;   ///< behind keyword and owner
+    char const *words;   ///< what may stand behind keyword and owner, several between semicolons
     char const *message; ///< null for invalid arguments
-    char const *attrs;   ///< afterwards; null if they are as they were
+    char const *attrs;   ///< afterwards, of U or behind it; null if all are as they were
 };
 
 void ExpectAttrs(std::string const &family, std::vector<AttrRow> const &rows) {
     for (Owner const &owner : Owners())
-        for (AttrRow const &row : rows) {
-            Design design(Owned());
-            std::string const keyword = LineOf(owner, family);
-            std::string const line = keyword + " " + owner.Name() + " " + row.words;
-            EXPECT_EQ(row.message ? row.message : Invalid(keyword), Refusal(design.model, {line}))
-                << line;
-            EXPECT_EQ(row.attrs ? row.attrs : "W=8 NONE NONE; U()=on NONE NONE",
-                      AttrsOf(owner.Attrs(design.model)))
-                << line;
-        }
+        for (AttrRow const &row : rows)
+            for (std::string const &words : Pieces(row.words)) {
+                Owned design;
+                std::string const keyword = owner.Words(family);
+                std::string const line = keyword + " " + owner.Name() + " " + words;
+                std::string const message = row.message ? row.message : Invalid(keyword);
+                std::string const attrs = row.attrs ? row.attrs : "U()=on NONE NONE";
+                EXPECT_EQ(message, Refusal(design.model, {line})) << line;
+                for (Owner const &each : Owners())
+                    EXPECT_EQ(each.words != owner.words ? "W=8 NONE NONE; U()=on NONE NONE"
+                              : attrs[0] == 'W'         ? attrs
+                                                        : "W=8 NONE NONE; " + attrs,
+                              AttrsOf(each.Attrs(design.model)))
+                        << line << " " << each.words;
+                EXPECT_EQ(message.empty() || row.attrs, design.model.IsModified()) << line;
+            }
 }
 
 TEST(CommandLanguage, AddAttribute) {
-#define BOTH "W=8 NONE NONE; U()=on NONE NONE; "
-    ExpectAttrs("ADD @ ATTRIBUTE", {{"INIT", "", BOTH "INIT= NONE NONE"},
-                                    {"INIT 'a b' c", "", BOTH "INIT=a b NONE NONE"},
-                                    {"INIT '\"a\"' c", "", BOTH "INIT=\"a\" NONE NONE"},
-                                    {"'' v", "", BOTH "=v NONE NONE"},
-                                    {"-TYPE=Integer N 8x", "", BOTH "N=8 NONE NONE"},
-                                    {"-type=FLOAT N 2 -TYPE=Bit", "", BOTH "N=2.0 NONE NONE"},
-                                    {"-TYPE=bitvector N 8:h:F", "", BOTH "N=F NONE NONE"},
-                                    {"-TYPE=Boolean N", "", BOTH "N=FALSE NONE NONE"},
-                                    {"-TYPE=User -TYPE=x v", "", BOTH ":TYPE=x()=v NONE NONE"},
-                                    {"-TYPE Integer N", "", BOTH ":TYPE=Integer NONE NONE"},
-                                    {"N[1] -TYPE=Bit", "", BOTH "N(1)=-TYPE=Bit NONE NONE"},
-                                    {"-TYPE=Bit w 9", "", "W=9 NONE NONE; U()=on NONE NONE"},
-                                    {"", nullptr, nullptr},
-                                    {"''", nullptr, nullptr}, // an empty last word is lost
-                                    {"-TYPE=Integer", nullptr, nullptr},
-                                    {"-TYPE= N v", "Invalid attribute type.\n", nullptr},
-                                    {"-TYPE=Word N v", "Invalid attribute type.\n", nullptr},
-                                    {"'-TYPE=Bit ' N", "Invalid attribute type.\n", nullptr}});
-#undef BOTH
+    ExpectAttrs(
+        "ADD @ ATTRIBUTE",
+        {{"INIT", "", "U()=on NONE NONE; INIT= NONE NONE"},
+         {"INIT 'a b' c", "", "U()=on NONE NONE; INIT=a b NONE NONE"},
+         {"INIT '\"a\"' c", "", "U()=on NONE NONE; INIT=\"a\" NONE NONE"},
+         {"'' v", "", "U()=on NONE NONE; =v NONE NONE"},
+         {"-TYPE=Integer N 8x;-type=bitvector N 2:h:8", "", "U()=on NONE NONE; N=8 NONE NONE"},
+         {"-type=FLOAT N 2 -TYPE=Bit", "", "U()=on NONE NONE; N=2.0 NONE NONE"},
+         {"-TYPE=User -TYPE=x v", "", "U()=on NONE NONE; :TYPE=x()=v NONE NONE"},
+         {"-TYPE Integer N", "", "U()=on NONE NONE; :TYPE=Integer NONE NONE"},
+         {"N[1] -TYPE=Bit", "", "U()=on NONE NONE; N(1)=-TYPE=Bit NONE NONE"},
+         {"-TYPE=Word w 9", "", "W=9 NONE NONE; U()=on NONE NONE"},
+         {"'';-TYPE=Integer", nullptr, nullptr}, // an empty last word is lost
+         {"-TYPE= N v;-TYPE=Word N v;'-TYPE=Bit ' N", "Invalid attribute type.\n", nullptr}});
 }
 
-TEST(CommandLanguage, SetAttributeValueAndUserType) {
+TEST(CommandLanguage, SetAttribute) {
+    char const *const refused = "Invalid generic value.\n";
     ExpectAttrs("SET @ ATTRIBUTE VALUE",
                 {{"w 12abc x", "", "W=12 NONE NONE; U()=on NONE NONE"},
-                 {"u 'a b'", "", "W=8 NONE NONE; U()=a b NONE NONE"},
-                 {"U '' x", "", "W=8 NONE NONE; U()= NONE NONE"},
-                 {"U", nullptr, nullptr},
-                 {"U ''", nullptr, nullptr},
-                 {"Z 1", "Attribute \"Z\" not found.\n", nullptr},
+                 {"u 'a b'", "", "U()=a b NONE NONE"},
+                 {"U '' x", "", "U()= NONE NONE"},
+                 {"U;U ''", nullptr, nullptr},
                  {"-TYPE=Bit 1", "Attribute \"-TYPE=Bit\" not found.\n", nullptr}});
-    ExpectAttrs("SET @ ATTRIBUTE USERTYPE",
-                {{"u STATE x", "", "W=8 NONE NONE; U(STATE)=on NONE NONE"},
-                 {"U '' x", "", nullptr},
-                 {"U", nullptr, nullptr},
-                 {"W STATE", "Invalid attribute type.\n", nullptr},
-                 {"Z STATE", "Attribute \"Z\" not found.\n", nullptr}});
-}
-
-TEST(CommandLanguage, SetAttributeOption) {
-    char const *const both = "W=8 NONE NONE; U()=on SYN ASSIGN";
-    char const *const generic = "W=8 NONE NONE; U()=on SYN NONE";
-    char const *const refused = "Invalid generic value.\n";
-    ExpectAttrs("SET @ ATTRIBUTE OPTION",
-                {{"u -GENERIC=SYN", "", generic},
-                 {"U -generic=nosyn", "", "W=8 NONE NONE; U()=on NOSYN NONE"},
-                 {"U -SynAttr=AssignNoDec", "", "W=8 NONE NONE; U()=on NONE ASSIGNNODEC"},
-                 {"U -GENERIC=SYN -SYNATTR=ASSIGN -FOO=1", "", both},
-                 {"U -SYNATTR=ASSIGN -GENERIC=SYN", "", both},
-                 {"U -GENERIC=1 -GENERIC=SYN", "", generic}, // the later one counts
-                 {"U -GENERIC=SYN -SYNATTR=2", refused, generic},
-                 {"U -SYNATTR=2 -GENERIC=SYN", refused, generic},
-                 {"U -SYNATTR=ASSIGN -GENERIC=1", refused, nullptr},
-                 {"U -GENERIC=", refused, nullptr},
-                 {"Z -GENERIC=SYN", "Attribute \"Z\" not found.\n", nullptr},
-                 {"Z -SYNATTR=NONE", "Attribute \"Z\" not found.\n", nullptr},
-                 {"U", nullptr, nullptr},
-                 {"U -FOO=1", nullptr, nullptr},
-                 {"U -GENERIC SYN", nullptr, nullptr},
-                 {"U x-GENERIC=SYN", nullptr, nullptr},
-                 {"U -GENERIC=SYN -FOO=2", nullptr, nullptr},
-                 {"U -GENERIC=SYN '' -SYNATTR=ASSIGN", nullptr, nullptr}});
+    ExpectAttrs("SET @ ATTRIBUTE USERTYPE", {{"u STATE x", "", "U(STATE)=on NONE NONE"},
+                                             {"U '' x", "", nullptr},
+                                             {"U", nullptr, nullptr},
+                                             {"W STATE", "Invalid attribute type.\n", nullptr},
+                                             {"Z STATE", "Attribute \"Z\" not found.\n", nullptr}});
+    ExpectAttrs(
+        "SET @ ATTRIBUTE OPTION",
+        {{"u -GENERIC=SYN;U -GENERIC=1 -GENERIC=SYN", "", "U()=on SYN NONE"}, // the later one
+         {"U -generic=nosyn", "", "U()=on NOSYN NONE"},
+         {"U -SynAttr=AssignNoDec", "", "U()=on NONE ASSIGNNODEC"},
+         {"U -GENERIC=SYN -SYNATTR=ASSIGN -FOO=1;U -SYNATTR=ASSIGN -GENERIC=SYN", "",
+          "U()=on SYN ASSIGN"},
+         {"U -GENERIC=SYN -SYNATTR=2;U -SYNATTR=2 -GENERIC=SYN", refused, "U()=on SYN NONE"},
+         {"U -SYNATTR=ASSIGN -GENERIC=1;U -GENERIC=;U -SYNATTR=SYN", refused, nullptr},
+         {"Z -GENERIC=SYN;Z -SYNATTR=NONE", "Attribute \"Z\" not found.\n", nullptr},
+         {"U;U -FOO=1;U -GENERIC SYN;U x-GENERIC=SYN;U -GENERIC=SYN -FOO=2;"
+          "U -GENERIC=SYN '' -SYNATTR=ASSIGN",
+          nullptr, nullptr}});
 }
 
 TEST(CommandLanguage, Comments) {
     std::vector<Owner> owners = Owners();
     owners.push_back(owners[0]); // for ADD NOTES, which is another word for the module's
+    using Row = std::pair<char const *, char const *>;
     for (std::size_t i = 0; i < owners.size(); ++i)
         for (auto const &[words, comment] :
-             std::vector<std::pair<std::string, char const *>>{{"one", "old\none\n"},
-                                                               {"a  b '  c d", "old\na b   c d\n"},
-                                                               {"'' x", "old\n x\n"},
-                                                               {"a \"\" b", "old\na  b\n"},
-                                                               {"-- \"x\"", "old\n-- x\n"},
-                                                               {"", nullptr},
-                                                               {"\"\"", nullptr}}) {
-            Design design(Owned());
+             {Row{"one", "old\none\n"}, Row{"a  b '  c d", "old\na b   c d\n"},
+              Row{"'' x", "old\n x\n"}, Row{"a \"\" b", "old\na  b\n"},
+              Row{"-- \"x\"", "old\n-- x\n"}, Row{"\"\"", nullptr}}) {
+            Owned design;
             Object &object = owners[i].find(design.model);
             object.AddComment("old");
-            std::string const keyword = LineOf(owners[i], i == 6 ? "ADD NOTES" : "ADD @ COMMENT");
+            std::string const keyword = i == 6 ? "ADD NOTES" : owners[i].Words("ADD @ COMMENT");
             std::string const line = keyword + " " + owners[i].Name() + " " + words;
             EXPECT_EQ(comment ? "" : Invalid(keyword), Refusal(design.model, {line})) << line;
             EXPECT_STREQ(comment ? comment : "old\n", object.GetComment()) << line;
+            EXPECT_FALSE(design.model.IsModified()) << line;
         }
 }
 
 TEST(CommandLanguage, PinsAreOneToken) {
-    for (Keyword const &command : Language()) {
-        if (command.keyword.find(" PIN ") == std::string::npos)
+    using Row = std::pair<char const *, char const *>;
+    for (auto const &[keyword, arguments] : Language()) {
+        if (keyword.find(" PIN ") == std::string::npos)
             continue;
-        std::size_t const point = command.arguments.find('.');
-        for (auto const &[pin, message] : std::vector<std::pair<std::string, char const *>>{
-                 {"@.a", ""},
-                 {"@", nullptr},
-                 {"@.", nullptr},
-                 {".@", nullptr},
-                 {"'@ A'", nullptr},
-                 {"@.A.B", "Pin \"A.B\" not found.\n"},
-                 {"@..A", "Pin \".A\" not found.\n"},
-                 {".@.A", "Pin \"A\" not found.\n"},
-                 {"none.A", "Pin \"A\" not found.\n"}}) {
-            std::string const line = command.keyword + " " +
-                                     Put(pin, '@', command.arguments.substr(0, point)) +
-                                     command.arguments.substr(point + 2);
-            Design design(Owned());
-            EXPECT_EQ(message ? message : Invalid(command.keyword), Refusal(design.model, {line}))
-                << line;
+        std::size_t const point = arguments.find('.');
+        for (auto const &[pin, message] :
+             {Row{"@.a", ""}, Row{"@", nullptr}, Row{"@.", nullptr}, Row{".@", nullptr},
+              Row{"'@ A'", nullptr}, Row{"@.A.B", "Pin \"A.B\" not found.\n"},
+              Row{"@..A", "Pin \".A\" not found.\n"}, Row{".@.A", "Pin \"A\" not found.\n"}}) {
+            std::string const line = keyword + " " +
+                                     Owner::Put(pin, '@', arguments.substr(0, point)) +
+                                     arguments.substr(point + 2);
+            Owned design;
+            EXPECT_EQ(message ? message : Invalid(keyword), Refusal(design.model, {line})) << line;
         }
     }
 }
 
-// The options of the output.
-
-/// All fields but the macro flag, by name.
-std::vector<std::pair<std::string, std::string>> Fields(HdlOptions const &o) {
-    HdlOptions::VhdlOption const &v = o.vhdlOption;
-    HdlOptions::VerilogOption const &w = o.verilogOption;
-    auto const number = [](int value) { return std::to_string(value); };
-    auto const list = [](StringArray const &a) { return std::string(a.Concatenate("|")); };
-    return {{"noconfig", number(v.suppressConfiguration)},
-            {"flat", number(v.flattenBus)},
-            {"default", number(v.useDefaultLibrary)},
-            {"lib", list(v.libraries)},
-            {"use", list(v.useLibraries)},
-            {"type", number(v.useAttrType)},
-            {"open", number(v.openPin)},
-            {"nocomp", number(v.suppressComponent)},
-            {"syn", number(w.synthesisType)},
-            {"signal", number(w.signalCase)},
-            {"instance", number(w.instanceCase)},
-            {"component", number(w.componentCase)},
-            {"include", list(w.includes)},
-            {"header", number(o.writeHeader)},
-            {"app", std::string(o.application)},
-            {"command", std::string(o.commandStr)},
-            {"device", std::string(o.device)},
-            {"purpose", std::string(o.purpose)},
-            {"reference", std::string(o.reference)},
-            {"oneperline", number(o.portOnePerLine)}};
-}
-
-/// The fields that are not as they are at first: "flat=1 lib=a|b".
-std::string Changed(HdlOptions const &options) {
-    auto const initial = Fields(HdlOptions());
-    auto const now = Fields(options);
-    std::string text;
-    for (std::size_t i = 0; i < now.size(); ++i)
-        if (now[i] != initial[i])
-            text += (text.empty() ? "" : " ") + now[i].first + "=" + now[i].second;
-    return text;
-}
-
 TEST(CommandLanguage, Options) {
-    struct Row {
-        Lines lines;
-        std::string changed;
-        char const *refused = ""; ///< keyword of the last line, if its arguments are invalid
-    };
-    for (Row const &row : std::vector<Row>{
-             {{"SET PORT ONEPERLINE false x"}, ""},
-             {{"USE ATTRTYPE false x y"}, "type=1"},
-             {{"FLATTEN BUS"}, "flat=1"},
-             {{"FLATTEN BUS falsehood"}, "flat=1"},
-             {{"FLATTEN BUS 0 false"}, "flat=1"},
-             {{"SUPPRESS CONFIGURATION ''"}, "noconfig=1"},
-             {{"SUPPRESS COMPONENT no"}, "nocomp=1"},
-             {{"Set Open Pin false x"}, "open=0"},
-             {{"USE DEFAULT LIBRARY FALSE"}, "default=0"},
-             {{"FLATTEN BUS true", "FLATTEN BUS False"}, ""},
-             {{"SUPPRESS CONFIGURATION", "SUPPRESS CONFIGURATION false"}, ""},
-             {{"SUPPRESS COMPONENT", "SUPPRESS COMPONENT false"}, ""},
-             {{"set open pin false", "set open pin"}, ""},
-             {{"USE DEFAULT LIBRARY false", "USE DEFAULT LIBRARY 0"}, ""},
-             {{"ADD LIBRARY work x", "ADD LIBRARY work"}, "lib=work|work"},
-             {{"ADD LIBRARY '' x"}, "", "ADD LIBRARY"},
-             {{"ADD USE LIBRARY a.b.ALL", "ADD USE LIBRARY c"}, "use=a.b.ALL|c"},
-             {{"ADD USE LIBRARY '' x"}, "", "ADD USE LIBRARY"},
-             {{"ADD INCLUDE 'a b.v' x", "ADD INCLUDE c"}, "include=a b.v|c"},
-             {{"ADD INCLUDE '' x"}, "", "ADD INCLUDE"},
-             {{"SET SYNTHESIS synplicity x"}, "syn=2"},
-             {{"SET SYNTHESIS PRECISION", "SET SYNTHESIS none"}, ""},
-             {{"SET SYNTHESIS '' EXEMPLAR"}, "", "SET SYNTHESIS"},
-             {{"UPPERCASE Instance x", "UPPERCASE SIGANL"}, "signal=11 instance=11"},
-             {{"UPPERCASE component", "UPPERCASE signal"}, "component=11", "UPPERCASE"},
-             {{"UPPERCASE x instance"}, "", "UPPERCASE"},
-             {{"LOWERCASE instance", "LOWERCASE Component"}, "instance=12 component=12"},
-             {{"LOWERCASE Signal", "LOWERCASE siganl"}, "signal=12", "LOWERCASE"},
-             {{"Set Application 'a b' c", "Set Device d e"}, "app=a b device=d"},
-             {{"Set Application '' b"}, "", "Set Application"},
-             {{"Set Device '' b"}, "", "Set Device"},
-             {{"Set Command run  it \"a  b\""}, "command=run it a  b"},
-             {{"set command one", "set command '' two"}, "command= two"},
-             {{"Set Purpose a", "Set Purpose b c", "SET PURPOSE ''"}, "purpose=b c", "Set Purpose"},
-             {{"Set Reference 'a' b", "Set Reference"}, "reference=a b", "Set Reference"},
-             {{"WRITE VHDL -NOHEADER /dev/null"}, "header=0"},
-             {{"WRITE VERILOG -NOHEADER /dev/null", "WRITE VHDL /dev/null"}, ""}}) {
+    // Lines; the options they change; the keyword of the last line, if its arguments are invalid.
+    using Row = std::tuple<char const *, char const *, char const *>;
+    for (auto const &[text, changed, refused] :
+         {Row{"SET PORT ONEPERLINE false x", "", ""},
+          Row{"USE ATTRTYPE false x y", "type=1", ""},
+          Row{"FLATTEN BUS 0 false", "flat=1", ""},
+          Row{"FLATTEN BUS true;FLATTEN BUS False", "", ""},
+          Row{"SUPPRESS CONFIGURATION '';SUPPRESS COMPONENT no", "noconfig=1 nocomp=1", ""},
+          Row{"SUPPRESS CONFIGURATION;SUPPRESS COMPONENT falsehood;SUPPRESS CONFIGURATION false;"
+              "SUPPRESS COMPONENT false",
+              "", ""},
+          Row{"Set Open Pin false x;USE DEFAULT LIBRARY FALSE", "default=0 open=0", ""},
+          Row{"Set Open Pin false;USE DEFAULT LIBRARY false;set open pin;USE DEFAULT LIBRARY 0", "",
+              ""},
+          Row{"ADD LIBRARY work x;ADD LIBRARY work", "lib=work|work", ""},
+          Row{"ADD LIBRARY '' x", "", "ADD LIBRARY"},
+          Row{"ADD USE LIBRARY a.b.ALL;ADD INCLUDE 'a b.v' x;ADD INCLUDE c",
+              "use=a.b.ALL include=a b.v|c", ""},
+          Row{"SET SYNTHESIS synplicity x", "syn=2", ""},
+          Row{"SET SYNTHESIS '' EXEMPLAR", "", "SET SYNTHESIS"},
+          Row{"UPPERCASE Instance x;UPPERCASE SIGANL", "signal=11 instance=11", ""},
+          Row{"UPPERCASE component;UPPERCASE signal", "component=11", "UPPERCASE"},
+          Row{"LOWERCASE instance;LOWERCASE Component", "instance=12 component=12", ""},
+          Row{"LOWERCASE Signal;LOWERCASE siganl", "signal=12", "LOWERCASE"},
+          Row{"Set Application 'a b' c;Set Device d e", "app=a b device=d", ""},
+          Row{"Set Command run  it \"a  b\"", "command=run it a  b", ""},
+          Row{"set command one;set command '' two", "command= two", ""},
+          Row{"Set Purpose b c;SET PURPOSE ''", "purpose=b c", "Set Purpose"},
+          Row{"Set Reference 'a' b;Set Reference", "reference=a b", "Set Reference"}}) {
         Design design;
-        EXPECT_EQ(*row.refused ? Invalid(row.refused) : "", Refusal(design.model, row.lines))
-            << row.lines[0];
-        EXPECT_EQ(row.changed, Changed(*design.model.GetOptions())) << row.lines[0];
-        EXPECT_FALSE(design.model.IsModified()) << row.lines[0];
+        EXPECT_EQ(*refused ? Invalid(refused) : "", Refusal(design.model, Pieces(text))) << text;
+        EXPECT_EQ(changed, Changed(*design.model.GetOptions())) << text;
+        EXPECT_FALSE(design.model.IsModified()) << text;
     }
+}
+
+TEST(CommandReference, ItsExamplesRunAndItsWrongLinesAreRefusedAsTold) {
+    for (int i = 0; i < CommandReference::GetCount(); ++i) {
+        CommandHelp const &help = *CommandReference::GetAt(i);
+        SCOPED_TRACE(help.keyword);
+        EXPECT_EQ(CommandReference::Find(Lower(help.keyword).c_str()), &help);
+        Capture capture;
+        Design design;
+        design.model.SetWriteOpener(&capture);
+        StringArray const lines(help.example, "\n", true, nullptr);
+        for (int line = 0; line < lines.GetSize(); ++line)
+            EXPECT_EQ(Refusal(design.model, {lines.GetAt(line).GetText()}), "");
+        EXPECT_EQ(design.model.GetCommandManager()->GetDoneCommandCount(), lines.GetSize());
+        std::string const told = help.message + std::string(*help.message ? "\n" : "");
+        EXPECT_EQ(Refusal(design.model, {help.wrong}), told);
+    }
+    EXPECT_EQ(CommandReference::GetAt(-1), nullptr);
+    EXPECT_EQ(CommandReference::GetAt(CommandReference::GetCount()), nullptr);
+    EXPECT_EQ(CommandReference::Find("ADD"), nullptr);
 }
 
 } // namespace

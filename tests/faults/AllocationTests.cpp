@@ -16,39 +16,23 @@ namespace {
 using namespace Vesk_Hdl;
 
 /// Every family of commands, all forms of names, widening, and writes that rewrite.
-Lines const DESIGN = CellsAnd({"ADD PORT q out",
-                               "ADD PORT d(7:0) in",
-                               "ADD SIGNAL bus(7:0)",
-                               "CONNECT SIGNAL q u1.Y",
-                               "CONNECT SIGNAL q u2.A",
-                               "CONNECT SIGNAL bus(3:0) u1.B(3:0)",
-                               "CONNECT SIGNAL bus(0) u2.Y",
-                               "CONNECT SIGNAL bus(2),q,d(1:0) u2.B(3:0)",
-                               "CONNECT SIGNAL d(7:0) u1.W(7:0)",
-                               "CONNECT SIGNAL bus(15:0) q",
-                               "CONNECT SIGNAL bus(9:6) bus(3:0)",
-                               "ASSIGN CONSTANT u3.A 1",
-                               "ASSIGN CONSTANT u3.B(3:0) 4:h:A",
-                               "ASSIGN CONSTANT net 0",
-                               "ADD MODULE ATTRIBUTE -TYPE=Integer W 8",
-                               "SET MODULE ATTRIBUTE OPTION W -GENERIC=SYN",
-                               "ADD COMPONENT ATTRIBUTE CELL -TYPE=BitVector INIT 4:b:1010",
-                               "SET INSTANCE ATTRIBUTE VALUE u1 INIT 4:b:0101",
-                               "ADD INSTANCE PIN ATTRIBUTE u1.A K v",
-                               "ADD SIGNAL ATTRIBUTE q -TYPE=User U on",
-                               "SET SIGNAL ATTRIBUTE USERTYPE q U STATE",
-                               "ADD NOTES some words",
-                               "ADD SIGNAL COMMENT q words",
-                               "ADD LIBRARY lib",
-                               "ADD INCLUDE a.v",
-                               "SET SYNTHESIS SYNPLICITY",
-                               "Set Open Pin false",
-                               "Set Purpose to fail",
-                               "WRITE VERILOG x",
-                               "WRITE VHDL x"});
+Lines AllFamilies() {
+    Lines lines = CellsAnd(
+        "port q out; port d(7:0) in; sig bus(7:0); q u1.Y; q u2.A; bus(3:0) u1.B(3:0); bus(0) u2.Y;"
+        "bus(2),q,d(1:0) u2.B(3:0); d(7:0) u1.W(7:0); bus(15:0) q; bus(9:6) bus(3:0); u3.A = 1;"
+        "u3.B(3:0) = 4:h:A; net = 0; ADD MODULE ATTRIBUTE -TYPE=Integer W 8;"
+        "SET MODULE ATTRIBUTE OPTION W -GENERIC=SYN;"
+        "ADD COMPONENT ATTRIBUTE CELL -TYPE=BitVector INIT 4:b:1010;"
+        "SET INSTANCE ATTRIBUTE VALUE u1 INIT 4:b:0101; ADD INSTANCE PIN ATTRIBUTE u1.A K v;"
+        "ADD SIGNAL ATTRIBUTE q -TYPE=User U on; SET SIGNAL ATTRIBUTE USERTYPE q U STATE;"
+        "ADD NOTES some words; ADD SIGNAL COMMENT q words; ADD LIBRARY lib; ADD INCLUDE a.v;"
+        "SET SYNTHESIS SYNPLICITY; SET OPEN PIN false; SET PURPOSE to fail");
+    lines.insert(lines.end(), {"WRITE VERILOG x", "WRITE VHDL x"});
+    return lines;
+}
 
 /// Runs the design; the allocation of that number fails once. False if it was never reached.
-bool RunWithFailure(long number, std::string &line) {
+bool RunWithFailure(Lines const &lines, long number) {
     allocationsLeft = number;
     bool failed = false;
     CommandFactory *factory = nullptr;
@@ -64,8 +48,8 @@ bool RunWithFailure(long number, std::string &line) {
         }
     }
     model->SetWriteOpener(&capture);
-    for (std::size_t i = 0; i < DESIGN.size(); ++i) {
-        line = DESIGN[i];
+    for (std::size_t i = 0; i < lines.size(); ++i) {
+        std::string const &line = lines[i];
         try {
             model->Execute(line.c_str());
         } catch (std::bad_alloc const &) {
@@ -85,9 +69,9 @@ bool RunWithFailure(long number, std::string &line) {
 }
 
 TEST(Faults, AnAllocationFails) {
-    std::string line;
+    Lines const lines = AllFamilies();
     long number = 0;
-    while (RunWithFailure(number, line) && !HasFailure())
+    while (RunWithFailure(lines, number) && !HasFailure())
         ++number;
     EXPECT_GT(number, 300);
 }

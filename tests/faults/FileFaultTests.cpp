@@ -54,8 +54,7 @@ TEST(Faults, AWriteThatFailsIsToldAndLosesNothing) {
           Row{folder.Path("file") + "/x", ENOTDIR}, Row{folder.Path("large"), EFBIG, 300},
           Row{folder.Path("late"), EMFILE, RLIM_INFINITY, 3}}) {
         SCOPED_TRACE(row.file);
-        Design design(CellsAnd({"CONNECT SIGNAL a u1.A", "ADD PORT q out", "CONNECT SIGNAL q u1.Y",
-                                "CONNECT SIGNAL q u2.A"}));
+        Design design(CellsAnd("a u1.A; port q out; q u1.Y; q u2.A"));
         std::size_t const open = OpenDescriptors();
         {
             Limit const size(RLIMIT_FSIZE, row.largest);

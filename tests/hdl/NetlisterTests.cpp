@@ -14,18 +14,16 @@ namespace {
 
 /// A design written without header and without default libraries, its lists on one line.
 struct Written {
-    explicit Written(Design &design, bool onePerLine = false) {
+    explicit Written(Design &design) {
         HdlOptions &options = *design.model.GetOptions();
         options.writeHeader = options.vhdlOption.useDefaultLibrary = false;
-        options.portOnePerLine = onePerLine;
+        options.portOnePerLine = false;
         TextMemOutStream stream;
         VhdlNetlister(stream).WriteNetlist(&design.netlist, &options);
         vhdl = stream.GetValue();
-        vhdlMacro = options.macroNetlist;
         stream.SetValue("");
         VerilogNetlister(stream).WriteNetlist(&design.netlist, options);
         verilog = stream.GetValue();
-        verilogMacro = options.macroNetlist;
     }
     /// The associations of the first instance.
     std::string VhdlPins() const { return Between(vhdl, "port map (", ");\n"); }
@@ -37,46 +35,27 @@ struct Written {
     }
 
     std::string vhdl, verilog;
-    bool vhdlMacro, verilogMacro;
 };
 
-TEST(Netlisters, PinsOfAllFormsOnSignalsOfAllKinds) {
+TEST(Netlisters, PinsOnSignalsOfAnotherForm) {
     using Row = std::array<char const *, 4>; // pin, signal if any, what VHDL and Verilog get
-    for (auto const &[pin, signal, vhdl, verilog] : std::vector<Row>{
-             {"D(3:0)", "", "D=>open", ".D()"},
-             {"D(3:0)", "s", "D(3:0)=>s", ".D(s)"},
-             {"D(3:0)", "OPEN", "D(3:0)=>OPEN", ".D()"},
-             {"D(3:0)", "B(2)", "D(3:0)=>B(2)", ".D(B[2])"},
-             {"D(3:0)", "O(2:2)", "D(3 downto 0)=>O(2)", ".D(O[2])"},
-             {"D(3:0)", "B(4:5)", "D(3)=>B(4), D(2)=>B(5)", ".D(B[4:5])"},
-             {"D(3:0)", "R(3:3)", "D(3 downto 0)=>R(3 downto 3)", ".D(R[3:3])"},
-             {"D(3:0)", "B(0:1),B(7:6)", "D(3)=>B(0), D(2)=>B(1), D(1 downto 0)=>B(7 downto 6)",
+    for (auto const &[pin, signal, vhdl, verilog] :
+         {Row{"D(3:0)", "s", "D(3:0)=>s", ".D(s)"}, Row{"D(3:0)", "OPEN", "D(3:0)=>OPEN", ".D()"},
+          Row{"D(3:0)", "B(2)", "D(3:0)=>B(2)", ".D(B[2])"},
+          Row{"D(3:0)", "R(3:3)", "D(3 downto 0)=>R(3 downto 3)", ".D(R[3:3])"},
+          Row{"D(3:0)", "B(0:1),B(7:6)", "D(3)=>B(0), D(2)=>B(1), D(1 downto 0)=>B(7 downto 6)",
               ".D({B[0:1], B[7:6]})"},
-             {"D(0:3)", "s,B(6:4)", "D(0)=>s, D(1 to 3)=>B(6 downto 4)", ".D({s, B[6:4]})"},
-             {"D(3:0)", "B(7:0),s", "=>B(7 downto 0), =>s", ".D({B[7:0], s})"},
-             {"D(3)", "", "D(3)=>open", ".D()"},
-             {"D(3)", "B(7:0)", "D(3)=>B(7 downto 0)", ".D(B[7:0])"},
-             {"D(3)", "B(0:1)", "D(3)=>B(0), D(3)=>B(1)", ".D(B[0:1])"},
-             {"G(1:1)", "", "G=>open", ".G()"},
-             {"G(1:1)", "s", "G(1)=>s", ".G(s)"},
-             {"G(1:1)", "O(2:2)", "G(1)=>O(2)", ".G(O[2])"},
-             {"G(1:1)", "B(3:3)", "G(1)=>B(3)", ".G(B[3:3])"},
-             {"S", "", "S=>open", ".S()"},
-             {"S", "B(7:0)", "S=>B(7 downto 0)", ".S(B[7:0])"},
-             {"S", "B(3:3)", "=>B(3)", ".S(B[3:3])"},
-             {"S", "s,t", "=>s, =>t", ".S({s, t})"},
-             {"A[3:0]", "", "A(3:0)=>open", ".A(3:0)()"},
-             {"A[3:0]", "R(0:3)", "A(3 downto 0)=>R(0 to 3)", ".A(3:0)(R[0:3])"},
-         }) {
-        Lines lines = {"ADD SIGNAL B(7:0)",
-                       "ADD SIGNAL R(0:7)",
-                       "ADD SIGNAL O(2:2)",
-                       "ADD COMPONENT C",
-                       std::string("ADD PIN C ") + pin + " bi",
-                       "ADD INSTANCE C u1"};
-        if (*signal)
-            lines.push_back(std::string("CONNECT SIGNAL ") + signal + " u1." + pin);
-        Design design(lines);
+          Row{"D(3:0)", "B(7:0),s", "=>B(7 downto 0), =>s", ".D({B[7:0], s})"},
+          Row{"D(3)", "B(7:0)", "D(3)=>B(7 downto 0)", ".D(B[7:0])"},
+          Row{"D(3)", "B(0:1)", "D(3)=>B(0), D(3)=>B(1)", ".D(B[0:1])"},
+          Row{"G(1:1)", "", "G=>open", ".G()"}, Row{"G(1:1)", "O(2:2)", "G(1)=>O(2)", ".G(O[2])"},
+          Row{"S", "B(3:3)", "=>B(3)", ".S(B[3:3])"}, Row{"S", "s,t", "=>s, =>t", ".S({s, t})"},
+          Row{"A[3:0]", "", "A(3:0)=>open", ".A(3:0)()"},
+          Row{"A[3:0]", "R(0:3)", "A(3 downto 0)=>R(0 to 3)", ".A(3:0)(R[0:3])"}}) {
+        std::string const cell = "ADD COMPONENT C; ADD PIN C " + std::string(pin) + " bi;";
+        std::string const connection = *signal ? std::string(signal) + " u1." + pin : "";
+        Design design(Short("sig B(7:0); sig R(0:7); sig O(2:2); " + cell + "ADD INSTANCE C u1; " +
+                            connection));
         Written const written(design);
         EXPECT_EQ(vhdl, written.VhdlPins()) << pin << " on " << signal;
         EXPECT_EQ(verilog, written.VerilogPins()) << pin << " on " << signal;
@@ -84,7 +63,7 @@ TEST(Netlisters, PinsOfAllFormsOnSignalsOfAllKinds) {
 }
 
 TEST(Netlisters, SignalsThatNoCommandMakes) {
-    Design design({"ADD COMPONENT C", "ADD PIN C D(3:0) bi", "ADD INSTANCE C u1"});
+    Design design(Short("ADD COMPONENT C; ADD PIN C D(3:0) bi; ADD INSTANCE C u1"));
     Bus up("P(0:3)"), nameless(""), open("Open"), rangeless("X");
     BusSlice namelessSlice("", &up), openSlice("oPEN", &up);
     BusIndex namelessIndex("", &up);
@@ -106,26 +85,20 @@ TEST(Netlisters, SignalsThatNoCommandMakes) {
     }
 }
 
-TEST(Netlisters, ListsOnOneLineOrMany) {
-    Design design({"SET NETLIST NAME top", "ADD COMPONENT C", "ADD PIN C I in", "ADD PIN C O out",
-                   "ADD INSTANCE C u1", "ADD PORT A in", "ADD PORT Y out", "CONNECT SIGNAL A u1.I",
-                   "CONNECT SIGNAL Y u1.O"});
-    Written const line(design);
-    Written const lines(design, true);
-    EXPECT_EQ("I=>A, O=>Y", line.VhdlPins());
-    EXPECT_EQ("I=>A,\n          O=>Y", lines.VhdlPins());
-    EXPECT_EQ(".I(A), .O(Y)", line.VerilogPins());
-    EXPECT_EQ(".I(A), \n      .O(Y)", lines.VerilogPins());
-    EXPECT_EQ("A, Y", Written::Between(line.verilog, "module top(", ");\n\n input A;\n"));
-    EXPECT_EQ("A, \n           Y", Written::Between(lines.verilog, "module top(", ");\n\n"));
-    for (Written const *const written : {&line, &lines}) // the ports of an entity never share one
-        EXPECT_EQ("A : in    std_logic; \n       Y : out   std_logic",
-                  Written::Between(written->vhdl, "port ( ", ");\n"));
+TEST(Netlisters, ListsOnOneLine) {
+    Design design(Short("SET NETLIST NAME top; ADD COMPONENT C; ADD PIN C I in; ADD PIN C O out;"
+                        "ADD INSTANCE C u1; port A in; port Y out; A u1.I; Y u1.O"));
+    Written const written(design);
+    EXPECT_EQ("I=>A, O=>Y", written.VhdlPins());
+    EXPECT_EQ(".I(A), .O(Y)", written.VerilogPins());
+    EXPECT_EQ("A, Y", Written::Between(written.verilog, "module top(", ");\n\n input A;\n"));
+    EXPECT_EQ("A : in    std_logic; \n       Y : out   std_logic", // never on one line
+              Written::Between(written.vhdl, "port ( ", ");\n"));
 }
 
 TEST(Netlisters, NoPortsAndNoPins) {
-    Design design({"SET NETLIST NAME m", "ADD COMPONENT C", "ADD COMPONENT UNUSED",
-                   "ADD INSTANCE C u2", "ADD INSTANCE C u1"});
+    Design design(Short("SET NETLIST NAME m; ADD COMPONENT C; ADD COMPONENT UNUSED;"
+                        "ADD INSTANCE C u2; ADD INSTANCE C u1"));
     Written const written(design);
     EXPECT_EQ("\nentity m is\nport ( );\nend m;\n\narchitecture BEHAVIORAL of m is\ncomponent C\n"
               "end component;\n\nbegin\nu1 : C\n;\n\nu2 : C\n;\n\nend BEHAVIORAL;\n\n"
@@ -137,25 +110,9 @@ TEST(Netlisters, NoPortsAndNoPins) {
               written.verilog);
 }
 
-TEST(Netlisters, MacrosOfBothLanguages) {
-    for (auto const &[name, attribute, generic, vhdl, verilog] :
-         std::vector<std::tuple<std::string, std::string, std::string, bool, bool>>{
-             {"aMORVANEb", "INIT", "NOSYN", true, false},
-             {"MORVANE", "INIT", "NONE", false, false},
-             {"MORVANE", "init", "SYN", false, false},
-             {"Morvane", "INIT", "SYN", false, false},
-             {"HORVANE_x", "INIT", "SYN", false, true}}) {
-        Design design({"SET NETLIST NAME " + name, "ADD MODULE ATTRIBUTE " + attribute + " 1",
-                       "SET MODULE ATTRIBUTE OPTION " + attribute + " -GENERIC=" + generic});
-        Written const written(design);
-        EXPECT_EQ(vhdl, written.vhdlMacro) << name << " " << attribute << " " << generic;
-        EXPECT_EQ(verilog, written.verilogMacro) << name << " " << attribute << " " << generic;
-    }
-}
-
 TEST(VhdlNetlister, DeclaresAttributesOnceInItsLife) {
-    Design design({"ADD SIGNAL N", "ADD SIGNAL ATTRIBUTE N K V",
-                   "SET SIGNAL ATTRIBUTE OPTION N K -SYNATTR=ASSIGN"});
+    Design design(Short("sig N; ADD SIGNAL ATTRIBUTE N K V;"
+                        "SET SIGNAL ATTRIBUTE OPTION N K -SYNATTR=ASSIGN"));
     TextMemOutStream stream;
     VhdlNetlister first(stream);
     first.WriteNetlist(nullptr, design.model.GetOptions());

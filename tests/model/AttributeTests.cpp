@@ -1,4 +1,5 @@
-#include <type_traits>
+// What attributes do in the model. The values that each command makes of its words are in the tests
+// of the command language.
 
 #include <gtest/gtest.h>
 
@@ -9,237 +10,109 @@ using namespace Vesk_Hdl;
 
 namespace {
 
-using Text = char const *;
-
-/// The names by which an owner is found; it takes none of them, the first, or both.
-struct Names {
-    Text holder;
-    Text pin;
-};
-
-template <class Operation, class... Rest>
-void Call(Model &model, Operation operation, Names const &names, Rest... rest) {
-    if constexpr (std::is_invocable_v<Operation, Model &, Rest...>)
-        (model.*operation)(rest...);
-    else if constexpr (std::is_invocable_v<Operation, Model &, Text, Rest...>)
-        (model.*operation)(names.holder, rest...);
-    else
-        (model.*operation)(names.holder, names.pin, rest...);
-}
-
-using Set = void (*)(Model &, Names const &, Text name, Text word);
-
-/// The operations on an owner, and how they tell that there is none of the name "none".
-struct Grid : Owner {
-    void (*add)(Model &, Names const &, Text name, Text value, Text type);
-    Set setGeneric, setSyn, setValue, setUserType;
-    void (*comment)(Model &, Names const &, Text text);
-    std::string missing;
-    std::string missingOptions; ///< the same of the two options, for an attribute A
-
-    Names Known() const { return {holder, pin}; }
-};
-
-#define SETTER(operation)                                                                          \
-    [](Model &m, Names const &n, Text a, Text w) { Call(m, &Model::operation, n, a, w); }
-#define ROW(index, Name, Comment, missing, missingOptions)                                         \
-    {                                                                                              \
-        Owners()[index],                                                                           \
-            [](Model &m, Names const &n, Text a, Text v, Text t) {                                 \
-                Call(m, &Model::Add##Name##Attr, n, a, v, t);                                      \
-            },                                                                                     \
-            SETTER(Set##Name##GenericAttrValue), SETTER(Set##Name##SynAttrValue),                  \
-            SETTER(Set##Name##AttrValue), SETTER(Set##Name##UserType),                             \
-            [](Model &m, Names const &n, Text t) { Call(m, &Model::Comment, n, t); }, missing,     \
-            missingOptions                                                                         \
-    }
-
-std::vector<Grid> const &Grids() {
-    static std::vector<Grid> const grids = {
-        ROW(0, Module, AddNotes, "", ""),
-        ROW(1, Component, AddComponentComment, "\"none\" not found.\n", "\"none\" not found.\n"),
-        ROW(2, Instance, AddInstanceComment, "\"none\" not found.\n",
-            "Attribute \"A\" not found.\n"),
-        ROW(3, Signal, AddSignalComment, "\"none\" not found.\n", "\"none\" not found.\n"),
-        ROW(4, ComponentPin, AddComponentPinComment, "Pin \"A\" not found.\n",
-            "Pin \"A\" not found.\n"),
-        ROW(5, InstancePin, AddInstancePinComment, "Pin \"A\" not found.\n",
-            "Pin \"A\" not found.\n")};
-    return grids;
-}
-
 /// Six owners without attributes, in a model that counts as unchanged.
 struct Bare : Design {
-    Bare() : Design(CellsAnd({"ADD SIGNAL s"})) { model.SetModifiedFlag(false); }
-
-    /// Whether the model changed since the last call.
-    bool TakeModified() {
-        bool const modified = model.IsModified();
-        model.SetModifiedFlag(false);
-        return modified;
-    }
+    Bare() : Design(CellsAnd("sig s")) { model.SetModifiedFlag(false); }
 };
 
-TEST(ModelAttributes, EachOperationChangesItsOwnerAlone) {
-    for (Grid const &owner : Grids()) {
-        Bare design;
-        Model &m = design.model;
-        owner.add(m, owner.Known(), "A[1]", "x", "user");
-        EXPECT_TRUE(design.TakeModified()) << owner.words;
-        owner.setValue(m, owner.Known(), "a(1)", "y");
-        EXPECT_TRUE(design.TakeModified()) << owner.words;
-        owner.setGeneric(m, owner.Known(), "a(1)", "nosyn");
-        EXPECT_TRUE(design.TakeModified()) << owner.words;
-        owner.setSyn(m, owner.Known(), "a(1)", "assignnodec");
-        EXPECT_TRUE(design.TakeModified()) << owner.words;
-        owner.setUserType(m, owner.Known(), "a(1)", "STATE");
-        EXPECT_TRUE(design.TakeModified()) << owner.words;
-        for (Owner const &other : Owners())
-            EXPECT_EQ(other.words == owner.words ? "A(1)(STATE)=y NOSYN ASSIGNNODEC" : "",
-                      AttrsOf(other.Attrs(m)))
-                << owner.words << " " << other.words;
-    }
-}
-
-TEST(ModelAttributes, AddSetsTheValueOfTheOneThatIsThere) {
-    for (Grid const &owner : Grids()) {
-        Bare design;
-        Model &m = design.model;
-        owner.add(m, owner.Known(), "W", "8", "Integer");
-        owner.setGeneric(m, owner.Known(), "W", "SYN");
-        for (Text const type : {"String", "no type", "", static_cast<Text>(nullptr)}) {
-            owner.add(m, owner.Known(), "w", "0", nullptr);
-            m.SetModifiedFlag(false);
-            owner.add(m, owner.Known(), "w", "9", type);
-            EXPECT_TRUE(design.TakeModified()) << owner.words;
-            EXPECT_EQ("W=9 SYN NONE", AttrsOf(owner.Attrs(m))) << owner.words;
-        }
-    }
-}
-
-TEST(ModelAttributes, NullValuesAreEmptyAndAnEmptyNameIsAName) {
-    for (Grid const &owner : Grids()) {
-        Bare design;
-        Model &m = design.model;
-        owner.add(m, owner.Known(), "", nullptr, nullptr); // a string, without a type
-        owner.add(m, owner.Known(), "U", "on", "User");
-        owner.setUserType(m, owner.Known(), "U", "STATE");
-        owner.setValue(m, owner.Known(), nullptr, "v");
-        EXPECT_EQ("=v NONE NONE; U(STATE)=on NONE NONE", AttrsOf(owner.Attrs(m))) << owner.words;
-        owner.setUserType(m, owner.Known(), "U", nullptr);
-        owner.setValue(m, owner.Known(), "U", nullptr);
-        owner.add(m, owner.Known(), "", nullptr, nullptr);
-        EXPECT_EQ("= NONE NONE; U()= NONE NONE", AttrsOf(owner.Attrs(m))) << owner.words;
-        EXPECT_EQ(Attribute::VALUE_STRING, owner.Attrs(m).GetAttr("")->GetValueType());
-    }
-}
-
-TEST(ModelAttributes, RefusalsChangeNothing) {
-    struct Row {
-        Text name;
-        void (*call)(Model &, Grid const &);
-        Text message;
-    };
-#define REFUSED(call, message) {#call, [](Model &m, Grid const &o) { o.call; }, message}
-    std::vector<Row> const rows = {
-        REFUSED(add(m, o.Known(), nullptr, "v", "String"), "Invalid Name.\n"),
-        REFUSED(add(m, {"none", "none"}, nullptr, "v", "String"), "Invalid Name.\n"),
-        REFUSED(add(m, o.Known(), "N", "v", ""), "Invalid attribute type.\n"),
-        REFUSED(add(m, o.Known(), "N", "v", "Word"), "Invalid attribute type.\n"),
-        REFUSED(setGeneric(m, o.Known(), "W", "ASSIGN"), "Invalid generic value.\n"),
-        REFUSED(setGeneric(m, o.Known(), "W", nullptr), "Invalid generic value.\n"),
-        REFUSED(setGeneric(m, o.Known(), "N", "SYN"), "Attribute \"N\" not found.\n"),
-        REFUSED(setGeneric(m, o.Known(), nullptr, "SYN"), "Attribute \"\" not found.\n"),
-        REFUSED(setSyn(m, o.Known(), "W", "SYN"), "Invalid generic value.\n"),
-        REFUSED(setSyn(m, o.Known(), "W", nullptr), "Invalid generic value.\n"),
-        REFUSED(setSyn(m, o.Known(), "N", "ASSIGN"), "Attribute \"N\" not found.\n"),
-        REFUSED(setValue(m, o.Known(), "%s%n", "1"), "Attribute \"%s%n\" not found.\n"),
-        REFUSED(setValue(m, o.Known(), nullptr, "1"), "Attribute \"\" not found.\n"),
-        REFUSED(setUserType(m, o.Known(), "W", "T"), "Invalid attribute type.\n"),
-        REFUSED(setUserType(m, o.Known(), "N", "T"), "Attribute \"N\" not found.\n")};
-#undef REFUSED
-    for (Grid const &owner : Grids())
-        for (Row const &row : rows) {
-            Bare design;
-            owner.add(design.model, owner.Known(), "W", "8", "Integer");
-            design.model.SetModifiedFlag(false);
-            EXPECT_EQ(row.message, MessageOf([&] { row.call(design.model, owner); }))
-                << owner.words << " " << row.name;
-            EXPECT_FALSE(design.model.IsModified()) << owner.words << " " << row.name;
-            EXPECT_EQ("W=8 NONE NONE", AttrsOf(owner.Attrs(design.model))) << row.name;
-        }
-}
-
 TEST(ModelAttributes, MissingOwners) {
-    for (Grid const &owner : Grids()) {
-        if (owner.missing.empty())
+    Bare design;
+    for (Owner const &owner : Owners()) {
+        if (owner.words == "MODULE")
             continue;
-        Bare design;
-        Model &m = design.model;
-        Names const none = {"none", "A"};
-        EXPECT_EQ(owner.missing, MessageOf([&] { owner.add(m, none, "A", "v", "Word"); }));
-        EXPECT_EQ(owner.missingOptions, MessageOf([&] { owner.setGeneric(m, none, "A", "?"); }));
-        EXPECT_EQ(owner.missingOptions, MessageOf([&] { owner.setSyn(m, none, "A", "?"); }));
-        EXPECT_EQ(owner.missing, MessageOf([&] { owner.setValue(m, none, "A", "v"); }));
-        EXPECT_EQ(owner.missing, MessageOf([&] { owner.setUserType(m, none, "A", "t"); }));
-        EXPECT_EQ(owner.missing, MessageOf([&] { owner.comment(m, none, "c"); }));
-        EXPECT_EQ("", MessageOf([&] { owner.comment(m, none, nullptr); }));
-        EXPECT_EQ(*owner.pin ? "Pin \"\" not found.\n" : "\"\" not found.\n", MessageOf([&] {
-            owner.setValue(m, {nullptr, nullptr}, "A", "v");
-        }));
-        EXPECT_EQ(*owner.pin ? "Pin \"none\" not found.\n" : "", MessageOf([&] {
-            owner.comment(m, {owner.holder, "none"}, "c");
-        }));
-        EXPECT_FALSE(m.IsModified()) << owner.words;
+        std::string const missing = *owner.pin ? "Pin \"A\" not found.\n" : "\"none\" not found.\n";
+        bool const isInstance = owner.words == "INSTANCE";
+        for (auto const &[pattern, message] : std::vector<std::pair<char const *, std::string>>{
+                 {"ADD @ ATTRIBUTE % -TYPE=Word W v", missing},
+                 {"SET @ ATTRIBUTE OPTION % W -GENERIC=?",
+                  isInstance ? "Attribute \"W\" not found.\n" : missing},
+                 {"SET @ ATTRIBUTE OPTION % W -SYNATTR=?",
+                  isInstance ? "Attribute \"W\" not found.\n" : missing},
+                 {"SET @ ATTRIBUTE VALUE % W v", missing},
+                 {"SET @ ATTRIBUTE USERTYPE % W t", missing},
+                 {"ADD @ COMMENT % c", missing}}) {
+            std::string const name = *owner.pin ? "none.A" : "none";
+            std::string const line = Owner::Put(owner.Words(pattern), '%', name);
+            EXPECT_EQ(message, Refusal(design.model, {line})) << line;
+        }
     }
+    EXPECT_FALSE(design.model.IsModified());
 }
 
-TEST(ModelAttributes, CommentsAreNoChange) {
-    for (Grid const &owner : Grids()) {
-        Bare design;
-        for (Text const text : {"a", static_cast<Text>(nullptr), "b\nc", ""})
-            owner.comment(design.model, owner.Known(), text);
-        for (Owner const &other : Owners())
-            EXPECT_STREQ(other.words == owner.words ? "a\nb\nc\n\n" : "",
-                         other.find(design.model).GetComment())
-                << owner.words << " " << other.words;
-        EXPECT_FALSE(design.model.IsModified()) << owner.words;
-    }
+TEST(ModelAttributes, NullArguments) {
+    struct Row {
+        char const *name;
+        void (*call)(Model &);
+        char const *message;
+    };
+#define CALL(call, message) {#call, [](Model &m) { m.call; }, message}
+    std::vector<Row> const rows = {
+        // Before anybody looks for the owner.
+        CALL(AddModuleAttr(nullptr, "v", "?"), "Invalid Name.\n"),
+        CALL(AddComponentAttr("none", nullptr, "v", "?"), "Invalid Name.\n"),
+        CALL(AddInstanceAttr("none", nullptr, "v", "?"), "Invalid Name.\n"),
+        CALL(AddSignalAttr("none", nullptr, "v", "?"), "Invalid Name.\n"),
+        CALL(AddComponentPinAttr("none", "A", nullptr, "v", "?"), "Invalid Name.\n"),
+        CALL(AddInstancePinAttr("none", "A", nullptr, "v", "?"), "Invalid Name.\n"),
+        CALL(SetSignalAttrValue(nullptr, "A", "v"), "\"\" not found.\n"),
+        CALL(SetInstancePinAttrValue(nullptr, nullptr, "A", "v"), "Pin \"\" not found.\n"),
+        CALL(SetModuleAttrValue(nullptr, "v"), "Attribute \"\" not found.\n"),
+        CALL(SetModuleAttrValue("%s%n", "v"), "Attribute \"%s%n\" not found.\n"),
+        CALL(AddNotes(nullptr), ""),
+        CALL(AddComponentComment("none", nullptr), ""),
+        CALL(AddInstanceComment("none", nullptr), ""),
+        CALL(AddSignalComment("none", nullptr), ""),
+        CALL(AddComponentPinComment("none", "A", nullptr), ""),
+        CALL(AddInstancePinComment("none", "A", nullptr), ""),
+        CALL(AddAttr(nullptr, "A", "v", "?"), ""),
+        CALL(SetGenericAttrValue(nullptr, "A", "?"), ""),
+        CALL(SetSynAttrValue(nullptr, "A", "?"), ""),
+        CALL(SetAttrValue(nullptr, "A", "v"), ""),
+        CALL(SetUserType(nullptr, "A", "t"), "")};
+#undef CALL
+    Bare design;
+    for (Row const &row : rows)
+        EXPECT_EQ(row.message, MessageOf([&] { row.call(design.model); })) << row.name;
+    EXPECT_FALSE(design.model.IsModified());
+    Model &m = design.model;
+    m.AddModuleAttr("", nullptr, nullptr); // a string, without a type
+    m.AddModuleAttr("U", "on", "User");
+    m.SetModuleUserType("U", "STATE");
+    m.SetModuleAttrValue(nullptr, "v"); // an empty name is a name
+    EXPECT_EQ("Invalid generic value.\n",
+              MessageOf([&] { m.SetModuleGenericAttrValue("U", nullptr); }));
+    EXPECT_EQ("=v NONE NONE; U(STATE)=on NONE NONE", AttrsOf(design.netlist));
+    m.SetModuleUserType("U", nullptr);
+    m.SetModuleAttrValue("U", nullptr);
+    EXPECT_EQ("=v NONE NONE; U()= NONE NONE", AttrsOf(design.netlist));
 }
 
 TEST(ModelAttributes, AnInstanceChangesItsOwnCopy) {
-    struct Row {
-        void (*call)(Model &);
-        Text message;
-        Text own; ///< of the instance afterwards
-    };
-    for (Row const &row : std::vector<Row>{
-             {[](Model &m) { m.SetInstanceAttrValue("u1", "w", "9"); }, "", "W=9 SYN ASSIGN"},
-             {[](Model &m) { m.SetInstanceGenericAttrValue("u1", "w", "none"); }, "",
-              "W=8 NONE ASSIGN"},
-             {[](Model &m) { m.SetInstanceSynAttrValue("u1", "w", "none"); }, "", "W=8 SYN NONE"},
-             // Refused, and yet the copy stays.
-             {[](Model &m) { m.SetInstanceUserType("u1", "w", "T"); }, "Invalid attribute type.\n",
-              "W=8 SYN ASSIGN"},
-             {[](Model &m) { m.SetInstanceGenericAttrValue("u1", "w", "x"); },
-              "Invalid generic value.\n", "W=8 SYN ASSIGN"},
-             {[](Model &m) { m.SetInstanceSynAttrValue("u1", "w", "x"); },
-              "Invalid generic value.\n", "W=8 SYN ASSIGN"}}) {
+    // The last: of the instance afterwards. Where the word is refused, the copy stays as well.
+    using Row = std::tuple<char const *, char const *, char const *>;
+    for (auto const &[line, message, own] :
+         {Row{"VALUE u1 w 9", "", "W=9 SYN ASSIGN"},
+          Row{"OPTION u1 w -GENERIC=none", "", "W=8 NONE ASSIGN"},
+          Row{"OPTION u1 w -SYNATTR=none", "", "W=8 SYN NONE"},
+          Row{"USERTYPE u1 w T", "Invalid attribute type.\n", "W=8 SYN ASSIGN"},
+          Row{"OPTION u1 w -GENERIC=x", "Invalid generic value.\n", "W=8 SYN ASSIGN"},
+          Row{"OPTION u1 w -SYNATTR=x", "Invalid generic value.\n", "W=8 SYN ASSIGN"}}) {
+        SCOPED_TRACE(line);
         Bare design;
         Model &m = design.model;
-        m.AddComponentAttr("CELL", "W", "8", "Integer");
-        m.SetComponentGenericAttrValue("CELL", "W", "SYN");
-        m.SetComponentSynAttrValue("CELL", "W", "ASSIGN");
-        m.SetModifiedFlag(false);
-        for (int times = 0; times < 2; ++times) { // the second call changes the same copy
-            EXPECT_EQ(row.message, MessageOf([&] { row.call(m); })) << row.own;
-            EXPECT_EQ(*row.message == '\0', design.TakeModified()) << row.own;
-            EXPECT_EQ(row.own, AttrsOf(*m.GetInstance("u1")));
+        EXPECT_EQ("", Refusal(m, {"ADD COMPONENT ATTRIBUTE CELL -TYPE=Integer W 8",
+                                  "SET COMPONENT ATTRIBUTE OPTION CELL W -GENERIC=SYN "
+                                  "-SYNATTR=ASSIGN"}));
+        for (int times = 0; times < 2; ++times) { // the second changes the same copy
+            m.SetModifiedFlag(false);
+            EXPECT_EQ(message, Refusal(m, {std::string("SET INSTANCE ATTRIBUTE ") + line}));
+            EXPECT_EQ(*message == '\0', m.IsModified());
+            EXPECT_EQ(own, AttrsOf(*m.GetInstance("u1")));
         }
-        EXPECT_EQ("W=8 SYN ASSIGN", AttrsOf(*m.GetComponent("CELL"))) << row.own;
-        EXPECT_EQ("", AttrsOf(*m.GetInstance("u2"))) << row.own;
+        EXPECT_EQ("", AttrsOf(*m.GetInstance("u2")));
         m.SetComponentAttrValue("CELL", "W", "7"); // no longer reaches the copy
-        EXPECT_EQ(row.own, AttrsOf(*m.GetInstance("u1")));
+        EXPECT_EQ("W=7 SYN ASSIGN", AttrsOf(*m.GetComponent("CELL")));
+        EXPECT_EQ(own, AttrsOf(*m.GetInstance("u1")));
     }
 }
 
@@ -252,31 +125,11 @@ TEST(ModelAttributes, WhatAnInstanceTakesFromItsComponent) {
     m.SetInstanceAttrValue("u1", "U", "off");
     EXPECT_EQ("U(STATE)=off NONE NONE", AttrsOf(*m.GetInstance("u1")));
     EXPECT_STREQ("c\n", m.GetInstance("u1")->GetAttr("U")->GetComment());
-    m.SetInstanceUserType("u2", "U", "T");
-    EXPECT_EQ("U(T)=on NONE NONE", AttrsOf(*m.GetInstance("u2")));
     m.AddInstanceAttr("u3", "U", "x", nullptr); // does not look at the component
     EXPECT_EQ("U=x NONE NONE", AttrsOf(*m.GetInstance("u3")));
     m.AddComponentPinAttr("CELL", "A", "P", "1", nullptr); // u1 has its pins already
-    m.AddInstance("u9", "CELL");
-    m.SetInstancePinAttrValue("u9", "A", "P", "2");
     EXPECT_EQ("Attribute \"P\" not found.\n",
               MessageOf([&] { m.SetInstancePinAttrValue("u1", "A", "P", "2"); }));
-    EXPECT_EQ("P=1 NONE NONE", AttrsOf(*m.GetComponent("CELL")->GetPin("A")));
-}
-
-TEST(ModelAttributes, BaseOperationsIgnoreANullHolder) {
-    Bare design;
-    Model &m = design.model;
-    m.AddAttr(nullptr, "A", "v", "Word");
-    for (auto const set : {&Model::SetGenericAttrValue, &Model::SetSynAttrValue,
-                           &Model::SetAttrValue, &Model::SetUserType})
-        (m.*set)(nullptr, "A", "x");
-    EXPECT_FALSE(m.IsModified());
-    Netlist other("other"); // of no model: the holder decides where an attribute goes
-    m.AddAttr(&other, "A", "v", nullptr);
-    m.SetSynAttrValue(&other, "a", "ASSIGN");
-    EXPECT_EQ("A=v NONE ASSIGN", AttrsOf(other));
-    EXPECT_TRUE(m.IsModified());
 }
 
 } // namespace

@@ -1,43 +1,87 @@
-// Widening replaces a bus by another object. These designs once left a pointer to the dead one.
+// A range as wide as a bus or wider takes the bus's place, and the bus becomes a slice of it.
 
 #include <gtest/gtest.h>
 
 #include "tests/support/Lines.h"
-#include "vesk_hdl/netlist/Netlist.h"
 
 using namespace Vesk_Hdl;
 
 namespace {
 
-struct Row {
-    char const *name;
-    std::vector<std::string> before; ///< the passes of a write
-    std::vector<std::string> after;
-    std::vector<std::string> slices; ///< what stands for the former buses, outside the netlist
-};
+TEST(Widening, KeepsEverythingThatLedToTheFormerBus) {
+    using Row = std::pair<char const *, char const *>;
+    for (auto const &[lines, wiring] : std::vector<Row>{
+             {"D(3:0) u1.B(3:0); D(7:0) u1.W(7:0)", "D(7:0): u1.W(7:0)\n[D(3:0)]: u1.B(3:0)\n"},
+             {"n D(3:0); D(7:0) m", "n <- D(3:0)\nD(7:0) <- m\nm\n[D(3:0)]\n"},
+             {"D(3:0) D(3:0); D(7:0) m", "D(7:0) <- m\nm\n[D(3:0)] <- D(3:0)\n"},
+             // The left side in hand, and members of the compound in hand.
+             {"D(3:0) D(7:0)", "D(7:0)\n[D(3:0)] <- D(7:0)\n"},
+             {"D(3:0) n,D(7:0)", "n\nD(7:0)\nn,D(7:0) {n D(7:0)}\n[D(3:0)] <- n,D(7:0)\n"},
+             {"X(0:0),X(3:0),X(7:0) X(9:0)",
+              "X(0:0),X(3:0),X(7:0) {X(0:0) X(3:0) X(7:0)} <- X(9:0)\nX(9:0)\n"
+              "[X(0:0)]\n[X(3:0)]\n[X(7:0)]\n"},
+             {"X(7:0),X(3:0) n", "X(7:0)\nX(3:0)\nX(7:0),X(3:0) {X(7:0) X(3:0)} <- n\nn\n"},
+             {"A,D(3:0) n; D(7:0) n", "A\nA,D(3:0) {A D(3:0)} <- n\nn\nD(7:0) <- n\n[D(3:0)]\n"},
+             {"u1.B(3:0) = 0; u1_B_CONST_SIGNAL(7:0) n",
+              "u1_B_CONST_SIGNAL(7:0) <- n\nn\n[u1_B_CONST_SIGNAL(3:0)]: (u1.B(3:0))\n"},
+             {"D(1:0) u1.B(3:0); n D(1:0); D(3:0) u1.Q(3:0); m,D(3:0) n; D(7:0) u1.W(7:0)",
+              "n <- D(1:0)\nm\nm,D(3:0) {m D(3:0)} <- n\nD(7:0): u1.W(7:0)\n[D(1:0)]: u1.B(3:0)\n"
+              "[D(3:0)]: u1.Q(3:0)\n"},
+             {"D(1:0) E(1:0); D(3:0) n; E(3:0) n",
+              "D(3:0) <- n\nn\nE(3:0) <- n\n[D(1:0)] <- E(1:0)\n[E(1:0)]\n"},
+             {"D(7:0) u1.W(7:0); D(0:7) n", "D(0:7) <- n\nn\n[D(7:0)]: u1.W(7:0)\n"},
+             // The former name again, now a slice.
+             {"D(3:0) u1.B(3:0); D(7:0) n; D(3:0) u2.B(3:0)",
+              "D(7:0) <- n\nn\nD(3:0): u2.B(3:0)\n[D(3:0)]: u1.B(3:0)\n"},
+             {"D(7:0) u1.W(7:0); D(12:10) u1.B(3:0)", "D(7:0): u1.W(7:0)\nD(12:10): u1.B(3:0)\n"},
+             {"sig D(7:0); D(2147483647:2147483648) n", // 4294967296 bits, which no int counts
+              "D(2147483647:2147483648) <- n\nn\n[D(7:0)]\n"},
+             {"sig D(3:0); n D[3:0]", "D(3:0)\nn <- D(3:0)\n"}}) {
+        Design design(CellsAnd(lines));
+        EXPECT_EQ(wiring, Wiring(design.netlist)) << lines;
+    }
+    Design design(Short("sig D(3:0)")); // a typed bracket does not widen
+    EXPECT_EQ("Signal \"D[7:0]\" already declared.\n", Refusal(design.model, Short("n D[7:0]")));
+}
 
-Row const ROWS[] = {
-    {"a compound of dummies lists the bus",
-     {"ADD COMPONENT C", "ADD PIN C Q(0:7) out", "ADD INSTANCE C u", "ADD PORT s(6:7) in",
-      "CONNECT SIGNAL s(3:3),x_DUMMY(2:2),t(8:5) u.Q(0:7)"},
-     {"CONNECT SIGNAL t(9:4) x", "CONNECT SIGNAL t_DUMMY(9:4) x", "CONNECT SIGNAL s(9:0) x"},
-     {"[t(8:5)]", "[t_DUMMY(8:5)]", "[s(6:7)]"}},
-    {"a bus hands its links on, then is widened again",
-     {"CONNECT SIGNAL a D(3:0)", "CONNECT SIGNAL D(3:0) E(1:0)", "CONNECT SIGNAL D(7:0) E(1:0)"},
-     {"CONNECT SIGNAL E(2:0) a", "CONNECT SIGNAL E(3:0) D(9:0)", "CONNECT SIGNAL D(10:0) D(10:0)"},
-     {"[D(3:0)]", "[D(7:0)]", "[E(1:0)]", "[E(2:0)]"}},
-};
-
-} // namespace
-
-TEST(Widening, LeavesNoPointerToTheFormerBus) {
-    for (Row const &row : ROWS) {
-        Design design;
-        EXPECT_EQ(Refusal(design.model, row.before), "") << row.name;
-        design.netlist.CreateVhdlDummySignals();
-        EXPECT_EQ(Refusal(design.model, row.after), "") << row.name;
-        std::string const wiring = Wiring(design.netlist);
-        for (std::string const &slice : row.slices)
-            EXPECT_NE(wiring.find(slice), std::string::npos) << row.name << ": " << slice;
+TEST(Widening, GivesPartsTheNewParent) {
+    Design design(CellsAnd("port D(3:0) out; D(2) u1.A; D(1:0) u1.B(3:0); D(3:0) = 1"));
+    design.model.GetSignal("D(3:0)")->AddComment("c");
+    EXPECT_EQ("", Refusal(design.model, Short("D(7:0) u1.W(7:0)")));
+    EXPECT_EQ(nullptr, design.model.GetSignal("D(3:0)"));
+    Bus *const wide = design.netlist.GetParentBus("D");
+    ASSERT_EQ(wide, design.model.GetSignal("D(7:0)"));
+    EXPECT_EQ("D(3:0) D(2) D(1:0)", NamesOf(wide->GetBusSliceIterator()));
+    EXPECT_TRUE(!wide->IsPort() && !wide->HasComment() && !wide->HasConstantValue());
+    for (char const *const part : {"D(2)", "D(1:0)"}) {
+        design.model.GetSignal(part)->SetPortPolarity(Polarity::INPUT);
+        EXPECT_EQ(Polarity::INPUT, wide->GetPortPolarity().GetValue()) << part;
+        wide->SetPortPolarity(Polarity());
+        EXPECT_EQ(Polarity::INVALID, design.model.GetSignal(part)->GetPortPolarity().GetValue());
     }
 }
+
+/// These designs once left a pointer to the dead bus.
+TEST(Widening, LeavesNoPointerToTheFormerBus) {
+    struct Row {
+        char const *before, *after; ///< the passes of a write
+        Lines slices;               ///< what stands for the former buses, outside the netlist
+    };
+    for (Row const &row : std::vector<Row>{
+             {"ADD COMPONENT C; ADD PIN C Q(0:7) out; ADD INSTANCE C u; port s(6:7) in;"
+              "s(3:3),x_DUMMY(2:2),t(8:5) u.Q(0:7)",
+              "t(9:4) x; t_DUMMY(9:4) x; s(9:0) x",
+              {"[t(8:5)]", "[t_DUMMY(8:5)]", "[s(6:7)]"}},
+             {"a D(3:0); D(3:0) E(1:0); D(7:0) E(1:0)",
+              "E(2:0) a; E(3:0) D(9:0); D(10:0) D(10:0)",
+              {"[D(3:0)]", "[D(7:0)]", "[E(1:0)]", "[E(2:0)]"}}}) {
+        Design design(Short(row.before));
+        design.netlist.CreateVhdlDummySignals();
+        EXPECT_EQ(Refusal(design.model, Short(row.after)), "") << row.before;
+        std::string const wiring = Wiring(design.netlist);
+        for (std::string const &slice : row.slices)
+            EXPECT_NE(wiring.find(slice), std::string::npos) << row.before << ": " << slice;
+    }
+}
+
+} // namespace

@@ -1,99 +1,59 @@
 #include "vesk_hdl/netlist/Values.h"
 
-#include <string>
-#include <vector>
-
 #include <gtest/gtest.h>
+
+#include "tests/support/Lines.h"
 
 using namespace Vesk_Hdl;
 
 namespace {
 
 TEST(Polarity, WordsMatchByPrefix) {
-    struct Row {
-        char const *text;
-        Polarity::Value value;
-    };
-    for (Row const &row : std::vector<Row>{{"Input", Polarity::INPUT},
-                                           {"INP", Polarity::INPUT},
-                                           {"i", Polarity::INPUT},
-                                           {"o", Polarity::OUTPUT},
-                                           {"OUTPUT", Polarity::OUTPUT},
-                                           {"bi", Polarity::BIDIRECTIONAL},
-                                           {"BIDIRECTIONAL", Polarity::BIDIRECTIONAL},
-                                           {"inputs", Polarity::INVALID},
-                                           {"inout", Polarity::INVALID},
-                                           {"x", Polarity::INVALID},
-                                           {" in", Polarity::INVALID},
-                                           {"", Polarity::INVALID}}) {
-        EXPECT_EQ(row.value, Polarity::GetValue(row.text)) << row.text;
-        EXPECT_EQ(row.value, Polarity(row.text).GetValue()) << row.text;
+    for (auto const &[word, value] : Pairs("Input=0; INP=0; i=0; o=1; OUTPUT=1; bi=2;"
+                                           "BIDIRECTIONAL=2; inputs=-1; inout=-1; x=-1; =-1")) {
+        EXPECT_EQ(value, std::to_string(Polarity(word.c_str()).GetValue())) << word;
         Polarity polarity(Polarity::OUTPUT);
-        polarity.SetValue(row.text);
-        EXPECT_EQ(row.value, polarity.GetValue()) << row.text;
+        polarity.SetValue(word.c_str());
+        EXPECT_EQ(value, std::to_string(polarity.GetValue())) << word;
     }
 }
 
 TEST(Polarity, NamesAndOrder) {
-    EXPECT_STREQ("Input", Polarity(Polarity::INPUT).GetValueName());
-    EXPECT_STREQ("Output", Polarity(Polarity::OUTPUT).GetValueName());
-    EXPECT_STREQ("BiDirectional", Polarity(Polarity::BIDIRECTIONAL).GetValueName());
-    EXPECT_STREQ("Output", Polarity().GetValueName());
-    EXPECT_STREQ("Output", Polarity(static_cast<Polarity::Value>(3)).GetValueName());
-    for (int value = -3; value < 5; ++value)
-        EXPECT_EQ(value >= 0 && value <= 2,
-                  Polarity::IsValidValue(static_cast<Polarity::Value>(value)))
-            << value;
-    for (int a = -1; a <= 2; ++a)
-        for (int b = -1; b <= 2; ++b)
-            EXPECT_EQ(a < b, Polarity(static_cast<Polarity::Value>(a)) <
-                                 Polarity(static_cast<Polarity::Value>(b)));
-}
-
-struct Constant {
-    char const *text;
-    char const *value;
-    int base;
-    int length;
-    bool hasBaseAndLength;
-};
-
-Constant const CONSTANTS[] = {{"8:h:FF", "FF", 16, 8, true},   {"4:b:1010", "1010", 2, 4, true},
-                              {"3:o:7", "7", 8, 3, true},      {"3:Octal:7:9", "7", 8, 3, true},
-                              {"8:Hex:zz", "zz", 16, 8, true}, {"8:x:FF", "FF", 2, 8, true},
-                              {"x:h:FF", "FF", 16, 0, true},   {"-4:B:1", "1", 2, -4, true},
-                              {"1010", "1010", 2, 1, false},   {"8:FF", "8:FF", 2, 1, false},
-                              {"8::FF", "8::FF", 2, 1, false}, {":8::h:FF", "FF", 16, 8, true},
-                              {"::", "::", 2, 1, false},       {"", "", 2, 1, false},
-                              {nullptr, "", 2, 1, false}};
-
-void ExpectConstant(Constant const &expected, BitVectorValue const &actual) {
-    EXPECT_STREQ(expected.value, actual.GetValue()) << expected.value;
-    EXPECT_EQ(expected.base, actual.GetBase()) << expected.value;
-    EXPECT_EQ(expected.length, actual.GetLength()) << expected.value;
-    EXPECT_EQ(expected.hasBaseAndLength, actual.HasBaseAndLength()) << expected.value;
-}
-
-TEST(BitVectorValue, ReadsLengthBaseAndDigits) {
-    BitVectorValue reused("8:h:FF");
-    for (Constant const &constant : CONSTANTS) {
-        ExpectConstant(constant, BitVectorValue(constant.text));
-        reused.SetValue(constant.text);
-        ExpectConstant(constant, reused);
+    char const *const names[] = {"Output", "Input", "Output", "BiDirectional", "Output"};
+    for (int value = -1; value <= 3; ++value) {
+        Polarity const polarity(static_cast<Polarity::Value>(value));
+        EXPECT_STREQ(names[value + 1], polarity.GetValueName()) << value;
+        EXPECT_EQ(value >= 0 && value <= 2, Polarity::IsValidValue(polarity.GetValue())) << value;
+        EXPECT_EQ(value > 0, Polarity(Polarity::INPUT) < polarity) << value;
+        EXPECT_EQ(value < 0, polarity < Polarity(Polarity::INPUT)) << value;
     }
 }
 
-TEST(BitVectorValue, CopiesAreIndependent) {
+std::string TextOf(BitVectorValue const &value) {
+    return Basis::StringBase<char>::doFormat("%s %d %d %d", value.GetValue().GetText(),
+                                             value.GetBase(), value.GetLength(),
+                                             value.HasBaseAndLength())
+        .GetText();
+}
+
+TEST(BitVectorValue, ReadsLengthBaseAndDigits) {
+    BitVectorValue value;
+    for (auto const &[text, expected] :
+         Pairs("8:h:FF=FF 16 8 1; 4:b:1010=1010 2 4 1; 3:o:7=7 8 3 1; 3:Octal:7:9=7 8 3 1;"
+               "8:Hex:zz=zz 16 8 1; 8:x:FF=FF 2 8 1; x:h:FF=FF 16 0 1; -4:B:1=1 2 -4 1;"
+               "1010=1010 2 1 0; 8:FF=8:FF 2 1 0; 8::FF=8::FF 2 1 0; :8::h:FF=FF 16 8 1;"
+               "::=:: 2 1 0; = 2 1 0")) {
+        value.SetValue(text.c_str());
+        EXPECT_EQ(expected, TextOf(value)) << text;
+    }
     BitVectorValue first("8:h:FF");
     BitVectorValue second(first);
-    BitVectorValue third;
-    third = first;
+    value = first;
     first.SetValue(nullptr);
     second = *&second;
-    ExpectConstant(CONSTANTS[0], second);
-    ExpectConstant(CONSTANTS[0], third);
-    third = first;
-    ExpectConstant({"", "", 2, 1, false}, third);
+    EXPECT_EQ(" 2 1 0", TextOf(first));
+    EXPECT_EQ("FF 16 8 1", TextOf(second));
+    EXPECT_EQ("FF 16 8 1", TextOf(value));
 }
 
 } // namespace

@@ -1,6 +1,7 @@
 #include "tests/support/Lines.h"
 
 #include <algorithm>
+#include <sstream>
 
 using namespace Vesk_Hdl;
 
@@ -16,18 +17,50 @@ Design::Design(Lines const &lines) : model(&factory), netlist(*model.GetNetlist(
         model.Execute(line.c_str());
 }
 
-Lines const &Cells() {
-    static Lines const lines = {
-        "ADD COMPONENT CELL",     "ADD PIN CELL A in",      "ADD PIN CELL Y out",
-        "ADD PIN CELL IO bi",     "ADD PIN CELL B(3:0) in", "ADD PIN CELL Q(3:0) out",
-        "ADD PIN CELL W(7:0) in", "ADD PIN CELL S(2) in",   "ADD INSTANCE CELL u1",
-        "ADD INSTANCE CELL u2",   "ADD INSTANCE CELL u3"};
+Lines Pieces(std::string const &text) {
+    Lines pieces;
+    std::istringstream stream(text);
+    for (std::string piece; std::getline(stream >> std::ws, piece, ';');)
+        pieces.push_back(piece);
+    return pieces;
+}
+
+std::vector<std::pair<std::string, std::string>> Pairs(std::string const &text) {
+    std::vector<std::pair<std::string, std::string>> pairs;
+    for (std::string const &piece : Pieces(text)) {
+        std::size_t const middle = piece.find('=');
+        pairs.emplace_back(piece.substr(0, middle), piece.substr(middle + 1));
+    }
+    return pairs;
+}
+
+Lines Short(std::string const &text) {
+    Lines lines = Pieces(text);
+    for (std::string &line : lines)
+        if (std::size_t const value = line.find(" = "); value != std::string::npos)
+            line = "ASSIGN CONSTANT " + line.replace(value, 3, " ");
+        else if (line.starts_with("port "))
+            line = "ADD PORT " + line.substr(5);
+        else if (line.starts_with("sig "))
+            line = "ADD SIGNAL " + line.substr(4);
+        else if (!line.starts_with("ADD ") && !line.starts_with("SET "))
+            line = "CONNECT SIGNAL " + line;
     return lines;
 }
 
-Lines CellsAnd(Lines const &lines) {
+Lines const &Cells() {
+    static Lines const lines =
+        Short("ADD COMPONENT CELL; ADD PIN CELL A in; ADD PIN CELL Y out; ADD PIN CELL IO bi;"
+              "ADD PIN CELL B(3:0) in; ADD PIN CELL Q(3:0) out; ADD PIN CELL W(7:0) in;"
+              "ADD PIN CELL S(2) in; ADD INSTANCE CELL u1; ADD INSTANCE CELL u2;"
+              "ADD INSTANCE CELL u3");
+    return lines;
+}
+
+Lines CellsAnd(std::string const &text) {
     Lines all = Cells();
-    all.insert(all.end(), lines.begin(), lines.end());
+    Lines const more = Short(text);
+    all.insert(all.end(), more.begin(), more.end());
     return all;
 }
 

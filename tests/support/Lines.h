@@ -1,6 +1,7 @@
 #pragma once
 
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "vesk_hdl/Vesk_Hdl.h"
@@ -29,10 +30,20 @@ struct Design {
     Vesk_Hdl::Netlist &netlist;
 };
 
+/// The pieces of a text between semicolons, without blanks in front.
+Lines Pieces(std::string const &text);
+
+/// Each piece taken apart at its first "=".
+std::vector<std::pair<std::string, std::string>> Pairs(std::string const &text);
+
+/// Lines from a short form of them: "port q out; sig n; q u1.A; u1.B = 1" declares a port and a
+/// signal, connects and assigns. Lines that begin with ADD or SET stand as they are.
+Lines Short(std::string const &text);
+
 /// A component CELL with pins of all forms and directions, and its instances u1, u2 and u3.
 Lines const &Cells();
-/// Cells, then more lines.
-Lines CellsAnd(Lines const &lines);
+/// Cells, then more lines in the short form.
+Lines CellsAnd(std::string const &text);
 
 /// Names of objects, with a blank between them.
 template <class T> std::string NamesOf(Vesk_Hdl::Iterator<T> objects) {

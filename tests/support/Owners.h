@@ -5,17 +5,24 @@
 
 #include "vesk_hdl/Vesk_Hdl.h"
 
-/// A thing that carries attributes and comments: its words in keywords and in names of operations,
-/// the names that find it in the design of Cells() with a signal s, and itself.
+/// A thing that carries attributes and comments: its words in keywords, the names that find it in
+/// the design of Cells() with a signal s, and itself.
 struct Owner {
     std::string words;
-    std::string className;
     char const *holder;
     char const *pin;
     Vesk_Hdl::Object &(*find)(Vesk_Hdl::Model const &);
 
     /// HOLDER.PIN, as a line names it.
     std::string Name() const { return *pin ? holder + std::string(".") + pin : holder; }
+    /// A pattern with the words in place of `@`; a line, which also has the name in place of `%`.
+    std::string Words(std::string const &pattern) const { return Put(pattern, '@', words); }
+    std::string Line(std::string const &pattern) const { return Put(Words(pattern), '%', Name()); }
+    /// The text with `with` in place of the mark.
+    static std::string Put(std::string text, char mark, std::string const &with) {
+        std::size_t const at = text.find(mark);
+        return at == std::string::npos ? text : text.replace(at, 1, with);
+    }
     Vesk_Hdl::AttributeHolder &Attrs(Vesk_Hdl::Model const &model) const {
         return dynamic_cast<Vesk_Hdl::AttributeHolder &>(find(model));
     }
@@ -26,14 +33,13 @@ inline std::vector<Owner> const &Owners() {
     using M = Vesk_Hdl::Model const &;
     using Vesk_Hdl::Object;
     static std::vector<Owner> const owners = {
-        {"MODULE", "Module", "", "", [](M m) -> Object & { return *m.GetNetlist(); }},
-        {"COMPONENT", "Component", "CELL", "",
-         [](M m) -> Object & { return *m.GetComponent("CELL"); }},
-        {"INSTANCE", "Instance", "u1", "", [](M m) -> Object & { return *m.GetInstance("u1"); }},
-        {"SIGNAL", "Signal", "s", "", [](M m) -> Object & { return *m.GetSignal("s"); }},
-        {"COMPONENT PIN", "ComponentPin", "CELL", "A",
+        {"MODULE", "", "", [](M m) -> Object & { return *m.GetNetlist(); }},
+        {"COMPONENT", "CELL", "", [](M m) -> Object & { return *m.GetComponent("CELL"); }},
+        {"INSTANCE", "u1", "", [](M m) -> Object & { return *m.GetInstance("u1"); }},
+        {"SIGNAL", "s", "", [](M m) -> Object & { return *m.GetSignal("s"); }},
+        {"COMPONENT PIN", "CELL", "A",
          [](M m) -> Object & { return *m.GetPin("A", m.GetComponent("CELL")); }},
-        {"INSTANCE PIN", "InstancePin", "u1", "A",
+        {"INSTANCE PIN", "u1", "A",
          [](M m) -> Object & { return *m.GetPin("A", m.GetInstance("u1")); }}};
     return owners;
 }

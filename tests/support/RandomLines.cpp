@@ -19,7 +19,8 @@ constexpr char const *VALUES[] = {"1",      "0",    "x",       "2.50",     "ORVA
                                   "8:h:FF", "\"\"", "\"a b\"", "10:d:512", "'it'"};
 constexpr char const *SETTINGS[] = {"-GENERIC=SYN",    "-GENERIC=NOSYN",       "-GENERIC=none",
                                     "-SYNATTR=ASSIGN", "-SYNATTR=ASSIGNNODEC", "-SYNATTR=x"};
-constexpr char const *TOOLS[] = {"SYNPLICITY", "synopsys", "XST", "NONE", "Leonardo", "foo"};
+constexpr char const *TOOLS[] = {"QRT",         "exemplar",  "SYNPLICITY", "synopsys",
+                                 "VERILOG2001", "PRECISION", "other"};
 constexpr char const *OPTIONS[] = {"-APPEND", "-NOHEADER", "-OVERWRITE", "-x"};
 constexpr char const *TEXTS[] = {"hello", "a fairly long text of many words that has to wrap",
                                  "\"quoted  blanks\"", "/*", "--"};
@@ -83,7 +84,7 @@ std::string RandomLines::Argument(std::string word) {
         return Pick(POLARITIES);
     if (word == "attribute")
         return Pick(ATTRIBUTES);
-    if (word == "type")
+    if (word == "usertype")
         return Pick(TYPES);
     if (word == "-TYPE=type")
         return std::string("-TYPE=") + Pick(TYPES);

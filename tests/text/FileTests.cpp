@@ -28,11 +28,10 @@ std::unique_ptr<Stream> OpenToRead(std::string const &path) {
 TEST(File, ReadsLinesWithoutTheirEnds) {
     TempDir const folder;
     std::string const longLine(200000, 'x');
-    for (auto const &[bytes, expected] : {std::pair{"", ""},
-                                          {"a\n", "a|"},
-                                          {"\n\na\n\n", "||a||"},
-                                          {"\xFF\n\xE4\n", "\xFF|\xE4|"},
-                                          {"a\r\n\r\nb\rc\n", "a||b\rc|"}}) {
+    using Row = std::pair<char const *, char const *>;
+    for (auto const &[bytes, expected] :
+         {Row{"", ""}, Row{"\n\na\n\n", "||a||"}, Row{"\xFF\n\xE4\n", "\xFF|\xE4|"},
+          Row{"a\r\n\r\nb\rc\n", "a||b\rc|"}}) {
         WriteFile(folder.Path("in"), bytes + longLine); // which no line end follows
         auto const stream = OpenToRead(folder.Path("in"));
         std::string lines;
@@ -76,21 +75,6 @@ TEST(File, ReadsWholeInSpiteOfSignals) {
     Text line;
     EXPECT_TRUE(line.ReadLine(OpenToRead(path).get()));
     writer.join();
-}
-
-TEST(File, TellsFailures) {
-    EXPECT_EQ(OpenToRead("/nowhere/in"), nullptr);
-    EXPECT_EQ(errno, ENOENT);
-    Stream *const full = File::open("/dev/full", Stream::ACCESS_REPLACE, true);
-    *full << "text";
-    EXPECT_EQ(full->flush().GetError(), ENOSPC);
-    EXPECT_FALSE(File::close(full));
-}
-
-TEST(FileName, TellsTheLastComponent) {
-    for (auto const &[path, tail] :
-         {std::pair{"", ""}, {"a.v", "a.v"}, {"/x/a.v", "a.v"}, {"x/", ""}, {"c:\\a.v", "c:\\a.v"}})
-        EXPECT_STREQ(Basis::FileName(path).GetTail(), tail) << path;
 }
 
 } // namespace

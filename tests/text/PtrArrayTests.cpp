@@ -25,40 +25,26 @@ Items In(PtrArray<Item *> const &array) {
 }
 
 TEST(PtrArray, IndexesOutsideAreHarmless) {
-    Item a{1}, b{2};
-    PtrArray<Item *> array;
-    EXPECT_EQ(array.GetTail(), nullptr);
-    array.SetAt(-1, &a);
-    EXPECT_TRUE(array.IsEmpty());
-    array.SetAt(5, &a);
-    array.SetAt(6, &b); // one past the room there is
-    EXPECT_EQ(array.Add(&a), 7);
-    array.SetAt(9, &b); // inside the room, past the size
-    EXPECT_EQ(In(array),
-              (Items{nullptr, nullptr, nullptr, nullptr, nullptr, &a, &b, &a, nullptr, &b}));
-    EXPECT_TRUE(array.GetAt(-1) == nullptr && array.GetAt(10) == nullptr);
-    array.RemoveTail();
-    EXPECT_EQ(array.GetSize(), 9);
-    array.Empty();
-    EXPECT_EQ(array.GetAt(0), nullptr);
-}
-
-TEST(PtrArray, FindsRemovesAndSwaps) {
     Item a{1}, b{1}, absent{1};
     PtrArray<Item *> array;
-    for (Item *const item : {&b, &a, static_cast<Item *>(nullptr), &a})
-        array.Add(item);
-    EXPECT_EQ(array.GetIndex(&a), 1);
-    EXPECT_EQ(array.GetIndex(&absent), -1);
-    EXPECT_TRUE(array.Contains(nullptr) && !array.Contains(&absent));
-    EXPECT_FALSE(array.Remove(&absent));
-    EXPECT_TRUE(array.Remove(&a));
-    EXPECT_EQ(In(array), (Items{&b, nullptr, &a}));
-    for (auto const &[first, second] : {std::pair{1, 1}, {0, 3}, {3, 0}, {-1, 0}, {0, -1}})
+    EXPECT_EQ(array.GetTail(), nullptr);
+    array.RemoveTail();
+    array.SetAt(-1, &a);
+    EXPECT_TRUE(array.IsEmpty());
+    array.SetAt(2, &b);
+    array.SetAt(3, &a); // one past the room there is
+    EXPECT_EQ(array.Add(&b), 4);
+    array.SetAt(6, &b); // inside the room, past the size
+    EXPECT_EQ(In(array), (Items{nullptr, nullptr, &b, &a, &b, nullptr, &b}));
+    EXPECT_TRUE(array.GetAt(-1) == nullptr && array.GetAt(7) == nullptr);
+    EXPECT_TRUE(array.GetIndex(&b) == 2 && array.Contains(nullptr) && !array.Contains(&absent));
+    for (auto const &[first, second] : {std::pair{1, 1}, {0, 7}, {7, 0}, {-1, 0}, {0, -1}, {3, 0}})
         array.Swap(first, second);
-    EXPECT_EQ(In(array), (Items{&b, nullptr, &a}));
-    array.Swap(2, 0);
-    EXPECT_EQ(In(array), (Items{&a, nullptr, &b}));
+    EXPECT_TRUE(array.Remove(&b) && !array.Remove(&absent));
+    array.RemoveTail();
+    EXPECT_EQ(In(array), (Items{&a, nullptr, nullptr, &b, nullptr}));
+    array.Empty();
+    EXPECT_EQ(array.GetAt(0), nullptr);
 }
 
 struct Mortal {
@@ -70,20 +56,15 @@ struct Mortal {
 
 TEST(OwnPtrArray, DeletesWhatItHoldsLastFirst) {
     std::string deaths;
+    Mortal removed(deaths, 'r');
     {
         OwnPtrArray<Mortal *> array;
-        array.Add(new Mortal(deaths, 'x'));
-        Mortal *const held = array.GetTail();
-        array.Empty();
         for (char const name : {'a', 'b', 'c'})
             array.Add(new Mortal(deaths, name));
-        Mortal *const second = array.GetAt(1);
-        array.SetAt(5, held);
-        array.Remove(second);
-        EXPECT_EQ(deaths, "");
-        delete second;
+        array.SetAt(5, &removed);
+        array.Remove(&removed);
     }
-    EXPECT_EQ(deaths, "bxca");
+    EXPECT_EQ(deaths, "cba");
 }
 
 TEST(Iterator, WalksTheArrayAsItIsNowAndCopiesStartAnew) {
@@ -97,15 +78,10 @@ TEST(Iterator, WalksTheArrayAsItIsNowAndCopiesStartAnew) {
     EXPECT_TRUE(walk.HasMore() && walk.Current() == &b);
     Iterator<Item *> assigned(nullptr);
     EXPECT_TRUE(!assigned.HasMore() && assigned.Current() == nullptr);
-    assigned.Advance();
     assigned = walk;
-    EXPECT_EQ(assigned.Current(), &a);
-    EXPECT_EQ(Iterator<Item *>(walk).Current(), &a);
-    Iterator<Item *> &same = walk;
-    walk = same;
+    walk = *&walk;
+    EXPECT_TRUE(assigned.Current() == &a && Iterator<Item *>(walk).Current() == &a);
     EXPECT_EQ(walk.Current(), &b);
-    walk.Rewind();
-    EXPECT_EQ(walk.Current(), &a);
 }
 
 bool Less(Item const *a, Item const *b) { return a->key < b->key; }
@@ -148,7 +124,7 @@ struct NaiveSort {
 
 /// Sorts both ways and compares. At the depth limit the order of equal elements is nobody's
 /// promise.
-bool SortBothWays(std::vector<int> const &keys, std::size_t &calls) {
+bool SortBothWays(std::vector<int> const &keys) {
     std::vector<Item> storage(keys.size());
     NaiveSort naive;
     PtrArray<Item *> array;
@@ -158,7 +134,9 @@ bool SortBothWays(std::vector<int> const &keys, std::size_t &calls) {
         array.Add(&storage[i]);
     }
     naive.Sort();
+    std::size_t calls = 0;
     array.Sort(CountingLess, &calls);
+    EXPECT_LE(calls, keys.size() < 2 ? 0 : 100 * keys.size());
     Items sorted = In(array);
     EXPECT_TRUE(std::is_sorted(sorted.begin(), sorted.end(), Less));
     if (naive.atDepthLimit) {
@@ -178,12 +156,8 @@ TEST(PtrArraySort, LeavesEqualElementsWhereTheStepsPutThem) {
             key = static_cast<int>(random() % ranges[round % 5]);
         if (random() % 5 == 0)
             std::sort(keys.begin(), keys.end());
-        if (random() % 5 == 0)
-            std::reverse(keys.begin(), keys.end());
         SCOPED_TRACE(testing::Message() << "round " << round);
-        std::size_t calls = 0;
-        SortBothWays(keys, calls);
-        EXPECT_TRUE(keys.size() > 1 || calls == 0);
+        SortBothWays(keys);
     }
 }
 
@@ -196,9 +170,7 @@ TEST(PtrArraySort, StaysFastOnTheWorstInput) {
             keys.push_back((i % 2 ? i : half + i - 1) / sharing);
         for (int i = 1; i <= half; ++i)
             keys.push_back(2 * i / sharing);
-        std::size_t calls = 0;
-        EXPECT_TRUE(SortBothWays(keys, calls) || sharing > 1);
-        EXPECT_LT(calls, 100 * keys.size()) << "keys shared by " << sharing;
+        EXPECT_TRUE(SortBothWays(keys) || sharing > 1) << "keys shared by " << sharing;
     }
 }
 

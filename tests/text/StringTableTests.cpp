@@ -53,28 +53,13 @@ struct NaiveTable {
     void Remove(std::string const &text) {
         std::erase_if(nodes, [&](auto const &node) { return node.first == text; });
     }
-    Strings Walk() const {
+    void ExpectSameWalk(StringSet &set) const {
         Strings strings;
         for (auto const &node : nodes)
             strings.push_back(node.first);
-        return strings;
+        ASSERT_EQ(Walk(set), strings);
     }
 };
-
-TEST(StringSet, WalksByBucketAndAge) {
-    StringSet set;
-    // Buckets 178, as the byte counts as -28, then 110, 78 and, for 5381 itself, 170.
-    for (char const *const text : {"\xE4", "a", "A", ""})
-        set.Add(text);
-    EXPECT_EQ(Walk(set), (Strings{"A", "a", "", "\xE4"}));
-    StringSet chain;
-    for (char const *const text : {"ac", "bB", "c!"}) // the same hash: 33 less for one letter more
-        chain.Add(text);
-    EXPECT_EQ(Walk(chain), (Strings{"ac", "c!", "bB"}));
-    chain.Remove("ac");
-    chain.Add("ac");
-    EXPECT_EQ(Walk(chain), (Strings{"c!", "ac", "bB"}));
-}
 
 TEST(StringSet, WalksLikeTheNaiveTable) {
     for (unsigned int const seed : {1, 2, 3}) {
@@ -90,9 +75,9 @@ TEST(StringSet, WalksLikeTheNaiveTable) {
                 set.Empty();
                 naive.nodes.clear();
             }
-            if (step % 100 == 99) {
-                ASSERT_EQ(Walk(set), naive.Walk()) << "seed " << seed << ", step " << step;
-            }
+            SCOPED_TRACE(testing::Message() << "seed " << seed << ", step " << step);
+            if (step % 100 == 99)
+                naive.ExpectSameWalk(set);
         }
     }
 }
@@ -105,8 +90,7 @@ TEST(StringSet, GrowsAlsoForAStringThatItHolds) {
         set.Add(name.c_str());
         naive.Add(name);
     }
-    EXPECT_EQ(naive.buckets, 389U);
-    EXPECT_EQ(Walk(set), naive.Walk());
+    naive.ExpectSameWalk(set);
 }
 
 TEST(StringSet, KeepsTwoRules) {
@@ -117,16 +101,11 @@ TEST(StringSet, KeepsTwoRules) {
     EXPECT_TRUE(set.Contains("CLK") && set.IContains("clk"));
     EXPECT_FALSE(set.Contains("clk") || set.IContains("clk1"));
     set.Remove("clk"); // no exact entry, yet the one that ignores case
-    EXPECT_TRUE(set.Contains("Clk") && set.Contains("CLK"));
-    EXPECT_FALSE(set.IContains("Clk"));
+    EXPECT_TRUE(set.Contains("Clk") && set.Contains("CLK") && !set.IContains("Clk"));
     set.Add("x");
     set.Empty();
-    EXPECT_TRUE(set.IsEmpty() && set.IContains("X"));
-    EXPECT_FALSE(set.Contains("x") || set.GetBeginPos() != set.GetEndPos());
-    set.Add("x");
-    EXPECT_EQ(Walk(set), Strings{"x"});
-    set.Remove("X"); // held once, so one removal takes it
-    EXPECT_FALSE(set.IContains("x"));
+    EXPECT_TRUE(set.IsEmpty() && set.IContains("X") && !set.Contains("x"));
+    EXPECT_TRUE(set.GetBeginPos() == set.GetEndPos());
 }
 
 TEST(StringSet, AssignmentForgetsOnlyWhatIgnoredCase) {
@@ -150,20 +129,16 @@ TEST(StringSet, AssignmentForgetsOnlyWhatIgnoredCase) {
 TEST(StringSetIterator, ComparesByPosition) {
     StringSet set;
     set.Add("A");
-    set.Add("a");
     StringSetIterator nowhere;
     StringSetIterator at = set.GetBeginPos();
     StringSetIterator const copy(at);
-    EXPECT_TRUE(nowhere == StringSetIterator(nullptr) && copy == at);
-    EXPECT_TRUE(nowhere != set.GetEndPos() && set.GetEndPos() != nowhere);
+    EXPECT_TRUE(nowhere == StringSetIterator(nullptr) && nowhere != set.GetEndPos());
     ++nowhere;
     EXPECT_STREQ(*nowhere, "");
     at++;
-    EXPECT_TRUE(copy != at);
-    EXPECT_STREQ(*copy, "A");
-    nowhere = at;
-    EXPECT_STREQ(*nowhere, "a");
-    EXPECT_TRUE(++at == set.GetEndPos());
+    EXPECT_TRUE(copy != at && at == set.GetEndPos());
+    nowhere = copy;
+    EXPECT_STREQ(*nowhere, "A");
 }
 
 TEST(IStringPtrMap, AnswersLikeANaiveMap) {
@@ -187,21 +162,14 @@ TEST(IStringPtrMap, AnswersLikeANaiveMap) {
         ASSERT_EQ(map.Get(asked.c_str()), found == naive.end() ? nullptr : found->second) << asked;
         ASSERT_EQ(map.Contains(asked.c_str()), found != naive.end()) << asked;
     }
-}
-
-TEST(IStringPtrMap, CopiesPointers) {
-    int p = 0;
-    IStringPtrMap<int *> map;
-    map.Add("p", &p);
-    IStringPtrMap<int *> copy(map);
     IStringPtrMap<int *> assigned;
-    assigned.Add("old", &p);
+    assigned.Add("no letters of those", values.data());
     assigned = map;
+    IStringPtrMap<int *> const copy(map);
     map.Empty();
-    EXPECT_TRUE(map.IsEmpty());
-    EXPECT_EQ(copy.Get("P"), &p);
-    EXPECT_EQ(assigned.Get("P"), &p);
-    EXPECT_FALSE(assigned.Contains("old"));
+    EXPECT_TRUE(map.IsEmpty() && !assigned.Contains("no letters of those"));
+    for (auto const &[name, pointer] : naive)
+        ASSERT_TRUE(assigned.Get(name.c_str()) == pointer && copy.Get(name.c_str()) == pointer);
 }
 
 } // namespace

@@ -100,8 +100,7 @@
         .refused = "an unknown component; a pin that it has; a word that is no polarity",          \
         .notes = "Instances made before do not get the pin. D(7:0) makes a pin of eight bits; "    \
                  "D[7:0], in other brackets, makes a pin of one bit with an odd name.",            \
-        .example = VESK_HDL_COMPONENT_LINES "ADD PIN AND2 I0 input",                               \
-        .wrong = "ADD PIN AND2 i0 output",                                                         \
+        .example = "ADD COMPONENT AND2\nADD PIN AND2 I0 input", .wrong = "ADD PIN AND2 i0 output", \
         .message = "Component \"AND2\" already has pin \"i0\".")                                   \
     ROW("ADD INSTANCE", AddInstanceCommand, "component instance",                                  \
         .summary = "Places a component: a new instance with pins of its own.",                     \

@@ -8,6 +8,8 @@
 
 #include <CLI/CLI.hpp>
 
+#include "tool/commands/CommandsCommand.h"
+#include "tool/commands/HeaderCommand.h"
 #include "tool/commands/RunCommand.h"
 #include "vesk_hdl/Vesk_Hdl.h"
 
@@ -23,6 +25,8 @@ int ParseAndRun(int argc, char **argv) {
                "output\ncould not be written; 2 the command line is wrong.");
     Action action;
     AddRunCommand(app, action);
+    AddCommandsCommand(app, action);
+    AddHeaderCommand(app, action);
     try {
         app.parse(argc, argv);
     } catch (CLI::ParseError const &error) {

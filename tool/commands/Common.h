@@ -16,6 +16,9 @@ constexpr int ALL_WELL = 0;
 constexpr int SOMETHING_REFUSED = 1;
 constexpr int USAGE_ERROR = 2;
 
+/// Names standard input or output among files.
+constexpr char STANDARD_STREAM[] = "-";
+
 /// How the user wants to be told what is wrong.
 struct ReportOptions {
     std::string format = "text";

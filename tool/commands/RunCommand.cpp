@@ -20,8 +20,6 @@ namespace fs = std::filesystem;
 
 namespace {
 
-constexpr char STANDARD_STREAM[] = "-";
-
 /// What `vesk-hdl run` was asked for.
 struct RunOptions {
     std::vector<std::string> files; ///< in order

@@ -2,56 +2,16 @@
 
 #include <algorithm>
 #include <cerrno>
-#include <climits>
 #include <cstring>
-#include <functional>
-#include <numeric>
 #include <string_view>
 #include <vector>
 
 #include "tool/diagnostics/LineTokens.h"
+#include "tool/diagnostics/Words.h"
 
 using namespace Vesk_Hdl;
 
 namespace {
-
-constexpr int MOST_KEYWORD_WORDS = 5;
-
-bool SameIgnoringCase(std::string_view left, std::string_view right) {
-    return left.size() == right.size() &&
-           std::equal(left.begin(), left.end(), right.begin(), [](char a, char b) {
-               auto const lower = [](char c) { return c >= 'A' && c <= 'Z' ? c - 'A' + 'a' : c; };
-               return lower(a) == lower(b);
-           });
-}
-
-std::string Lowercase(std::string text) {
-    for (char &c : text)
-        if (c >= 'A' && c <= 'Z')
-            c = static_cast<char>(c - 'A' + 'a');
-    return text;
-}
-
-/// "A, B or C"
-std::string Alternatives(std::vector<std::string_view> const &words) {
-    std::string text;
-    for (std::size_t i = 0; i < words.size(); ++i)
-        text.append(i == 0 ? "" : i + 1 < words.size() ? ", " : " or ").append(words[i]);
-    return text;
-}
-
-std::string Quoted(std::string_view text) { return '"' + std::string(text) + '"'; }
-
-std::vector<std::string> WordsOf(std::string_view text) {
-    std::vector<std::string> words;
-    for (std::size_t at = 0; at < text.size();) {
-        std::size_t const end = std::min(text.find(' ', at), text.size());
-        if (end > at)
-            words.emplace_back(text.substr(at, end - at));
-        at = end + 1;
-    }
-    return words;
-}
 
 /// Options of attribute commands and the words that they take.
 struct WordOption {
@@ -122,7 +82,6 @@ private:
     void Hint(std::string text) { diagnostic.hints.push_back(std::move(text)); }
 
     void BlameKeyword();
-    std::string WordsBehindLine() const;
     void BlameArguments();
     void BlameName();
     bool BlameOption(WordOption const &option);
@@ -140,71 +99,17 @@ private:
     int keywordWords = 0;
 };
 
-/// The number of edits (a letter more, less, other, or two exchanged) between two texts, case
-/// ignored.
-int Distance(std::string_view left, std::string_view right) {
-    std::size_t const width = right.size() + 1;
-    std::vector<int> before(width);
-    std::vector<int> row(width);
-    std::vector<int> beforeThat(width);
-    std::iota(row.begin(), row.end(), 0);
-    for (std::size_t i = 1; i <= left.size(); ++i) {
-        beforeThat.swap(before);
-        before.swap(row);
-        row[0] = static_cast<int>(i);
-        for (std::size_t j = 1; j < width; ++j) {
-            auto const same = [&](std::size_t a, std::size_t b) {
-                return SameIgnoringCase(left.substr(a, 1), right.substr(b, 1));
-            };
-            row[j] = std::min(
-                {before[j] + 1, row[j - 1] + 1, before[j - 1] + (same(i - 1, j - 1) ? 0 : 1)});
-            if (i > 1 && j > 1 && same(i - 1, j - 2) && same(i - 2, j - 1))
-                row[j] = std::min(row[j], beforeThat[j - 2] + 1);
-        }
-    }
-    return row[width - 1];
-}
-
-/// The words with which keywords go on where the line ends; empty if there are none.
-std::string Refusal::WordsBehindLine() const {
-    std::string const begin = std::string(tokens.GetTokens().Concatenate(" ").View()) + " ";
-    std::vector<std::string_view> words;
-    for (int i = 0; i < CommandReference::GetCount(); ++i) {
-        std::string_view rest = CommandReference::GetAt(i)->keyword;
-        if (!SameIgnoringCase(rest.substr(0, begin.size()), begin))
-            continue;
-        rest.remove_prefix(begin.size());
-        rest = rest.substr(0, rest.find(' '));
-        if (std::find(words.begin(), words.end(), rest) == words.end())
-            words.push_back(rest);
-    }
-    return Alternatives(words);
-}
-
-/// The nearest keyword to what the line begins with, if one is near enough to be meant.
+/// Where the keyword goes wrong, and the nearest one if one is near enough to be meant.
 void Refusal::BlameKeyword() {
-    constexpr std::size_t LONGEST_WORD = 40; // no word of a keyword comes near it
-    CommandHelp const *nearest = CommandReference::GetAt(0);
-    int least = INT_MAX;
-    for (int i = 0; i < CommandReference::GetCount(); ++i) {
-        CommandHelp const &candidate = *CommandReference::GetAt(i);
-        std::vector<std::string> const words = WordsOf(candidate.keyword);
-        std::string begin;
-        for (int word = 0; word < static_cast<int>(words.size()) && word < tokens.GetSize(); ++word)
-            (begin += word > 0 ? " " : "") += tokens.At(word).substr(0, LONGEST_WORD);
-        int const distance = Distance(begin, candidate.keyword);
-        if (distance < least) {
-            nearest = &candidate;
-            least = distance;
-        }
-    }
     Mark(0);
-    if (std::string const words = WordsBehindLine(); !words.empty()) {
+    std::string const part = KeywordPart(tokens.GetTokens());
+    if (std::vector<std::string_view> const words = KeywordWordsBehind(part); !words.empty()) {
         MarkEnd();
-        Hint("the keyword goes on with " + words);
+        Hint("the keyword goes on with " + Alternatives(words));
         return;
     }
-    if (least > static_cast<int>(std::strlen(nearest->keyword)) / 3) {
+    CommandHelp const *const nearest = NearestKeyword(part);
+    if (!nearest) {
         Hint("`vesk-hdl commands` lists all keywords");
         return;
     }
@@ -271,7 +176,7 @@ bool Refusal::Fits(Placeholder const &placeholder, std::string_view token) {
               std::string_view("component")})
             if (SameIgnoringCase(token, word))
                 return true;
-        if (token.size() == signalWord.size() && Distance(token, signalWord) <= 1)
+        if (SameIgnoringCase(token, "signal") || SameIgnoringCase(token, "siganl"))
             Hint("the word for signals that " + std::string(command->keyword) + " wants is " +
                  Quoted(signalWord));
         else
@@ -455,10 +360,10 @@ Diagnostic At(std::string const &line, Place const &place) {
 
 CommandHelp const *KeywordOf(StringArray const &tokens, int &words) {
     CommandHelp const *found = nullptr;
-    std::string begin;
-    for (int i = 0; i < tokens.GetSize() && i < MOST_KEYWORD_WORDS; ++i) {
-        (begin += i > 0 ? " " : "") += tokens.At(i).View();
-        if (CommandHelp const *const command = CommandReference::Find(begin.c_str())) {
+    StringArray begin;
+    for (int i = 0; i < std::min(tokens.GetSize(), MOST_KEYWORD_WORDS); ++i) {
+        begin.Add(tokens.At(i));
+        if (CommandHelp const *const command = CommandReference::Find(KeywordPart(begin).c_str())) {
             found = command;
             words = i + 1;
         }

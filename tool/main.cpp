@@ -11,6 +11,7 @@
 #include "tool/commands/CommandsCommand.h"
 #include "tool/commands/HeaderCommand.h"
 #include "tool/commands/RunCommand.h"
+#include "tool/commands/ShellCommand.h"
 #include "vesk_hdl/Vesk_Hdl.h"
 
 namespace {
@@ -25,6 +26,7 @@ int ParseAndRun(int argc, char **argv) {
                "output\ncould not be written; 2 the command line is wrong.");
     Action action;
     AddRunCommand(app, action);
+    AddShellCommand(app, action);
     AddCommandsCommand(app, action);
     AddHeaderCommand(app, action);
     try {

@@ -121,7 +121,7 @@ void PrintMarkdown(std::ostream &stream) {
                << command.summary;
         if (*command.notes)
             stream << ' ' << command.notes;
-        stream << "\n\n";
+        stream << "\n" << (*command.grammar || *command.refused ? "\n" : "");
         for (std::string const &word : PlaceholdersOf(command))
             stream << "- `" << word << "`: " << Glossary().at(word) << '\n';
         if (*command.refused)

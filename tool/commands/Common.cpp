@@ -38,6 +38,14 @@ void AddModelOption(CLI::App &command, std::string &modelName) {
     command.add_option("--model", modelName, "Name of the design")->capture_default_str();
 }
 
+void AddOutputDirOption(CLI::App &command, std::string &folder) {
+    command
+        .add_option("--output-dir", folder,
+                    "Folder that relative names in WRITE lines are taken from")
+        ->check(CLI::ExistingDirectory)
+        ->default_str(".");
+}
+
 Diagnostic About(std::string const &file, std::string const &message) {
     Diagnostic diagnostic;
     diagnostic.place.file = file;

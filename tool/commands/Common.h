@@ -32,6 +32,8 @@ struct ReportOptions {
 void AddReportOptions(CLI::App &command, ReportOptions &options);
 /// --model, with its default.
 void AddModelOption(CLI::App &command, std::string &modelName);
+/// --output-dir; empty for the current folder.
+void AddOutputDirOption(CLI::App &command, std::string &folder);
 
 /// Something about a file as a whole.
 Diagnostic About(std::string const &file, std::string const &message);

@@ -209,10 +209,7 @@ void AddRunCommand(CLI::App &app, Action &action) {
     run.add_option("--vhdl", options->vhdlFile,
                    "Write the design as VHDL behind the last line; '-' is standard output");
     run.add_option("--verilog", options->verilogFile, "The same as Verilog");
-    run.add_option("--output-dir", options->outputDir,
-                   "Folder that relative names in WRITE lines are taken from")
-        ->check(CLI::ExistingDirectory)
-        ->default_str(".");
+    AddOutputDirOption(run, options->outputDir);
     run.add_option("--restrict", options->confinement,
                    "Refuse WRITE lines whose file lies outside this folder, links resolved")
         ->check(CLI::ExistingDirectory);
@@ -226,4 +223,12 @@ void AddRunCommand(CLI::App &app, Action &action) {
         ->capture_default_str();
     AddReportOptions(run, options->report);
     run.callback([options, &action] { action = [options] { return Runner(*options).Run(); }; });
+}
+
+int RunStandardInput(std::string const &modelName, std::string const &outputDir) {
+    RunOptions options;
+    options.files = {STANDARD_STREAM};
+    options.modelName = modelName;
+    options.outputDir = outputDir;
+    return Runner(options).Run();
 }

@@ -1,0 +1,6 @@
+#pragma once
+
+#include "tool/commands/Common.h"
+
+/// `shell`: an interactive session on one design.
+void AddShellCommand(CLI::App &app, Action &action);

@@ -1,8 +1,10 @@
 #include "vesk_hdl/text/StringTable.h"
 
 #include <algorithm>
+#include <functional>
 #include <iterator>
 #include <stdexcept>
+#include <string>
 
 #include "vesk_hdl/text/basis/Ascii.h"
 
@@ -25,8 +27,8 @@ std::uint32_t BucketCountFor(std::size_t wanted) {
 
 } // namespace
 
-StringTable::StringTable(CaseRule rule, std::uint32_t wanted)
-    : caseRule(rule), bucketCount(BucketCountFor(wanted)) {}
+StringTable::StringTable(CaseRule rule, std::uint32_t wanted, OrderRule order)
+    : caseRule(rule), orderRule(order), bucketCount(BucketCountFor(wanted)) {}
 
 std::uint32_t StringTable::HashIgnoringCase(std::string_view key) {
     std::uint32_t hash = FIRST_HASH;
@@ -44,6 +46,36 @@ std::uint32_t StringTable::Hash(std::string_view key) const {
     return hash;
 }
 
+/// One that cannot be made to collide together with the first.
+std::uint32_t StringTable::OtherHash(std::string_view key) const {
+    std::string folded(key);
+    if (caseRule == CASE_IGNORED)
+        for (char &c : folded)
+            c = Basis::Ascii::ToUpper(c);
+    return static_cast<std::uint32_t>(std::hash<std::string>()(folded));
+}
+
+void StringTable::Rehash() {
+    isRehashed = true;
+    std::uint32_t all = NONE; // the nodes of all buckets in one chain
+    for (std::uint32_t &bucket : buckets)
+        while (bucket != NONE) {
+            std::uint32_t const number = bucket;
+            bucket = At(number).next;
+            At(number).next = all;
+            all = number;
+        }
+    while (all != NONE) {
+        Node &node = At(all);
+        std::uint32_t const next = node.next;
+        node.hash = OtherHash(node.key.View());
+        std::uint32_t &bucket = buckets[BucketOf(node.hash)];
+        node.next = bucket;
+        bucket = all;
+        all = next;
+    }
+}
+
 bool StringTable::Equal(std::string_view a, std::string_view b) const {
     return a == b || (caseRule == CASE_IGNORED && Basis::Ascii::EqualIgnoringCase(a, b));
 }
@@ -53,6 +85,8 @@ void StringTable::GrowForOneMore() {
         buckets.assign(bucketCount, NONE);
     if (count + 1 > bucketCount)
         Rebuild(BucketCountFor(count + 1));
+    if (isCrowded && !isRehashed && orderRule == ORDER_FREE)
+        Rehash();
 }
 
 /// Takes the nodes in the order of a walk, each to the front of its new bucket.
@@ -88,6 +122,8 @@ std::uint32_t StringTable::NewNode() {
 
 StringTable::Node *StringTable::Insert(Basis::StringBase<char> const &key, std::uint32_t hash,
                                        void *value) {
+    if (isRehashed)
+        hash = OtherHash(key.View());
     std::uint32_t const number = NewNode();
     Node &node = At(number);
     node.key = key;

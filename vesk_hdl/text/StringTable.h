@@ -20,6 +20,9 @@ namespace Vesk_Hdl {
 class StringTable {
 public:
     enum CaseRule { CASE_EXACT, CASE_IGNORED };
+    /// A table that nobody walks takes another hash once names that were made to collide fill a
+    /// bucket: looking one up stays as fast as any other.
+    enum OrderRule { ORDER_FIXED, ORDER_FREE };
 
     static constexpr std::uint32_t NONE = 0xFFFFFFFF; ///< the number of no node
 
@@ -31,7 +34,7 @@ public:
     };
 
     /// The table begins with the first bucket count of the series at or above `buckets`.
-    StringTable(CaseRule caseRule, std::uint32_t buckets);
+    StringTable(CaseRule caseRule, std::uint32_t buckets, OrderRule orderRule = ORDER_FIXED);
 
     std::size_t GetCount() const { return count; }
     Node *Find(std::string_view key) const { return Find(key, Hash(key)); }
@@ -39,12 +42,17 @@ public:
     Node *Find(std::string_view key, std::uint32_t hash) const {
         if (buckets.empty())
             return nullptr;
-        for (std::uint32_t at = buckets[BucketOf(hash)]; at != NONE;) {
+        if (isRehashed)
+            hash = OtherHash(key);
+        int length = 0;
+        for (std::uint32_t at = buckets[BucketOf(hash)]; at != NONE; ++length) {
             Node &node = At(at);
             if (node.hash == hash && Equal(node.key.View(), key))
                 return &node;
             at = node.next;
         }
+        if (length > LONGEST_BUCKET)
+            isCrowded = true;
         return nullptr;
     }
     /// The hash of tables that ignore case.
@@ -71,6 +79,7 @@ public:
 
 private:
     static constexpr std::uint32_t LARGEST_BLOCK = 1024;
+    static constexpr int LONGEST_BUCKET = 50; ///< chance makes none of that length
 
     /// A node by its number. Numbers take half the room of pointers, and a design has two nodes for
     /// each instance. Blocks have 1, 1, 2, 4 and on to 512 nodes, then LARGEST_BLOCK.
@@ -80,6 +89,8 @@ private:
                    : blocks[10 + number / LARGEST_BLOCK][number % LARGEST_BLOCK];
     }
     std::uint32_t Hash(std::string_view key) const;
+    std::uint32_t OtherHash(std::string_view key) const;
+    void Rehash();
     bool Equal(std::string_view a, std::string_view b) const;
     std::uint32_t BucketOf(std::uint32_t hash) const { return hash % bucketCount; }
     Node *FirstFrom(std::uint32_t bucket) const;
@@ -88,6 +99,9 @@ private:
     void Drop(std::uint32_t number);
 
     CaseRule caseRule;
+    OrderRule orderRule;
+    bool isRehashed = false;
+    mutable bool isCrowded = false; ///< a bucket is longer than chance would make it
     std::uint32_t bucketCount;
     std::size_t count = 0;
     std::vector<std::uint32_t> buckets;          ///< numbers of nodes; empty until the first text

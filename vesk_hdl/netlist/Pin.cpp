@@ -138,8 +138,7 @@ void Pin::SetPolarity(Polarity const &polarity) {
 Polarity Pin::GetPolarity() const { return static_cast<Polarity::Value>(Object::record->polarity); }
 StringBase<char> Pin::GetPolarityName() const { return GetPolarity().GetValueName(); }
 void Pin::SetDefaultValue(BitVectorValue const &value) {
-    BitVectorValue const held(value); // it may be this pin's own
-    OwnRare().defaultValue = held;
+    OwnRare().defaultValue = value;
 }
 void Pin::SetDefaultValue(char const *text) { SetDefaultValue(BitVectorValue(text)); }
 BitVectorValue Pin::GetDefaultValue() const { return Object::record->GetDefaultValue(); }

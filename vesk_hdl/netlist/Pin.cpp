@@ -137,9 +137,7 @@ void Pin::SetPolarity(Polarity const &polarity) {
 }
 Polarity Pin::GetPolarity() const { return static_cast<Polarity::Value>(Object::record->polarity); }
 StringBase<char> Pin::GetPolarityName() const { return GetPolarity().GetValueName(); }
-void Pin::SetDefaultValue(BitVectorValue const &value) {
-    OwnRare().defaultValue = value;
-}
+void Pin::SetDefaultValue(BitVectorValue const &value) { OwnRare().defaultValue = value; }
 void Pin::SetDefaultValue(char const *text) { SetDefaultValue(BitVectorValue(text)); }
 BitVectorValue Pin::GetDefaultValue() const { return Object::record->GetDefaultValue(); }
 

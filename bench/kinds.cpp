@@ -136,6 +136,40 @@ void WriteComponents(std::ostream &lines, long n) {
     }
 }
 
+/// Gates whose pins, instances and component have attributes.
+void WriteAttributes(std::ostream &lines, long n) {
+    lines << "ADD COMPONENT INV\n"
+             "ADD PIN INV I in\n"
+             "ADD PIN INV O out\n"
+             "ADD COMPONENT ATTRIBUTE INV INIT 0 Integer\n"
+             "SET COMPONENT ATTRIBUTE OPTION INV INIT -GENERIC=SYN\n"
+             "ADD PORT n0 in\n";
+    for (long i = 1; i <= n; ++i) {
+        lines << "ADD INSTANCE INV u" << i << '\n';
+        lines << "ADD INSTANCE ATTRIBUTE u" << i << " LOC X" << i << "Y1\n";
+        lines << "ADD INSTANCE PIN ATTRIBUTE u" << i << ".I DELAY " << i % 7 << " Integer\n";
+        lines << "ADD INSTANCE PIN ATTRIBUTE u" << i << ".O DELAY " << i % 5 << " Integer\n";
+        lines << "CONNECT SIGNAL n" << i - 1 << " u" << i << ".I\n";
+        lines << "CONNECT SIGNAL n" << i << " u" << i << ".O\n";
+    }
+}
+
+/// A thousand components with attributes that the text declares, assigns and hands on, all of them
+/// in the configuration.
+void WriteConfiguration(std::ostream &lines, long n) {
+    WriteComponents(lines, n);
+    for (long i = 0; i < 1000; ++i) {
+        lines << "ADD COMPONENT ATTRIBUTE C" << i << " KIND k" << i << '\n';
+        lines << "SET COMPONENT ATTRIBUTE OPTION C" << i << " KIND -SYNATTR=ASSIGN\n";
+    }
+    for (long i = 1; i <= n; ++i) {
+        lines << "ADD INSTANCE ATTRIBUTE u" << i << " LOC X" << i << "Y1\n";
+        lines << "SET INSTANCE ATTRIBUTE OPTION u" << i << " LOC -SYNATTR=ASSIGN\n";
+    }
+}
+
+constexpr int MANY_WRITES = 10;
+
 constexpr Kind KINDS[] = {
     {"chain", "instances", "two-input gates, each fed by the ones before", WriteChain},
     {"net", "instances", "one net on a pin of every instance", WriteNet},
@@ -144,6 +178,10 @@ constexpr Kind KINDS[] = {
     {"ports", "instances", "out ports that are read inside", WritePorts},
     {"compound", "instances", "bundles of a scalar, a slice and a bit", WriteCompound},
     {"components", "instances", "a thousand components", WriteComponents},
+    {"attributes", "instances", "attributes on every instance and pin", WriteAttributes},
+    {"configuration", "instances", "a thousand components, all attributes written",
+     WriteConfiguration},
+    {"writes", "instances", "a chain that is written ten times", WriteChain, MANY_WRITES},
 };
 
 } // namespace
@@ -160,8 +198,8 @@ void WriteDesign(std::ostream &lines, Kind const &kind, long n, std::string cons
                  std::string const &verilogFile) {
     lines << "SET NETLIST NAME bench_" << kind.name << '\n';
     kind.write(lines, n);
-    if (!vhdlFile.empty())
+    for (int i = 0; !vhdlFile.empty() && i < kind.writes; ++i)
         lines << "WRITE VHDL -NOHEADER " << vhdlFile << '\n';
-    if (!verilogFile.empty())
+    for (int i = 0; !verilogFile.empty() && i < kind.writes; ++i)
         lines << "WRITE VERILOG -NOHEADER " << verilogFile << '\n';
 }

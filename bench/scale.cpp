@@ -1,24 +1,16 @@
 // Runs the tool on designs of growing size and tells how its time and memory grow.
 
 #include <algorithm>
-#include <chrono>
 #include <cstdio>
-#include <cstdlib>
-#include <filesystem>
 #include <fstream>
-#include <limits>
 #include <map>
-#include <spawn.h>
 #include <stdexcept>
-#include <sys/resource.h>
-#include <sys/wait.h>
-#include <system_error>
-#include <unistd.h>
 #include <vector>
 
 #include <CLI/CLI.hpp>
 
 #include "bench/kinds.h"
+#include "bench/measure.h"
 
 namespace {
 
@@ -28,7 +20,7 @@ namespace fs = std::filesystem;
 constexpr long LARGE = 1000000;
 constexpr int RUNS = 3;
 /// Time that grows by more than this, against the growth of N, gets a mark.
-constexpr double BEND = 1.2;
+constexpr double BEND = 1.05;
 
 struct Options {
     std::vector<long> sizes = {10000, 100000, LARGE};
@@ -37,87 +29,76 @@ struct Options {
     int runs = 0; ///< 0 leaves it to the size
     std::string tool;
     std::string otherTool;
+    std::string lastFile;
 };
 
-/// What a run costs, or the least of several runs.
-struct Cost {
-    double wall = std::numeric_limits<double>::infinity(); ///< in seconds
-    double cpu = std::numeric_limits<double>::infinity();  ///< in seconds, user and system
-    double peak = std::numeric_limits<double>::infinity(); ///< resident, in bytes
-
-    void Lower(Cost const &other) {
-        wall = std::min(wall, other.wall);
-        cpu = std::min(cpu, other.cpu);
-        peak = std::min(peak, other.peak);
-    }
-};
-
-double Seconds(timeval const &time) {
-    return static_cast<double>(time.tv_sec) + 1e-6 * static_cast<double>(time.tv_usec);
-}
-
-/// A folder that goes away with this object.
-class ScratchFolder {
+/// The figures of the last run, in a file of the user's: they are those of one machine.
+class LastRun {
 public:
-    ScratchFolder() {
-        std::string name = (fs::temp_directory_path() / "vesk_hdl_scale.XXXXXX").string();
-        if (!::mkdtemp(name.data()))
-            throw std::system_error(errno, std::generic_category(), name);
-        path = name;
-    }
-    ~ScratchFolder() {
-        std::error_code ignored;
-        fs::remove_all(path, ignored);
-    }
-    ScratchFolder(ScratchFolder const &) = delete;
-    ScratchFolder &operator=(ScratchFolder const &) = delete;
+    struct Figures {
+        double cpu;
+        double bytes;
+    };
 
-    fs::path const &GetPath() const { return path; }
+    /// No file, or none that this program wrote, is no last run.
+    explicit LastRun(std::string fileName) : name(std::move(fileName)) {
+        std::ifstream file(name);
+        for (std::string line; std::getline(file, line);) {
+            char point[64] = "";
+            Figures figures = {};
+            if (std::sscanf(line.c_str(), R"( {"point": "%63[^"]", "cpu": %lf, "bytes": %lf})",
+                            point, &figures.cpu, &figures.bytes) == 3)
+                last[point] = figures;
+        }
+    }
+
+    /// Null if the point was not measured then.
+    Figures const *Get(std::string const &point) const {
+        auto const found = last.find(point);
+        return found == last.end() ? nullptr : &found->second;
+    }
+    void Note(std::string const &point, Figures const &figures) { now[point] = figures; }
+
+    /// What was not measured now stays.
+    void Save() {
+        if (name.empty())
+            return;
+        now.merge(last);
+        std::ofstream file(name);
+        char const *separator = "[\n";
+        for (auto const &[point, figures] : now) {
+            file << separator << R"({"point": ")" << point << R"(", "cpu": )" << figures.cpu
+                 << R"(, "bytes": )" << figures.bytes << '}';
+            separator = ",\n";
+        }
+        file << "\n]\n";
+        if (!file.flush())
+            throw std::runtime_error(name + ": cannot be written");
+    }
 
 private:
-    fs::path path;
+    std::string name;
+    std::map<std::string, Figures> last;
+    std::map<std::string, Figures> now;
 };
-
-Cost RunTool(std::string tool, fs::path const &folder, fs::path const &design) {
-    std::string words[] = {std::move(tool), "run", "--output-dir", folder.string(),
-                           design.string()};
-    std::vector<char *> arguments;
-    for (std::string &word : words)
-        arguments.push_back(word.data());
-    arguments.push_back(nullptr);
-
-    auto const begin = std::chrono::steady_clock::now();
-    pid_t process = 0;
-    int const error =
-        ::posix_spawn(&process, arguments[0], nullptr, nullptr, arguments.data(), environ);
-    if (error != 0)
-        throw std::system_error(error, std::generic_category(), words[0]);
-    int status = 0;
-    rusage usage = {};
-    if (::wait4(process, &status, 0, &usage) < 0)
-        throw std::system_error(errno, std::generic_category(), words[0]);
-    std::chrono::duration<double> const wall = std::chrono::steady_clock::now() - begin;
-    if (!WIFEXITED(status) || WEXITSTATUS(status) != 0)
-        throw std::runtime_error(words[0] + ": failed on " + words[4]);
-    return {wall.count(), Seconds(usage.ru_utime) + Seconds(usage.ru_stime),
-            1024.0 * static_cast<double>(usage.ru_maxrss)};
-}
 
 class Measurement {
 public:
-    explicit Measurement(Options const &asked) : options(asked) {}
+    explicit Measurement(Options const &asked) : options(asked), last(asked.lastFile) {}
 
-    void Run() const {
-        std::printf("%-10s %8s %9s %9s %7s %9s%s\n", "kind", "N", "wall s", "cpu s", "growth",
-                    "bytes/N", options.otherTool.empty() ? "" : "  time and bytes to other");
+    void Run() {
+        std::printf("%-13s %8s %9s %9s %7s %9s%s%s\n", "kind", "N", "wall s", "cpu s", "growth",
+                    "bytes/N", options.lastFile.empty() ? "" : "  cpu and bytes to last",
+                    options.otherTool.empty() ? "" : "  to other");
         for (Kind const &kind : GetKinds())
             if (options.kinds.empty() || std::find(options.kinds.begin(), options.kinds.end(),
                                                    kind.name) != options.kinds.end())
                 RunKind(kind);
+        last.Save();
     }
 
 private:
-    void RunKind(Kind const &kind) const {
+    void RunKind(Kind const &kind) {
         double const empty = Point(kind, 0, 1).front().peak;
         Cost former;
         long formerSize = 0;
@@ -126,7 +107,7 @@ private:
             std::vector<Cost> const costs = Point(kind, size, runs);
             Cost const &cost = costs.front();
             auto const n = static_cast<double>(size);
-            std::printf("%-10s %8ld %9.3f %9.3f ", kind.name, size, cost.wall, cost.cpu);
+            std::printf("%-13s %8ld %9.3f %9.3f ", kind.name, size, cost.wall, cost.cpu);
             if (formerSize == 0) {
                 std::printf("%6s  ", "");
             } else {
@@ -134,7 +115,10 @@ private:
                 bool const bends = growth > BEND * n / static_cast<double>(formerSize);
                 std::printf("%6.1f%c ", growth, bends ? '!' : ' ');
             }
-            std::printf("%9.0f", (cost.peak - empty) / n);
+            LastRun::Figures const figures = {cost.cpu, (cost.peak - empty) / n};
+            std::printf("%9.0f", figures.bytes);
+            PrintToLast(std::string(kind.name) + " " + options.output + " " + std::to_string(size),
+                        figures);
             if (costs.size() > 1)
                 std::printf("  %6.2f %6.2f", cost.cpu / costs[1].cpu, cost.peak / costs[1].peak);
             std::printf("\n");
@@ -144,13 +128,25 @@ private:
         }
     }
 
+    void PrintToLast(std::string const &point, LastRun::Figures const &figures) {
+        if (options.lastFile.empty())
+            return;
+        if (LastRun::Figures const *const before = last.Get(point))
+            std::printf("  %10.2f %10.2f", figures.cpu / before->cpu,
+                        figures.bytes / before->bytes);
+        else
+            std::printf("  %10s %10s", "-", "-");
+        last.Note(point, figures);
+    }
+
     /// What a design costs each tool. The tools take turns, so that both meet the same weather.
     std::vector<Cost> Point(Kind const &kind, long size, int runs) const {
         fs::path const design = scratch.GetPath() / "design.cmd";
         {
             std::ofstream lines(design);
-            WriteDesign(lines, kind, size, options.output == "vhdl" ? "design.vhd" : "",
-                        options.output == "verilog" ? "design.v" : "");
+            bool const both = options.output == "both";
+            WriteDesign(lines, kind, size, both || options.output == "vhdl" ? "design.vhd" : "",
+                        both || options.output == "verilog" ? "design.v" : "");
             lines.close();
             if (!lines)
                 throw std::runtime_error(design.string() + ": cannot be written");
@@ -161,11 +157,13 @@ private:
         std::vector<Cost> least(tools.size());
         for (int run = 0; run < runs; ++run)
             for (std::size_t i = 0; i < tools.size(); ++i)
-                least[i].Lower(RunTool(tools[i], scratch.GetPath(), design));
+                least[i].Lower(
+                    RunProgram({tools[i], "run", design.string()}, scratch.GetPath(), false));
         return least;
     }
 
     Options const &options;
+    LastRun last;
     ScratchFolder scratch;
 };
 
@@ -182,7 +180,7 @@ int main(int argc, char **argv) {
         ->capture_default_str();
     app.add_option("--kind", options.kinds, "Only these kinds")->check(CLI::IsMember(kindNames));
     app.add_option("--output", options.output, "What is written; none only reads")
-        ->check(CLI::IsMember({"none", "vhdl", "verilog"}))
+        ->check(CLI::IsMember({"none", "vhdl", "verilog", "both"}))
         ->capture_default_str();
     app.add_option("--runs", options.runs, "Runs for each point, of which the least counts");
     app.add_option("--tool", options.tool, "The vesk-hdl to measure")
@@ -190,8 +188,12 @@ int main(int argc, char **argv) {
         ->check(CLI::ExistingFile);
     app.add_option("--against", options.otherTool, "Another vesk-hdl to compare it with")
         ->check(CLI::ExistingFile);
+    app.add_option("--last", options.lastFile, "Keeps the figures here, and compares with those");
     CLI11_PARSE(app, argc, argv);
     try {
+        options.tool = fs::absolute(options.tool).string();
+        if (!options.otherTool.empty())
+            options.otherTool = fs::absolute(options.otherTool).string();
         Measurement(options).Run();
     } catch (std::exception const &error) {
         std::fprintf(stderr, "vesk_hdl_scale: %s\n", error.what());

@@ -98,7 +98,7 @@ void FindKeyword(benchmark::State &state, char const *line) {
         benchmark::DoNotOptimize(factory.GetCommandCreator(tokens));
 }
 BENCHMARK_CAPTURE(FindKeyword, short, "ADD PIN u1 p1 in");
-BENCHMARK_CAPTURE(FindKeyword, long, "ADD INSTANCE PIN ATTRIBUTE u1 p1 INIT 1 String");
+BENCHMARK_CAPTURE(FindKeyword, long, "ADD INSTANCE PIN ATTRIBUTE u1.p1 INIT 1 String");
 BENCHMARK_CAPTURE(FindKeyword, unknown, "NO SUCH COMMAND");
 
 void RunLines(benchmark::State &state, char const *kind, char const *keyword) {

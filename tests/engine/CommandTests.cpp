@@ -44,6 +44,35 @@ TEST(CommandFactory, TheLongestKeywordWins) {
     EXPECT_EQ(nullptr, factory.CreateCommand(nullptr, "unknown"));
 }
 
+/// A command that runs another line before it looks at its own.
+class NestingCommand : public Command {
+public:
+    static inline std::string seen;
+    using Command::Command;
+    bool ParseArguments(StringArray const &tokens) override {
+        GetModel()->Execute("ADD SIGNAL 'in side' in");
+        seen = tokens.Concatenate("|");
+        return true;
+    }
+    void Execute() override {}
+    char const *GetKeyword() const override { return "nest"; }
+    static Command *Make(Model *owner, StringArray const &) { return new NestingCommand(owner); }
+};
+
+TEST(Model, EachLineHasItsOwnTokensAlsoInsideAnother) {
+    Design design;
+    design.factory.AddCommandCreator("nest", NestingCommand::Make);
+    for (char const *const line :
+         {"nest a 'b c' d", "nest a bcd e f g h", "nest", "nest x ''  y"}) {
+        Basis::StringBase<char> const alone =
+            StringArray(line, " ", true, "\"\"''").Concatenate("|");
+        if (Signal *const made = design.netlist.GetSignal("in side"))
+            design.netlist.Remove(made);
+        EXPECT_EQ("", Refusal(design.model, {line})) << line;
+        EXPECT_EQ(alone.GetText(), NestingCommand::seen) << line;
+    }
+}
+
 TEST(CommandManager, KeepsWhatRanAndDeletesWhatFailed) {
     Design design;
     design.factory.AddCommandCreator("tell", TellingCommand<1>::Make);

@@ -119,6 +119,29 @@ bool SortsBefore(void *a, void *b, void *) {
     return ModelCompare(first->GetName().GetText(), second->GetName().GetText()) < 0;
 }
 
+TEST(Netlist, PartsThatAscendAreMovedAsASortWouldMoveThem) {
+    std::mt19937 random(5);
+    for (int round = 0; round < 200; ++round) {
+        Netlist netlist("n");
+        std::vector<Signal *> expected;
+        int const size = static_cast<int>(random() % 12);
+        for (int i = 0; i < size; ++i) {
+            auto *const signal = AddScalar(netlist, ("n" + std::to_string(i)).c_str());
+            if (random() % 2)
+                signal->SetPortPolarity(static_cast<Polarity::Value>(random() % 3));
+            expected.push_back(signal);
+        }
+        if (round % 4 == 0 && size > 2) // one name out of its order
+            expected[random() % expected.size()]->SetName("a");
+        std::stable_sort(expected.begin(), expected.end(),
+                         [](Signal *a, Signal *b) { return SortsBefore(a, b, nullptr); });
+        netlist.SortNetlist();
+        std::vector<Signal *> sorted;
+        ForEach(netlist.GetSignalIterator(), [&sorted](Signal *s) { sorted.push_back(s); });
+        EXPECT_EQ(expected, sorted);
+    }
+}
+
 TEST(Netlist, SortsLikeAModelAndAsTheArraySortDoes) {
     std::mt19937 random(1);
     for (std::string const start : {"", "n", "a_name_of_thirty_characters_9"}) {

@@ -88,6 +88,50 @@ TEST(Pin, CopiesShareTheSignalButAreNotListed) {
     EXPECT_EQ("B(3:0)", NamesOf(signal.GetPinIterator()));
 }
 
+TEST(Pin, WhatCopiesShareChangesForOneAlone) {
+    Component component("C");
+    component.AddPin("A", Polarity::INPUT, "1");
+    Instance first("u1", &component);
+    Instance second("u2", &component);
+    Pin *const changed = first.GetPin("A");
+    Pin *const kept = second.GetPin("A");
+    Basis::StringBase<char> const former = changed->GetName();
+    changed->SetPolarity(Polarity::OUTPUT);
+    changed->SetDefaultValue("0");
+    changed->AddComment("c");
+    changed->SetName("B");
+    EXPECT_STREQ("A", former);
+    EXPECT_TRUE(changed->GetPolarity() == Polarity::OUTPUT && changed->HasComment());
+    EXPECT_STREQ("0", changed->GetDefaultValue().GetValue());
+    for (Pin const *const pin : {component.GetPin("A"), kept}) {
+        EXPECT_TRUE(pin->GetPolarity() == Polarity::INPUT && !pin->HasComment());
+        EXPECT_STREQ("1", pin->GetDefaultValue().GetValue());
+        EXPECT_STREQ("A", pin->GetName());
+    }
+    static_cast<Object &>(*kept) = *changed; // the name and comment alone
+    EXPECT_STREQ("B", kept->GetName());
+    EXPECT_TRUE(kept->GetPolarity() == Polarity::INPUT && kept->HasComment());
+    EXPECT_STREQ("1", kept->GetDefaultValue().GetValue());
+}
+
+TEST(Pin, IsListedOnceHoweverItCameToItsSignal) {
+    ScalarSignal signal("s");
+    ScalarSignal other("t");
+    ScalarPin pin("P", Polarity::INPUT);
+    signal.Connect(&pin);
+    pin.Connect(&other); // one way: the signal goes on listing it
+    signal.Connect(&pin);
+    EXPECT_EQ(&other, pin.GetSignal());
+    pin.Disconnect();
+    signal.Connect(&pin);
+    EXPECT_EQ(nullptr, pin.GetSignal());
+    EXPECT_EQ("P", NamesOf(signal.GetPinIterator()));
+    signal.Disconnect(&pin);
+    signal.Connect(&pin);
+    EXPECT_EQ(&signal, pin.GetSignal());
+    EXPECT_EQ("P", NamesOf(signal.GetPinIterator()));
+}
+
 TEST(Instance, IsASnapshotOfItsComponent) {
     Component component("C");
     component.AddPin("B", Polarity::INPUT, "1");

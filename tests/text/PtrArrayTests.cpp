@@ -8,6 +8,8 @@
 
 #include <gtest/gtest.h>
 
+#include "vesk_hdl/text/LentPtrArray.h"
+
 using namespace Vesk_Hdl;
 
 namespace {
@@ -53,6 +55,26 @@ struct Mortal {
     std::string &deaths;
     char name;
 };
+
+TEST(InlinePtrArray, IsAPtrArrayAlsoBehindItsRoom) {
+    Item a{1}, b{2};
+    PtrArray<Item *> plain;
+    InlinePtrArray<Item *, 2> lent;
+    auto const onBoth = [&](auto act) {
+        act(plain);
+        act(lent);
+        EXPECT_EQ(In(plain), In(lent));
+    };
+    for (Item *const item : {&a, &b, &a, &b, &b})
+        onBoth([item](PtrArray<Item *> &array) { array.Add(item); });
+    onBoth([&b](PtrArray<Item *> &array) { array.Remove(&b); });
+    onBoth([](PtrArray<Item *> &array) { array.Empty(); });
+    onBoth([&a](PtrArray<Item *> &array) { array.SetAt(6, &a); });
+    InlinePtrArray<Item *, 2> jumped; // past its room at once
+    jumped.Add(&b);
+    jumped.SetAt(3, &a);
+    EXPECT_EQ(In(jumped), (Items{&b, nullptr, nullptr, &a}));
+}
 
 TEST(OwnPtrArray, DeletesWhatItHoldsLastFirst) {
     std::string deaths;

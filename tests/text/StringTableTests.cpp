@@ -172,4 +172,24 @@ TEST(IStringPtrMap, AnswersLikeANaiveMap) {
         ASSERT_TRUE(assigned.Get(name.c_str()) == pointer && copy.Get(name.c_str()) == pointer);
 }
 
+/// "1Z" and "29" hash alike, and so does everything that is made of them: 65,536 names in one
+/// bucket would have this test run for a minute.
+TEST(IStringPtrMap, FindsNamesThatWereMadeToCollide) {
+    constexpr unsigned int PAIRS = 16;
+    auto const nameOf = [](unsigned int number) {
+        std::string name;
+        for (unsigned int bit = 0; bit < PAIRS; ++bit)
+            name += number >> bit & 1U ? "1z" : "29";
+        return name;
+    };
+    std::vector<int> values(1U << PAIRS);
+    IStringPtrMap<int *> map;
+    for (unsigned int i = 0; i < values.size(); ++i)
+        map.Add(nameOf(i).c_str(), &values[i]);
+    map.Remove("292929292929292929292929292929"
+               "1Z");
+    for (unsigned int i = 0; i < values.size(); ++i)
+        ASSERT_EQ(i == 1U << (PAIRS - 1) ? nullptr : &values[i], map.Get(nameOf(i).c_str())) << i;
+}
+
 } // namespace

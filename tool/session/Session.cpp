@@ -6,13 +6,6 @@
 
 using namespace Vesk_Hdl;
 
-namespace {
-
-/// Commands are kept as done until somebody clears them, and the tool never looks back.
-constexpr int MOST_DONE_COMMANDS = 4096;
-
-} // namespace
-
 Session::Session(std::string const &modelName) {
     engine.CreateAndAddModel(modelName.c_str(), nullptr);
     engine.UseModel(modelName.c_str());
@@ -28,8 +21,9 @@ std::optional<Diagnostic> Session::RunLine(std::string const &line, Place const 
     } catch (Exception const &refusal) {
         return BlameRefusal(line, place, refusal.getDescription(), *model);
     }
-    if (model->GetCommandManager()->GetDoneCommandCount() >= MOST_DONE_COMMANDS)
-        model->GetCommandManager()->Clear();
+    // Commands are kept as done until somebody clears them, and the tool never looks back. One at a
+    // time: its memory is then at hand for the next one.
+    model->GetCommandManager()->Clear();
     WriteStatus const &write = model->GetLastWrite();
     if (write.number == writesBefore || write.error == 0)
         return std::nullopt;

@@ -45,6 +45,20 @@ bool IsInnerSignal(Signal const &signal) {
     return signal.GetPortPolarity() == Polarity::INVALID && signal.IsNeededToDeclared();
 }
 
+/// The instances that the declarations need: the first of each component and those with attributes
+/// of their own. The others would add nothing, so that one walk over a million of them is enough.
+void FindTelling(Netlist const *netlist, PtrArray<Instance *> &telling) {
+    std::unordered_set<Component const *> seen;
+    Component const *last = nullptr;
+    ForEach(netlist->GetInstanceIterator(), [&](Instance *instance) {
+        Component const *const component = instance->GetComponent();
+        bool const isFirst = component != last && seen.insert(component).second;
+        last = component;
+        if (isFirst || instance->HasAttrs())
+            telling.Add(instance);
+    });
+}
+
 Text BaseNameOf(Object const &object) { return Object::GetBaseName(object.GetNameRef()); }
 
 } // namespace
@@ -142,12 +156,14 @@ void VhdlNetlister::WriteArchitecture(Netlist const *netlist, HdlOptions const *
     Iterator<Signal *> signals = netlist->GetSignalIterator();
     Put(*stream, "architecture", " BEHAVIORAL ", "of", " ", netlist->GetNameRef(), " ", "is", EOL);
     stream->Indent();
-    WriteAttrDeclarations(netlist, options);
+    Instances telling;
+    FindTelling(netlist, telling);
+    WriteAttrDeclarations(netlist, telling, options);
     int const width = Netlist::GetLongestSignalName(signals);
     ForEach(signals, [&](Signal const *signal) { WriteSignalDeclaration(signal, options, width); });
     if (!options->vhdlOption.suppressComponent)
-        WriteComponents(netlist, options);
-    WriteSynthesisAttrAssignment(netlist, options);
+        WriteComponents(telling, options);
+    WriteSynthesisAttrAssignment(netlist, telling, options);
     stream->Unindent();
     Put(*stream, "begin", EOL);
     stream->Indent();
@@ -159,14 +175,15 @@ void VhdlNetlister::WriteArchitecture(Netlist const *netlist, HdlOptions const *
 }
 
 /// The attributes of ports were declared in the entity.
-void VhdlNetlister::WriteAttrDeclarations(Netlist const *netlist, HdlOptions const *options) {
+void VhdlNetlister::WriteAttrDeclarations(Netlist const *netlist, Instances const &telling,
+                                          HdlOptions const *options) {
     bool const useAttrType = options->vhdlOption.useAttrType;
     int const width = Netlist::GetLongestAttrName(netlist);
     ForEach(netlist->GetSignalIterator(), [&](Signal const *signal) {
         if (IsInnerSignal(*signal))
             statements->WriteAttrDeclaration(signal, declaredAttrs, useAttrType, width);
     });
-    ForEach(netlist->GetInstanceIterator(), [&](Instance const *instance) {
+    ForEach(telling, [&](Instance const *instance) {
         statements->WriteAttrDeclaration(instance->GetComponent(), declaredAttrs, useAttrType,
                                          width);
         statements->WriteAttrDeclaration(instance, declaredAttrs, useAttrType, width);
@@ -186,13 +203,11 @@ void VhdlNetlister::WriteSignalDeclaration(Signal const *signal, HdlOptions cons
 }
 
 /// Each component once, at its first instance.
-void VhdlNetlister::WriteComponents(Netlist const *netlist, HdlOptions const *options) {
+void VhdlNetlister::WriteComponents(Instances const &telling, HdlOptions const *options) {
     StringSet names;
-    std::unordered_set<Component const *> seen; // asks a name once for each component, not instance
-    ForEach(netlist->GetInstanceIterator(), [&](Instance const *instance) {
+    ForEach(telling, [&](Instance const *instance) {
         Component const *const component = instance->GetComponent();
-        if (!component || !seen.insert(component).second ||
-            names.IContains(component->GetNameRef().View()))
+        if (!component || names.IContains(component->GetNameRef().View()))
             return;
         names.Add(component->GetNameRef());
         WriteComponent(component, options);
@@ -223,14 +238,14 @@ void VhdlNetlister::WriteComponent(Component const *component, HdlOptions const 
     *stream << EOL;
 }
 
-void VhdlNetlister::WriteSynthesisAttrAssignment(Netlist const *netlist,
+void VhdlNetlister::WriteSynthesisAttrAssignment(Netlist const *netlist, Instances const &telling,
                                                  HdlOptions const *options) {
     ForEach(netlist->GetSignalIterator(), [&](Signal const *signal) {
         if (signal->HasAttrs() && IsInnerSignal(*signal))
             statements->WriteAttrAssignment(signal, BaseNameOf(*signal), "signal",
                                             options->vhdlOption.useAttrType);
     });
-    ForEach(netlist->GetInstanceIterator(),
+    ForEach(telling,
             [&](Instance const *instance) { WriteInstanceAttrAssignment(instance, options); });
 }
 

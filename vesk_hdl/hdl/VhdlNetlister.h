@@ -33,11 +33,14 @@ public:
 private:
     void WriteEntity(Netlist const *netlist, HdlOptions const *options);
     void WriteArchitecture(Netlist const *netlist, HdlOptions const *options);
-    void WriteAttrDeclarations(Netlist const *netlist, HdlOptions const *options);
+    using Instances = PtrArray<Instance *>;
+    void WriteAttrDeclarations(Netlist const *netlist, Instances const &telling,
+                               HdlOptions const *options);
     void WriteSignalDeclaration(Signal const *signal, HdlOptions const *options, int width);
-    void WriteComponents(Netlist const *netlist, HdlOptions const *options);
+    void WriteComponents(Instances const &telling, HdlOptions const *options);
     void WriteComponent(Component const *component, HdlOptions const *options);
-    void WriteSynthesisAttrAssignment(Netlist const *netlist, HdlOptions const *options);
+    void WriteSynthesisAttrAssignment(Netlist const *netlist, Instances const &telling,
+                                      HdlOptions const *options);
     void WriteAssignments(Netlist const *netlist);
     void WriteConfiguration(Netlist const *netlist);
     void WriteConfigurationItem(Component const *component, PtrArray<Instance *> const &instances);

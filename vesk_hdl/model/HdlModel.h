@@ -58,7 +58,8 @@ public:
     HdlOptions *GetOptions() const;
     Netlist *GetNetlist() const;
     /// The commands that ran. They are kept until somebody clears them: a client that feeds a large
-    /// design calls `GetCommandManager()->Clear()` from time to time, which changes nothing else.
+    /// design calls `GetCommandManager()->Clear()` after each line, which changes nothing else. The
+    /// next line then takes the memory of the last one, which costs least.
     CommandManager *GetCommandManager() const;
     /// The model's name is its netlist's. Null means "HDL_NETLIST".
     void SetName(char const *name);

@@ -28,7 +28,7 @@ public:
     void Remove(Basis::StringBase<char> const &name) { table.Remove(name.View()); }
 
 private:
-    StringTable table{StringTable::CASE_IGNORED, 7};
+    StringTable table{StringTable::CASE_IGNORED, 7, StringTable::ORDER_FREE};
 };
 
 } // namespace Vesk_Hdl

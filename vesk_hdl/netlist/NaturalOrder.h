@@ -56,7 +56,6 @@ private:
     /// False, and all as it was, unless the names of each polarity ascend.
     bool Part() {
         char const *last[PARTS] = {};
-        int count[PARTS] = {};
         int highest = 0;
         bool isParted = true;
         for (int i = 0; i < GetSize(); ++i) {
@@ -67,25 +66,28 @@ private:
             if (last[part] && NaturalCompare(last[part], name) >= 0)
                 return false;
             last[part] = name;
-            ++count[part];
             isParted = isParted && part >= highest;
             highest = std::max(highest, part);
         }
         if (!isParted)
-            MoveParts(count);
+            MoveParts();
         return true;
     }
 
-    void MoveParts(int const (&count)[PARTS]) {
-        int next[PARTS] = {};
-        for (int part = 1; part < PARTS; ++part)
-            next[part] = next[part - 1] + count[part - 1];
-        std::vector<T> parted(static_cast<std::size_t>(GetSize()));
-        for (int i = 0; i < GetSize(); ++i)
-            parted[static_cast<std::size_t>(next[PolarityAt(i) - Polarity::INVALID]++)] =
-                array.GetAt(i);
-        for (int i = 0; i < GetSize(); ++i)
-            array.SetAt(i, parted[static_cast<std::size_t>(i)]);
+    /// The first part, mostly by far the largest, moves up in its place.
+    void MoveParts() {
+        std::vector<T> others[PARTS];
+        int size = 0;
+        for (int i = 0; i < GetSize(); ++i) {
+            int const part = PolarityAt(i) - Polarity::INVALID;
+            if (part == 0)
+                array.SetAt(size++, array.GetAt(i));
+            else
+                others[part].push_back(array.GetAt(i));
+        }
+        for (std::vector<T> const &part : others)
+            for (T const item : part)
+                array.SetAt(size++, item);
     }
 
     void SortAll() {

@@ -294,8 +294,12 @@ int Netlist::GetLongestAttrName(Netlist const *netlist) {
         if (signal->GetPortPolarity() == Polarity::INVALID && signal->IsNeededToDeclared())
             GetLongestAttrName(signal, longest);
     });
-    ForEach(netlist->record->instances, [&longest](Instance const *instance) {
-        GetLongestAttrName(instance->GetComponent(), longest);
+    Component const *last = nullptr; // a look at the same one again tells nothing new
+    ForEach(netlist->record->instances, [&longest, &last](Instance const *instance) {
+        Component const *const component = instance->GetComponent();
+        if (component != last)
+            GetLongestAttrName(component, longest);
+        last = component;
         GetLongestAttrName(instance, longest);
     });
     return longest;

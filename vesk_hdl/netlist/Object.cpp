@@ -1,35 +1,87 @@
 #include "vesk_hdl/netlist/Object.h"
 
+#include <utility>
+
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/ObjectRecord.h"
 #include "vesk_hdl/text/basis/Counting.h"
 #include "vesk_hdl/text/basis/Functions.h"
+#include "vesk_hdl/text/basis/OrEmpty.h"
 
 namespace Vesk_Hdl {
 
 using Basis::StringBase;
 
-Object::Object() : record(new Record) {}
+namespace {
 
-Object::Object(Object const &other) : record(other.record) {
-    Basis::Counting::Join(record->owners);
+StringBase<char> NormalText(char const *name) {
+    StringBase<char> text(name);
+    Names::Normalize(text);
+    return text;
 }
+
+} // namespace
+
+/// That of all objects without a name. It is never counted or freed.
+Object::Record *Object::NoRecord() {
+    static Record none{};
+    return &none;
+}
+
+/// A record with that name, all else as in `model`.
+template <class Made>
+Object::Record *Object::MakeRecord(std::string_view name, Record const &model) {
+    void *room = nullptr;
+    StringBase<char> text = StringBase<char>::MakeWithRoom(name, sizeof(Made), room);
+    auto *const made = new (room) Made(model);
+    made->name = std::move(text);
+    return made;
+}
+
+void Object::Replace(Record *now) {
+    Release();
+    record = now;
+}
+
+void Object::Rename(std::string_view name) {
+    Replace(record->isRare ? MakeRecord<RareRecord>(name, *record)
+                           : MakeRecord<Record>(name, *record));
+}
+
+/// The record for writing anything but the name: this object's alone.
+Object::Record &Object::Own() {
+    if (record == NoRecord() || record->owners.load(std::memory_order_acquire) != 1)
+        Rename(record->name.View());
+    return *record;
+}
+
+Object::RareRecord &Object::OwnRare() {
+    if (record->isRare)
+        Own();
+    else
+        Replace(MakeRecord<RareRecord>(record->name.View(), *record));
+    return *static_cast<RareRecord *>(record);
+}
+
+Object::Object() : record(NoRecord()) {}
+
+Object::Object(Object const &other) : record(other.record) { Join(); }
 
 Object::~Object() { Release(); }
 
-void Object::Release() {
-    if (Basis::Counting::Leave(record->owners))
-        delete record;
+void Object::Join() {
+    if (record != NoRecord())
+        Basis::Counting::Join(record->owners);
 }
 
-/// The record for writing: this object's alone.
-Object::Record &Object::Own() {
-    if (record->owners.load(std::memory_order_acquire) != 1) {
-        auto *const copy = new Record(*record);
-        Release();
-        record = copy;
-    }
-    return *record;
+void Object::Release() {
+    if (record == NoRecord() || !Basis::Counting::Leave(record->owners))
+        return;
+    StringBase<char> const block = std::move(record->name); // which the record stands in
+    if (record->isRare)
+        static_cast<RareRecord *>(record)->~RareRecord();
+    else
+        record->~Record();
 }
 
 /// What makes a pin a pin stays behind; where that is alike, all the rest can be shared.
@@ -40,19 +92,21 @@ Object &Object::operator=(Object const &other) {
         Share(other);
         return *this;
     }
-    Record &own = Own();
-    own.name = other.record->name;
-    own.objectType = other.record->objectType;
-    if (HasComment() || other.HasComment())
-        own.OwnRare().comment = other.record->GetComment();
+    bool const hasComment = HasComment() || other.HasComment();
+    Rename(other.record->name.View());
+    record->objectType = other.record->objectType;
+    if (hasComment)
+        OwnRare().comment = other.record->GetComment();
     return *this;
 }
 
 /// Takes over everything.
 void Object::Share(Object const &other) {
-    Basis::Counting::Join(other.record->owners);
+    if (record == other.record)
+        return;
     Release();
     record = other.record;
+    Join();
 }
 
 bool Object::operator==(Object const &other) const {
@@ -65,10 +119,10 @@ void Object::SetName(char const *name) { SetNormalizedName(name); }
 StringBase<char> Object::GetName() const { return record->name; }
 StringBase<char> const &Object::GetNameRef() const { return record->name; }
 StringBase<char> Object::GetComment() const { return record->GetComment(); }
-bool Object::HasComment() const { return record->rare && !record->rare->comment.IsEmpty(); }
+bool Object::HasComment() const { return !record->GetComment().IsEmpty(); }
 
 void Object::AddComment(char const *text) {
-    StringBase<char> &comment = Own().OwnRare().comment;
+    StringBase<char> &comment = OwnRare().comment;
     comment += text;
     comment += '\n';
 }
@@ -94,12 +148,14 @@ Object::ObjectType Object::GetStoredObjectType() const {
 
 void Object::SetObjectType(ObjectType type) { Own().objectType = static_cast<short>(type); }
 
-void Object::SetNameText(StringBase<char> const &name) { Own().name = name; }
+void Object::SetNameText(StringBase<char> const &name) { Rename(name.View()); }
 
 void Object::SetNormalizedName(char const *name) {
-    StringBase<char> text(name);
-    Names::Normalize(text);
-    Own().name = std::move(text);
+    std::string_view const text = Basis::ViewOf(name);
+    if (Names::IsNormal(text))
+        Rename(text);
+    else
+        Rename(NormalText(name).View());
 }
 
 ObjectVisitor::~ObjectVisitor() = default;

@@ -70,8 +70,15 @@ protected:
 private:
     friend class Pin;
     struct Record;
+    struct RareRecord;
+    static Record *NoRecord();
+    template <class Made> static Record *MakeRecord(std::string_view name, Record const &model);
     Record &Own();
+    RareRecord &OwnRare();
+    void Rename(std::string_view name);
+    void Replace(Record *now);
     void Share(Object const &other);
+    void Join();
     void Release();
 
     Record *record; ///< shared with copies

@@ -1,7 +1,6 @@
 #pragma once
 
 #include <atomic>
-#include <memory>
 
 #include "vesk_hdl/netlist/Object.h"
 #include "vesk_hdl/netlist/Values.h"
@@ -11,41 +10,47 @@ namespace Vesk_Hdl {
 /// What an object shares with its copies until one of them changes. A pin's polarity and default
 /// value stand here as well: the pins of a million instances are what their components' pins are,
 /// and so cost their signal alone.
+///
+/// A record stands in the block of its name's text, behind the characters. Who changes the name
+/// makes another record; the block goes when the record and all copies of the text are gone.
 struct Object::Record {
-    /// What few objects have.
-    struct Rare {
-        Basis::StringBase<char> comment;
-        BitVectorValue defaultValue;
-    };
-
     Record() = default;
-    Record(Record const &other)
-        : name(other.name), rare(other.rare ? std::make_unique<Rare>(*other.rare) : nullptr),
-          objectType(other.objectType), polarity(other.polarity) {}
+    /// All but the name.
+    explicit Record(Record const &model) : objectType(model.objectType), polarity(model.polarity) {}
 
-    Basis::StringBase<char> const &GetComment() const { return GetRare().comment; }
-    BitVectorValue const &GetDefaultValue() const { return GetRare().defaultValue; }
-    Rare &OwnRare() {
-        if (!rare)
-            rare = std::make_unique<Rare>();
-        return *rare;
-    }
+    Basis::StringBase<char> const &GetComment() const;
+    BitVectorValue const &GetDefaultValue() const;
     bool IsSamePin(Record const &other) const {
         return polarity == other.polarity && GetDefaultValue().IsEmpty() &&
                other.GetDefaultValue().IsEmpty();
     }
 
     Basis::StringBase<char> name;
-    std::unique_ptr<Rare> rare; ///< null while there is nothing rare
     std::atomic<unsigned int> owners{1};
-    short objectType = 0;               ///< an ObjectType
-    short polarity = Polarity::INVALID; ///< of a pin, a Polarity::Value
-
-private:
-    Rare const &GetRare() const {
-        static Rare const none;
-        return rare ? *rare : none;
-    }
+    short objectType = 0;                     ///< an ObjectType
+    signed char polarity = Polarity::INVALID; ///< of a pin, a Polarity::Value
+    bool isRare = false;                      ///< whether it is a RareRecord
 };
+
+/// A record with what few objects have.
+struct Object::RareRecord : Object::Record {
+    explicit RareRecord(Record const &model)
+        : Record(model), comment(model.GetComment()), defaultValue(model.GetDefaultValue()) {
+        isRare = true;
+    }
+
+    Basis::StringBase<char> comment;
+    BitVectorValue defaultValue;
+};
+
+inline Basis::StringBase<char> const &Object::Record::GetComment() const {
+    static Basis::StringBase<char> const none;
+    return isRare ? static_cast<RareRecord const *>(this)->comment : none;
+}
+
+inline BitVectorValue const &Object::Record::GetDefaultValue() const {
+    static BitVectorValue const none;
+    return isRare ? static_cast<RareRecord const *>(this)->defaultValue : none;
+}
 
 } // namespace Vesk_Hdl

@@ -133,14 +133,11 @@ void Pin::Disconnect() {
 
 Signal *Pin::GetSignal() const { return signal == Former() ? nullptr : signal; }
 void Pin::SetPolarity(Polarity const &polarity) {
-    Object::Own().polarity = static_cast<short>(polarity.GetValue());
+    Object::Own().polarity = static_cast<signed char>(polarity.GetValue());
 }
 Polarity Pin::GetPolarity() const { return static_cast<Polarity::Value>(Object::record->polarity); }
 StringBase<char> Pin::GetPolarityName() const { return GetPolarity().GetValueName(); }
-void Pin::SetDefaultValue(BitVectorValue const &value) {
-    BitVectorValue const held(value); // it may be this pin's own
-    Object::Own().OwnRare().defaultValue = held;
-}
+void Pin::SetDefaultValue(BitVectorValue const &value) { OwnRare().defaultValue = value; }
 void Pin::SetDefaultValue(char const *text) { SetDefaultValue(BitVectorValue(text)); }
 BitVectorValue Pin::GetDefaultValue() const { return Object::record->GetDefaultValue(); }
 

@@ -89,6 +89,11 @@ struct Signal::Record {
 };
 
 Signal::Signal() : record(std::make_unique<Record>()) { SetObjectType(OBJECT_SIGNAL); }
+Signal::Signal(char const *name) : record(std::make_unique<Record>()) {
+    SetNormalizedName(name);
+    SetObjectType(OBJECT_SIGNAL);
+}
+
 Signal::~Signal() = default;
 
 Object::ObjectType Signal::GetObjectType() const { return GetStoredObjectType(); }
@@ -184,7 +189,7 @@ struct ScalarSignal::Record {
     Polarity portPolarity;
 };
 
-ScalarSignal::ScalarSignal(char const *name) { SetNormalizedName(name); }
+ScalarSignal::ScalarSignal(char const *name) : Signal(name) {}
 ScalarSignal::~ScalarSignal() = default;
 
 Signal::SignalType ScalarSignal::GetSignalType() const { return SIGNAL_SCALAR; }
@@ -225,7 +230,7 @@ struct Bus::Record {
     std::shared_ptr<Bus *> cell; ///< null while the bus has no slices
 };
 
-Bus::Bus(char const *name) : record(std::make_unique<Record>()) { SetNormalizedName(name); }
+Bus::Bus(char const *name) : Signal(name), record(std::make_unique<Record>()) {}
 Bus::~Bus() {
     if (record->cell)
         *record->cell = nullptr;
@@ -339,8 +344,7 @@ struct BusSlice::Record {
 };
 
 BusSlice::BusSlice(char const *name, Bus *parent)
-    : record(new Record{parent ? parent->GetCell() : nullptr}) {
-    SetNormalizedName(name);
+    : Signal(name), record(new Record{parent ? parent->GetCell() : nullptr}) {
     if (parent)
         parent->AddBusSlice(this);
 }
@@ -391,8 +395,7 @@ struct BusIndex::Record {
 };
 
 BusIndex::BusIndex(char const *name, Bus *parent)
-    : record(new Record{parent ? parent->GetCell() : nullptr, Polarity()}) {
-    SetNormalizedName(name);
+    : Signal(name), record(new Record{parent ? parent->GetCell() : nullptr, Polarity()}) {
     if (parent)
         parent->AddBusSlice(this);
 }
@@ -474,9 +477,7 @@ struct CompoundBus::Record {
     PtrArray<Signal *> members;
 };
 
-CompoundBus::CompoundBus(char const *name) : record(std::make_unique<Record>()) {
-    SetNormalizedName(name);
-}
+CompoundBus::CompoundBus(char const *name) : Signal(name), record(std::make_unique<Record>()) {}
 
 CompoundBus::CompoundBus(char const *name, PtrArray<Signal *> const &members) : CompoundBus(name) {
     for (int i = 0; i < members.GetSize(); ++i)

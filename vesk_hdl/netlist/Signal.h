@@ -73,6 +73,7 @@ public:
 
 protected:
     Signal();
+    explicit Signal(char const *name);
 
 private:
     friend class Netlist;

@@ -10,7 +10,8 @@ void WriteBlanks(Basis::Stream &file, std::size_t count) {
     static constexpr std::string_view BLANKS = "                                                ";
     for (; count > BLANKS.size(); count -= BLANKS.size())
         file.Write(BLANKS);
-    file.Write(BLANKS.substr(0, count));
+    if (count > 0)
+        file.Write(BLANKS.substr(0, count));
 }
 
 } // namespace
@@ -67,15 +68,18 @@ void FoldingLine::DropWritten() {
     start = 0;
 }
 
-void FoldingLine::Write(Basis::Stream &file, std::string_view end) {
+void FoldingLine::End(Basis::Stream &file) {
     WriteBlanks(file, blanks);
-    file.Write(std::string_view(text.get() + start, size - start)).Write(end);
+    if (size == capacity)
+        Grow();
+    text[size++] = '\n';
+    file.Write(std::string_view(text.get() + start, size - start));
     blanks = size = start = pieceBegin = searched = withoutBlank = 0;
     comment = false;
 }
 
 void FoldingLine::Break(Basis::Stream &file, std::size_t indentation) {
-    Write(file, "\n");
+    End(file);
     blanks = indentation + FOLD_INDENT;
 }
 

@@ -27,12 +27,16 @@ public:
     char const *Append(char const *token) {
         pieceBegin = size;
         for (;;) {
-            char *to = text.get() + size;
-            char *const end = text.get() + capacity;
-            while (to != end && *token != '\0' && *token != '\n')
-                *to++ = *token++;
-            size = static_cast<std::size_t>(to - text.get());
-            if (to != end)
+            char *const to = text.get() + size;
+            std::size_t const room = capacity - size;
+            std::size_t count = 0;
+            while (count < room && !IsEnd(token[count])) {
+                to[count] = token[count];
+                ++count;
+            }
+            size += count;
+            token += count;
+            if (count < room)
                 return token;
             Grow();
         }
@@ -43,12 +47,15 @@ public:
         if (GetLength() > MAX_LENGTH && size > pieceBegin && !IsComment())
             Fold(file, indentation);
     }
-    /// Writes the line whole and `end` behind it, and leaves it empty.
-    void Write(Basis::Stream &file, std::string_view end);
+    /// Writes the line whole, with an end of line, and leaves it empty.
+    void End(Basis::Stream &file);
     /// Writes it with an end of line; the line then begins with `indentation` and six blanks.
     void Break(Basis::Stream &file, std::size_t indentation);
 
 private:
+    static bool IsEnd(char c) {
+        return static_cast<unsigned char>(c) <= '\n' && (c == '\n' || c == '\0');
+    }
     void Grow();
     bool IsComment();
     void Fold(Basis::Stream &file, std::size_t indentation);

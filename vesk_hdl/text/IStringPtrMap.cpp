@@ -16,7 +16,7 @@ constexpr std::uint32_t FIRST_BUCKETS = 7;
 } // namespace
 
 struct IStringPtrMapBase::Record {
-    StringTable table{StringTable::CASE_IGNORED, FIRST_BUCKETS};
+    StringTable table{StringTable::CASE_IGNORED, FIRST_BUCKETS, StringTable::ORDER_FREE};
 };
 
 IStringPtrMapBase::IStringPtrMapBase() : record(nullptr) {}

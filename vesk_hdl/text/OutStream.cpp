@@ -106,7 +106,7 @@ private:
 
     void EndLine() {
         IndentNewLine();
-        line.Write(*file, "\n");
+        line.End(*file);
     }
 
     Stream *file = nullptr;

@@ -1,7 +1,10 @@
 #include "vesk_hdl/text/StringTable.h"
 
 #include <algorithm>
+#include <functional>
 #include <iterator>
+#include <stdexcept>
+#include <string>
 
 #include "vesk_hdl/text/basis/Ascii.h"
 
@@ -24,8 +27,8 @@ std::uint32_t BucketCountFor(std::size_t wanted) {
 
 } // namespace
 
-StringTable::StringTable(CaseRule rule, std::uint32_t wanted)
-    : caseRule(rule), bucketCount(BucketCountFor(wanted)) {}
+StringTable::StringTable(CaseRule rule, std::uint32_t wanted, OrderRule order)
+    : caseRule(rule), orderRule(order), bucketCount(BucketCountFor(wanted)) {}
 
 std::uint32_t StringTable::HashIgnoringCase(std::string_view key) {
     std::uint32_t hash = FIRST_HASH;
@@ -43,96 +46,137 @@ std::uint32_t StringTable::Hash(std::string_view key) const {
     return hash;
 }
 
+/// One that cannot be made to collide together with the first.
+std::uint32_t StringTable::OtherHash(std::string_view key) const {
+    std::string folded(key);
+    if (caseRule == CASE_IGNORED)
+        for (char &c : folded)
+            c = Basis::Ascii::ToUpper(c);
+    return static_cast<std::uint32_t>(std::hash<std::string>()(folded));
+}
+
+void StringTable::Rehash() {
+    isRehashed = true;
+    std::uint32_t all = NONE; // the nodes of all buckets in one chain
+    for (std::uint32_t &bucket : buckets)
+        while (bucket != NONE) {
+            std::uint32_t const number = bucket;
+            bucket = At(number).next;
+            At(number).next = all;
+            all = number;
+        }
+    while (all != NONE) {
+        Node &node = At(all);
+        std::uint32_t const next = node.next;
+        node.hash = OtherHash(node.key.View());
+        std::uint32_t &bucket = buckets[BucketOf(node.hash)];
+        node.next = bucket;
+        bucket = all;
+        all = next;
+    }
+}
+
 bool StringTable::Equal(std::string_view a, std::string_view b) const {
     return a == b || (caseRule == CASE_IGNORED && Basis::Ascii::EqualIgnoringCase(a, b));
 }
 
 void StringTable::GrowForOneMore() {
     if (buckets.empty())
-        buckets.assign(bucketCount, nullptr);
+        buckets.assign(bucketCount, NONE);
     if (count + 1 > bucketCount)
         Rebuild(BucketCountFor(count + 1));
+    if (isCrowded && !isRehashed && orderRule == ORDER_FREE)
+        Rehash();
 }
 
 /// Takes the nodes in the order of a walk, each to the front of its new bucket.
 void StringTable::Rebuild(std::uint32_t newCount) {
-    std::vector<Node *> old(newCount, nullptr);
+    std::vector<std::uint32_t> old(newCount, NONE);
     old.swap(buckets);
     bucketCount = newCount;
-    for (Node *node : old)
-        while (node) {
-            Node *const next = node->next;
-            Node *&bucket = buckets[BucketOf(node->hash)];
-            node->next = bucket;
-            bucket = node;
-            node = next;
+    for (std::uint32_t number : old)
+        while (number != NONE) {
+            Node &node = At(number);
+            std::uint32_t const next = node.next;
+            std::uint32_t &bucket = buckets[BucketOf(node.hash)];
+            node.next = bucket;
+            bucket = number;
+            number = next;
         }
 }
 
-StringTable::Node *StringTable::NewNode() {
-    if (!unused) {
-        constexpr std::size_t LARGEST_BLOCK = 1024;
-        std::size_t const size = std::min(std::max<std::size_t>(count, 1), LARGEST_BLOCK);
-        blocks.push_back(std::make_unique<Node[]>(size));
-        for (std::size_t i = 0; i < size; ++i) {
-            blocks.back()[i].next = unused;
-            unused = &blocks.back()[i];
-        }
+/// The number of a node without a text.
+std::uint32_t StringTable::NewNode() {
+    if (unused != NONE) {
+        std::uint32_t const number = unused;
+        unused = At(number).next;
+        return number;
     }
-    Node *const node = unused;
-    unused = node->next;
-    return node;
+    if (made == NONE)
+        throw std::length_error("Vesk_Hdl::StringTable: too many texts");
+    if (made % LARGEST_BLOCK == 0 || (made < LARGEST_BLOCK && std::has_single_bit(made)))
+        blocks.push_back(
+            std::make_unique<Node[]>(std::min(std::max<std::uint32_t>(made, 1), LARGEST_BLOCK)));
+    return made++;
 }
 
 StringTable::Node *StringTable::Insert(Basis::StringBase<char> const &key, std::uint32_t hash,
                                        void *value) {
-    Node *const node = NewNode();
-    node->key = key;
-    node->value = value;
-    node->hash = hash;
-    Node *&first = buckets[BucketOf(node->hash)];
+    if (isRehashed)
+        hash = OtherHash(key.View());
+    std::uint32_t const number = NewNode();
+    Node &node = At(number);
+    node.key = key;
+    node.value = value;
+    node.hash = hash;
+    std::uint32_t &first = buckets[BucketOf(hash)];
     // The oldest text of a bucket stays in front; a new one goes directly behind it.
-    Node *&place = first ? first->next : first;
-    node->next = place;
-    place = node;
+    std::uint32_t &place = first == NONE ? first : At(first).next;
+    node.next = place;
+    place = number;
     ++count;
-    return node;
+    return &node;
 }
 
 void StringTable::Remove(std::string_view key) {
     Node *const node = Find(key);
     if (!node)
         return;
-    Node **link = &buckets[BucketOf(node->hash)];
-    while (*link != node)
-        link = &(*link)->next;
+    std::uint32_t *link = &buckets[BucketOf(node->hash)];
+    while (&At(*link) != node)
+        link = &At(*link).next;
+    std::uint32_t const number = *link;
     *link = node->next;
-    node->key.Empty();
-    node->next = unused;
-    unused = node;
+    Drop(number);
     --count;
 }
 
 void StringTable::Empty() {
-    for (Node *&bucket : buckets)
-        while (Node *const node = bucket) {
-            bucket = node->next;
-            node->key.Empty();
-            node->next = unused;
-            unused = node;
+    for (std::uint32_t &bucket : buckets)
+        while (bucket != NONE) {
+            std::uint32_t const number = bucket;
+            bucket = At(number).next;
+            Drop(number);
         }
     count = 0;
 }
 
+void StringTable::Drop(std::uint32_t number) {
+    Node &node = At(number);
+    node.key.Empty();
+    node.next = unused;
+    unused = number;
+}
+
 StringTable::Node *StringTable::FirstFrom(std::uint32_t bucket) const {
     for (; bucket < buckets.size(); ++bucket)
-        if (buckets[bucket])
-            return buckets[bucket];
+        if (buckets[bucket] != NONE)
+            return &At(buckets[bucket]);
     return nullptr;
 }
 
 StringTable::Node *StringTable::GetNext(Node const *node) const {
-    return node->next ? node->next : FirstFrom(BucketOf(node->hash) + 1);
+    return node->next != NONE ? &At(node->next) : FirstFrom(BucketOf(node->hash) + 1);
 }
 
 } // namespace Vesk_Hdl

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <bit>
 #include <cstddef>
 #include <cstdint>
 #include <memory>
@@ -19,16 +20,21 @@ namespace Vesk_Hdl {
 class StringTable {
 public:
     enum CaseRule { CASE_EXACT, CASE_IGNORED };
+    /// A table that nobody walks takes another hash once names that were made to collide fill a
+    /// bucket: looking one up stays as fast as any other.
+    enum OrderRule { ORDER_FIXED, ORDER_FREE };
+
+    static constexpr std::uint32_t NONE = 0xFFFFFFFF; ///< the number of no node
 
     struct Node {
         Basis::StringBase<char> key;
         void *value = nullptr;
-        Node *next = nullptr;
+        std::uint32_t next = NONE; ///< in its bucket, by number
         std::uint32_t hash = 0;
     };
 
     /// The table begins with the first bucket count of the series at or above `buckets`.
-    StringTable(CaseRule caseRule, std::uint32_t buckets);
+    StringTable(CaseRule caseRule, std::uint32_t buckets, OrderRule orderRule = ORDER_FIXED);
 
     std::size_t GetCount() const { return count; }
     Node *Find(std::string_view key) const { return Find(key, Hash(key)); }
@@ -36,10 +42,18 @@ public:
     Node *Find(std::string_view key, std::uint32_t hash) const {
         if (buckets.empty())
             return nullptr;
-        Node *node = buckets[BucketOf(hash)];
-        while (node && (node->hash != hash || !Equal(node->key.View(), key)))
-            node = node->next;
-        return node;
+        if (isRehashed)
+            hash = OtherHash(key);
+        int length = 0;
+        for (std::uint32_t at = buckets[BucketOf(hash)]; at != NONE; ++length) {
+            Node &node = At(at);
+            if (node.hash == hash && Equal(node.key.View(), key))
+                return &node;
+            at = node.next;
+        }
+        if (length > LONGEST_BUCKET)
+            isCrowded = true;
+        return nullptr;
     }
     /// The hash of tables that ignore case.
     static std::uint32_t HashIgnoringCase(std::string_view key);
@@ -64,19 +78,36 @@ public:
     Node *GetNext(Node const *node) const;
 
 private:
+    static constexpr std::uint32_t LARGEST_BLOCK = 1024;
+    static constexpr int LONGEST_BUCKET = 50; ///< chance makes none of that length
+
+    /// A node by its number. Numbers take half the room of pointers, and a design has two nodes for
+    /// each instance. Blocks have 1, 1, 2, 4 and on to 512 nodes, then LARGEST_BLOCK.
+    Node &At(std::uint32_t number) const {
+        return number < LARGEST_BLOCK
+                   ? blocks[std::bit_width(number)][number - std::bit_floor(number)]
+                   : blocks[10 + number / LARGEST_BLOCK][number % LARGEST_BLOCK];
+    }
     std::uint32_t Hash(std::string_view key) const;
+    std::uint32_t OtherHash(std::string_view key) const;
+    void Rehash();
     bool Equal(std::string_view a, std::string_view b) const;
     std::uint32_t BucketOf(std::uint32_t hash) const { return hash % bucketCount; }
     Node *FirstFrom(std::uint32_t bucket) const;
     void Rebuild(std::uint32_t newCount);
-    Node *NewNode();
+    std::uint32_t NewNode();
+    void Drop(std::uint32_t number);
 
     CaseRule caseRule;
+    OrderRule orderRule;
+    bool isRehashed = false;
+    mutable bool isCrowded = false; ///< a bucket is longer than chance would make it
     std::uint32_t bucketCount;
     std::size_t count = 0;
-    std::vector<Node *> buckets;                 ///< empty until the first text comes
+    std::vector<std::uint32_t> buckets;          ///< numbers of nodes; empty until the first text
     std::vector<std::unique_ptr<Node[]>> blocks; ///< nodes are made by the block
-    Node *unused = nullptr;                      ///< nodes that hold no text
+    std::uint32_t made = 0;                      ///< nodes that held a text at some time
+    std::uint32_t unused = NONE;                 ///< those of them that hold none now
 };
 
 } // namespace Vesk_Hdl

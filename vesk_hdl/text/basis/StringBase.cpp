@@ -26,13 +26,24 @@ constexpr std::size_t LONGEST = 0xFFFFFFEFU;
 
 constinit StringBase<char>::EmptyRep StringBase<char>::empty = {{{1}, 0, 0}, {}};
 
-StringBase<char>::Rep *StringBase<char>::NewRep(std::size_t capacity) {
+StringBase<char>::Rep *StringBase<char>::NewRep(std::size_t capacity, std::size_t extra) {
     if (capacity > LONGEST)
         throw std::length_error("Basis::StringBase: text too long");
-    void *const memory = std::malloc(sizeof(Rep) + capacity + 1);
+    void *const memory = std::malloc(sizeof(Rep) + capacity + 1 + extra);
     if (!memory)
         throw std::bad_alloc();
     return new (memory) Rep{{1}, 0, static_cast<unsigned int>(capacity)};
+}
+
+StringBase<char> StringBase<char>::MakeWithRoom(std::string_view text, std::size_t extra,
+                                                void *&room) {
+    std::size_t const bytes = sizeof(Rep) + text.size() + 1;
+    std::size_t const padding = (alignof(void *) - bytes % alignof(void *)) % alignof(void *);
+    StringBase made;
+    made.rep = NewRep(text.size(), padding + extra);
+    text.copy(made.Writable(text.size()), text.size());
+    room = reinterpret_cast<char *>(made.rep) + bytes + padding;
+    return made;
 }
 
 void StringBase<char>::Release(Rep *rep) noexcept {

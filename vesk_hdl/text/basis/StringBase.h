@@ -8,8 +8,9 @@
 class Basis_Regexp;
 
 namespace Vesk_Hdl {
+class Object;
 class StringArray;
-}
+} // namespace Vesk_Hdl
 
 /// A pair of character indices, both inclusive. `first` greater than `last` is an empty range;
 /// (1, 0) is where every walk with NextTokenRange starts.
@@ -127,11 +128,16 @@ private:
         char terminator[4];
     };
 
+    friend class Vesk_Hdl::Object;
     friend class Vesk_Hdl::StringArray;
+
+    /// A text that has `extra` bytes behind it in its block, aligned as a pointer is: they last as
+    /// long as any copy of the text does.
+    static StringBase MakeWithRoom(std::string_view text, std::size_t extra, void *&room);
 
     /// Replaces the text, in its memory if that serves, by one that is no piece of it.
     void Assign(std::string_view text);
-    static Rep *NewRep(std::size_t capacity);
+    static Rep *NewRep(std::size_t capacity, std::size_t extra = 0);
     static void Release(Rep *rep) noexcept;
     char *Writable(std::size_t length);
 

@@ -86,8 +86,9 @@ private:
     }
 
     static bool IsMadeByWrite(Signal const *signal) {
-        Basis::StringBase<char> const base = Object::GetBaseName(signal->GetName());
-        return Basis::strimatch(base, "*_openSignal") || Basis::strimatch(base, "*_DUMMY");
+        std::string const name(signal->GetName());
+        return Basis::strimatch(name.c_str(), "*_openSignal*") ||
+               Basis::strimatch(name.c_str(), "*_DUMMY*");
     }
 
     void WalkPin(Pin *pin) {
@@ -99,7 +100,7 @@ private:
         bool listed = signal->HasConstantValue() || IsMadeByWrite(signal);
         ForEach(signal->GetPinIterator(), [&](Pin *other) { listed |= other == pin; });
         if (!listed)
-            Fail(*pin, "its signal does not list it");
+            Fail(*pin, ("is not listed by its signal " + std::string(signal->GetName())).c_str());
     }
 
     Netlist const &netlist;

@@ -6,6 +6,7 @@
 
 #include <CLI/CLI.hpp>
 
+#include "tool/commands/CheckCommand.h"
 #include "tool/commands/RunCommand.h"
 #include "vesk_hdl/Vesk_Hdl.h"
 
@@ -34,11 +35,16 @@ int ParseAndRun(int argc, char **argv) {
     run->add_flag("--keep-going", options.keepGoing,
                   "Go on after a refused line; the exit code still tells of it");
 
+    CheckOptions checkOptions;
+    CLI::App *const check = AddCheckCommand(app, checkOptions);
+
     try {
         app.parse(argc, argv);
     } catch (CLI::ParseError const &error) {
         return app.exit(error) == 0 ? 0 : USAGE_ERROR;
     }
+    if (check->parsed())
+        return Check(checkOptions);
     return Run(options);
 }
 

@@ -8,6 +8,7 @@
 
 #include <CLI/CLI.hpp>
 
+#include "tool/commands/CheckCommand.h"
 #include "tool/commands/CommandsCommand.h"
 #include "tool/commands/HeaderCommand.h"
 #include "tool/commands/RunCommand.h"
@@ -26,6 +27,7 @@ int ParseAndRun(int argc, char **argv) {
                "output\ncould not be written; 2 the command line is wrong.");
     Action action;
     AddRunCommand(app, action);
+    AddCheckCommand(app, action);
     AddShellCommand(app, action);
     AddCommandsCommand(app, action);
     AddHeaderCommand(app, action);

@@ -1,0 +1,172 @@
+// Assignments between nets, compounds on pins, and what the dummy signals make of them. Before a
+// write each out port that is read inside, each in port that is driven inside and each out port
+// with several drivers gives its pins to a dummy signal.
+
+#include "tool/check/Design.h"
+
+using namespace Vesk_Hdl;
+
+namespace Checks {
+
+namespace {
+
+bool IsPart(Signal const &signal) {
+    return signal.GetSignalType() == Signal::SIGNAL_BUS_SLICE ||
+           signal.GetSignalType() == Signal::SIGNAL_BUS_INDEX;
+}
+
+/// The net that is declared: a part's bus, or the net itself.
+Signal const *DeclaredOf(Design const &design, Signal const &signal) {
+    return IsPart(signal) ? design.BusOf(signal) : &signal;
+}
+
+class AssignmentChecker {
+public:
+    AssignmentChecker(Design const &checked, Signal const &assigned, Signal const &from)
+        : design(checked), target(assigned), source(from), spot(checked.AssignedAt(assigned)) {}
+
+    void Run() {
+        bool compound = false;
+        for (Signal const *const side : {&target, &source}) {
+            if (side->GetSignalType() == Signal::SIGNAL_COMPOUND_BUS) {
+                Add(Id::COMPOUND_ASSIGNMENT, *side);
+                compound = true;
+            } else if (side->GetSignalType() == Signal::SIGNAL_BUS_INDEX) {
+                Add(Id::BIT_ASSIGNMENT, *side);
+            }
+        }
+        if (compound)
+            return;
+        Signal const *const declared = DeclaredOf(design, target);
+        Design::Dummy const *const dummy = design.DummyOf(declared);
+        // What was assigned to an in port that is driven as well goes to its dummy.
+        bool const moves = dummy && !dummy->portTakesDummy;
+        if (target.GetPortPolarity() == Polarity::INPUT && !moves)
+            Add(Id::ASSIGNED_IN_PORT, target);
+        if (source.GetPortPolarity() == Polarity::OUTPUT)
+            Add(Id::READ_OUT_PORT, source);
+        CheckWidth();
+    }
+
+private:
+    void Add(Id id, Signal const &side, Languages languages = BOTH, std::string detail = {}) {
+        design.findings.Add({id, spot, NetName(side), {}, languages, std::move(detail)});
+    }
+
+    /// VHDL also tells one bit from a vector of one bit.
+    void CheckWidth() {
+        auto const isVector = [](Signal const &side) {
+            return side.GetSignalType() == Signal::SIGNAL_BUS ||
+                   side.GetSignalType() == Signal::SIGNAL_BUS_SLICE;
+        };
+        int const width = target.GetWidth();
+        int const other = source.GetWidth();
+        if (width == 0 || other == 0)
+            return;
+        if (width != other)
+            Add(Id::ASSIGNMENT_WIDTH, target, BOTH,
+                std::to_string(width) + " from " + std::to_string(other) + " of " +
+                    Quote(source.GetNameRef().View()));
+        else if (isVector(target) != isVector(source))
+            Add(Id::ASSIGNMENT_WIDTH, target, VHDL,
+                "one bit and a vector of one bit, " + Quote(source.GetNameRef().View()));
+    }
+
+    Design const &design;
+    Signal const &target;
+    Signal const &source;
+    Spot spot;
+};
+
+/// A compound on pins.
+class CompoundChecker {
+public:
+    CompoundChecker(Design const &checked, CompoundBus const &checkedCompound)
+        : design(checked), compound(checkedCompound), dummy(checked.DummyOf(&checkedCompound)) {
+        Design::ForEachPinOn(compound, [this](Pin const *pin) {
+            drives |= pin->GetPolarity() != Polarity::INPUT;
+            reads |= pin->GetPolarity() != Polarity::OUTPUT;
+        });
+    }
+
+    void Run() {
+        for (int i = 0; i < compound.GetSize(); ++i)
+            if (compound.GetAt(i))
+                CheckMember(*compound.GetAt(i));
+    }
+
+private:
+    void CheckMember(Signal const &member) {
+        Polarity const polarity = member.GetPortPolarity();
+        Signal const *const declared = DeclaredOf(design, member);
+        Design::Dummy const *const own = design.DummyOf(declared);
+        if (dummy) {
+            // The members are treated like the first one.
+            if (polarity == (dummy->portTakesDummy ? Polarity::INPUT : Polarity::OUTPUT))
+                Add(Id::IN_PORT_IN_COMPOUND, member, BOTH);
+            return;
+        }
+        // Scalars are replaced in all compounds, parts and buses in none.
+        bool const replaced = own && member.GetSignalType() == Signal::SIGNAL_SCALAR;
+        if (replaced)
+            return;
+        if (polarity == Polarity::INPUT && drives)
+            Add(Id::IN_PORT_IN_COMPOUND, member, BOTH);
+        if (polarity == Polarity::OUTPUT && reads)
+            Add(Id::OUT_PORT_IN_COMPOUND, member, VHDL);
+        if (polarity == Polarity::OUTPUT && drives && own)
+            Add(Id::BYPASSED_DUMMY, member, BOTH);
+    }
+
+    void Add(Id id, Signal const &member, Languages languages) {
+        design.findings.Add(
+            {id,
+             design.NetAt(compound),
+             "compound " + Quote(compound.GetNameRef().View()),
+             {{&member, "the member " + Quote(member.GetNameRef().View()) + " is here"}},
+             languages,
+             Quote(member.GetNameRef().View())});
+    }
+
+    Design const &design;
+    CompoundBus const &compound;
+    Design::Dummy const *dummy;
+    bool drives = false;
+    bool reads = false;
+};
+
+/// Pins that a net lists and that are on another one now: they go to the net's dummy.
+void CheckReturns(Design const &design, Signal const &signal) {
+    ForEach(signal.GetPinIterator(), [&](Pin const *pin) {
+        Signal const *const now = pin->GetSignal();
+        if (now == &signal)
+            return;
+        Instance const *const owner = design.OwnerOf(pin);
+        design.findings.Add(
+            {Id::PIN_RETURNS,
+             design.places.Find(Places::CONNECTED, pin),
+             owner ? PinName(*owner, *pin) : "pin " + Quote(pin->GetNameRef().View()),
+             {{&signal, "its first net is here"}},
+             BOTH,
+             "to the dummy signal of " + Quote(signal.GetNameRef().View())});
+    });
+}
+
+} // namespace
+
+void CheckConnections(Design const &design) {
+    design.ForEachSignal([&](Signal const *signal) {
+        ForEach(signal->GetSignalIterator(),
+                [&](Signal const *source) { AssignmentChecker(design, *signal, *source).Run(); });
+        if (auto const *const compound = dynamic_cast<CompoundBus const *>(signal))
+            CompoundChecker(design, *compound).Run();
+    });
+    for (auto const &[signal, dummy] : design.dummies) {
+        CheckReturns(design, *signal);
+        if (auto const *const bus = dynamic_cast<Bus const *>(signal))
+            ForEach(bus->GetBusSliceIterator(),
+                    [&](Signal const *part) { CheckReturns(design, *part); });
+    }
+}
+
+} // namespace Checks

@@ -1,0 +1,142 @@
+#include "tool/check/Design.h"
+
+using namespace Vesk_Hdl;
+
+namespace Checks {
+
+namespace {
+
+constexpr std::string_view CONSTANT_TAG = "_CONST_SIGNAL";
+
+bool IsTieOfPin(std::string_view base) {
+    return base.size() >= CONSTANT_TAG.size() &&
+           base.substr(base.size() - CONSTANT_TAG.size()) == CONSTANT_TAG;
+}
+
+} // namespace
+
+Design::Design(Model &model, Places const &madePlaces, Recorder const &history,
+               Findings &foundThings)
+    : netlist(*model.GetNetlist()), options(*model.GetOptions()), places(madePlaces),
+      recorder(history), findings(foundThings) {
+    ForEachInstance([this](Instance const *instance) {
+        if (instance->GetComponent())
+            firstInstances.try_emplace(instance->GetComponent(), instance);
+    });
+    FindDummies();
+    FindUses();
+}
+
+Spot Design::ConnectedAt(Instance const &instance, Pin const &pin) const {
+    Spot const spot = places.Find(Places::CONNECTED, &pin);
+    return spot.line > 0 ? spot : MadeAt(&instance);
+}
+
+Spot Design::NetAt(Signal const &signal) const {
+    Spot const spot = MadeAt(&signal);
+    if (spot.line > 0)
+        return spot;
+    Bus const *const bus = BusOf(signal);
+    return bus ? MadeAt(bus) : spot;
+}
+
+Spot Design::ConstantAt(Signal const &signal) const {
+    Spot const spot = places.Find(Places::CONSTANT, &signal);
+    return spot.line > 0 ? spot : NetAt(signal);
+}
+
+Spot Design::AssignedAt(Signal const &signal) const {
+    Spot const spot = places.Find(Places::ASSIGNED, &signal);
+    return spot.line > 0 ? spot : NetAt(signal);
+}
+
+Bus *Design::BusOf(Signal const &part) const { return netlist.GetParentBus(part.GetNameRef()); }
+
+/// A walk over all pins at the first question, which only findings ask.
+Instance const *Design::OwnerOf(Pin const *pin) const {
+    if (owners.empty())
+        ForEachPin([this](Instance const &instance, Pin const &own) { owners[&own] = &instance; });
+    auto const found = owners.find(pin);
+    return found == owners.end() ? nullptr : found->second;
+}
+
+Design::Dummy const *Design::DummyOf(Signal const *signal) const {
+    auto const found = dummies.find(signal);
+    return found == dummies.end() ? nullptr : &found->second;
+}
+
+std::vector<Use> const &Design::FurtherUses(Signal const *signal) const {
+    static std::vector<Use> const none;
+    auto const found = furtherUses.find(signal);
+    return found == furtherUses.end() ? none : found->second;
+}
+
+Use Design::UseOf(Pin const *pin) {
+    Polarity const polarity = pin->GetPolarity();
+    return {polarity == Polarity::OUTPUT  ? Use::DRIVES
+            : polarity == Polarity::INPUT ? Use::READS
+                                          : Use::EITHER,
+            pin, nullptr};
+}
+
+void Design::FindUses() {
+    auto const addTo = [this](Signal const *signal, Use const &use) {
+        auto const *const compound = dynamic_cast<CompoundBus const *>(signal);
+        if (!compound)
+            furtherUses[signal].push_back(use);
+        for (int i = 0; compound && i < compound->GetSize(); ++i)
+            furtherUses[compound->GetAt(i)].push_back(use);
+    };
+    ForEachSignal([&](Signal const *signal) {
+        if (signal->GetSignalType() == Signal::SIGNAL_COMPOUND_BUS)
+            ForEachPinOn(*signal, [&](Pin const *pin) { addTo(signal, UseOf(pin)); });
+        ForEach(signal->GetSignalIterator(), [&](Signal const *source) {
+            addTo(source, {Use::READS, nullptr, nullptr});
+            addTo(signal, {Use::DRIVES, nullptr, source});
+        });
+    });
+    // A pin that is tied to a constant is not in the list of its signal.
+    ForEachPin([&](Instance const &, Pin const &pin) {
+        Signal const *const signal = pin.GetSignal();
+        if (signal && signal->HasConstantValue() && IsTieOfPin(BaseOf(*signal)))
+            addTo(signal, UseOf(&pin));
+    });
+}
+
+/// The three stages of the rewriting: out ports that are read, in ports that are driven, out ports
+/// with several drivers. A name that one stage took is out of the later ones.
+void Design::FindDummies() {
+    auto const stage = [this](Polarity::Value port, Polarity::Value use) {
+        ForEachPin([&](Instance const &, Pin const &pin) {
+            Polarity const polarity = pin.GetPolarity();
+            if (pin.GetSignal() && (polarity == use || polarity == Polarity::BIDIRECTIONAL) &&
+                pin.GetSignal()->GetPortPolarity() == port)
+                DemandDummy(pin.GetSignal(), port == Polarity::OUTPUT);
+        });
+    };
+    stage(Polarity::OUTPUT, Polarity::INPUT);
+    stage(Polarity::INPUT, Polarity::OUTPUT);
+    ForEachSignal([this](Signal const *signal) {
+        if (signal->GetPortPolarity() == Polarity::OUTPUT && signal->HasMultiDriver())
+            DemandDummy(signal, true);
+    });
+}
+
+void Design::DemandDummy(Signal const *signal, bool portTakesDummy) {
+    Dummy const dummy = {portTakesDummy, signal};
+    NeedDummy(signal, dummy);
+    if (auto const *const compound = dynamic_cast<CompoundBus const *>(signal))
+        for (int i = 0; i < compound->GetSize(); ++i)
+            NeedDummy(compound->GetAt(i), dummy);
+}
+
+/// Scalars and compounds by themselves, bits and slices with their bus.
+void Design::NeedDummy(Signal const *signal, Dummy const &dummy) {
+    Signal::SignalType const type = signal->GetSignalType();
+    if (type == Signal::SIGNAL_BUS_SLICE || type == Signal::SIGNAL_BUS_INDEX)
+        signal = BusOf(*signal);
+    if (signal)
+        dummies.try_emplace(signal, dummy);
+}
+
+} // namespace Checks

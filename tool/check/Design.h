@@ -1,0 +1,113 @@
+#pragma once
+
+#include <unordered_map>
+#include <unordered_set>
+#include <vector>
+
+#include "tool/check/Findings.h"
+#include "tool/check/Recorder.h"
+#include "tool/check/Text.h"
+#include "vesk_hdl/Vesk_Hdl.h"
+
+namespace Checks {
+
+/// What a pin or an assignment does to a net.
+struct Use {
+    enum Kind { DRIVES, READS, EITHER };
+
+    Kind kind;
+    Vesk_Hdl::Pin const *pin;       ///< null for an assignment, a constant or a port
+    Vesk_Hdl::Signal const *source; ///< of an assignment, else null
+};
+
+/// The netlist as it stands, and what the writers would make of it; nothing is changed. Made anew
+/// for each write that is checked, in one walk over the design.
+class Design {
+public:
+    /// A port that the rewriting before a write gives a dummy signal, or a member of the same
+    /// compound, which shares its lot.
+    struct Dummy {
+        bool portTakesDummy;            ///< the port is assigned from the dummy; else the reverse
+        Vesk_Hdl::Signal const *demand; ///< on whose pins that was found
+    };
+
+    Design(Vesk_Hdl::Model &model, Places const &madePlaces, Recorder const &history,
+           Findings &foundThings);
+
+    Spot MadeAt(void const *object) const { return places.Find(Places::MADE, object); }
+    /// Where a pin got its net, or where its instance was made.
+    Spot ConnectedAt(Vesk_Hdl::Instance const &instance, Vesk_Hdl::Pin const &pin) const;
+    /// Where a net was made; of a part that is outside the netlist, where its bus was.
+    Spot NetAt(Vesk_Hdl::Signal const &signal) const;
+    Spot ConstantAt(Vesk_Hdl::Signal const &signal) const;
+    Spot AssignedAt(Vesk_Hdl::Signal const &signal) const;
+
+    bool IsUsed(Vesk_Hdl::Component const *component) const {
+        return firstInstances.count(component) > 0;
+    }
+    /// Whether the netlist knows the signal, so that its constant and assignments are written.
+    bool IsInside(Vesk_Hdl::Signal const &signal) const {
+        return netlist.GetSignal(signal.GetNameRef()) == &signal;
+    }
+    /// The bus of a bit or slice, null if there is none.
+    Vesk_Hdl::Bus *BusOf(Vesk_Hdl::Signal const &part) const;
+    Vesk_Hdl::Instance const *OwnerOf(Vesk_Hdl::Pin const *pin) const;
+    Dummy const *DummyOf(Vesk_Hdl::Signal const *signal) const;
+    /// The uses of a signal that are not in its list of pins: through compounds, assignments and
+    /// ties to constants.
+    std::vector<Use> const &FurtherUses(Vesk_Hdl::Signal const *signal) const;
+    static Use UseOf(Vesk_Hdl::Pin const *pin);
+
+    template <class Act> void ForEachSignal(Act act) const {
+        Vesk_Hdl::ForEach(netlist.GetSignalIterator(), act);
+    }
+    template <class Act> void ForEachInstance(Act act) const {
+        Vesk_Hdl::ForEach(netlist.GetInstanceIterator(), act);
+    }
+    template <class Act> void ForEachUsedComponent(Act act) const {
+        Vesk_Hdl::ForEach(netlist.GetComponentIterator(), [&](Vesk_Hdl::Component *component) {
+            if (IsUsed(component))
+                act(component);
+        });
+    }
+    /// Each pin of each instance, with its instance.
+    template <class Act> void ForEachPin(Act act) const {
+        ForEachInstance([&act](Vesk_Hdl::Instance const *instance) {
+            Vesk_Hdl::ForEach(instance->GetPinIterator(),
+                              [&](Vesk_Hdl::Pin *pin) { act(*instance, *pin); });
+        });
+    }
+    /// Each pin that is on the signal and not merely listed there.
+    template <class Act> static void ForEachPinOn(Vesk_Hdl::Signal const &signal, Act act) {
+        Vesk_Hdl::ForEach(signal.GetPinIterator(), [&](Vesk_Hdl::Pin *pin) {
+            if (pin->GetSignal() == &signal)
+                act(pin);
+        });
+    }
+
+    Vesk_Hdl::Netlist const &netlist;
+    Vesk_Hdl::HdlOptions const &options;
+    Places const &places;
+    Recorder const &recorder;
+    Findings &findings;
+    std::unordered_map<Vesk_Hdl::Component const *, Vesk_Hdl::Instance const *> firstInstances;
+    std::unordered_map<Vesk_Hdl::Signal const *, Dummy> dummies;
+
+private:
+    void FindUses();
+    void FindDummies();
+    void DemandDummy(Vesk_Hdl::Signal const *signal, bool portTakesDummy);
+    void NeedDummy(Vesk_Hdl::Signal const *signal, Dummy const &dummy);
+
+    std::unordered_map<Vesk_Hdl::Signal const *, std::vector<Use>> furtherUses;
+    mutable std::unordered_map<Vesk_Hdl::Pin const *, Vesk_Hdl::Instance const *> owners;
+};
+
+// The groups of checks, in the order of the table.
+void CheckNames(Design const &design);
+void CheckNets(Design const &design);
+void CheckPins(Design const &design);
+void CheckConnections(Design const &design);
+void CheckValues(Design const &design);
+
+} // namespace Checks

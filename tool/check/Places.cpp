@@ -1,0 +1,70 @@
+#include "tool/check/Places.h"
+
+#include <algorithm>
+
+#include "tool/session/LineReader.h"
+
+namespace Checks {
+
+void Places::BeginFile(std::string const &path, std::string const &shownName) {
+    files.push_back({path, shownName, lineCount});
+}
+
+Spot Places::Find(Event event, void const *object, std::uint32_t before) const {
+    auto const isLess = [](Entry const &left, Entry const &right) {
+        return left.key != right.key ? left.key < right.key : left.spot.line < right.spot.line;
+    };
+    if (sortedCount < entries.size()) {
+        auto const middle = entries.begin() + static_cast<std::ptrdiff_t>(sortedCount);
+        std::stable_sort(middle, entries.end(), isLess);
+        std::inplace_merge(entries.begin(), middle, entries.end(), isLess);
+        sortedCount = entries.size();
+    }
+    std::uintptr_t const key = KeyOf(event, object);
+    auto const behind =
+        std::lower_bound(entries.begin(), entries.end(), Entry{key, {before, 0, 0}}, isLess);
+    if (behind == entries.begin() || std::prev(behind)->key != key)
+        return {};
+    return std::prev(behind)->spot;
+}
+
+Places::File const &Places::FileOf(std::uint32_t line) const {
+    auto file = files.end() - 1;
+    while (file != files.begin() && file->linesBefore >= line)
+        --file;
+    return *file;
+}
+
+Place Places::GetPlace(Spot spot) const {
+    Place place;
+    if (files.empty())
+        return place;
+    File const &file = spot.line == 0 ? files.front() : FileOf(spot.line);
+    place.file = file.shownName;
+    place.line = spot.line == 0 ? 0 : spot.line - file.linesBefore;
+    place.column = spot.column;
+    place.length = spot.length;
+    return place;
+}
+
+void Places::AddSources(std::vector<Diagnostic> &diagnostics,
+                        std::vector<Spot> const &spots) const {
+    std::size_t next = 0;
+    for (std::size_t i = 0; i < files.size() && next < spots.size(); ++i) {
+        std::uint32_t const last = i + 1 < files.size() ? files[i + 1].linesBefore : lineCount;
+        std::uint32_t line = files[i].linesBefore;
+        while (next < spots.size() && spots[next].line <= line)
+            ++next;
+        if (files[i].path == "-" || next == spots.size() || spots[next].line > last)
+            continue;
+        LineReader reader(files[i].path);
+        std::string text;
+        while (next < spots.size() && spots[next].line <= last && reader.Next(text)) {
+            ++line;
+            for (; next < spots.size() && spots[next].line == line; ++next)
+                diagnostics[next].source = text;
+        }
+    }
+}
+
+} // namespace Checks

@@ -1,0 +1,66 @@
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "tool/diagnostics/Diagnostic.h"
+
+namespace Checks {
+
+/// A place in the command files, whose lines are counted through: small, since a large design has
+/// as many of them as it has objects and connections.
+struct Spot {
+    std::uint32_t line = 0; ///< from 1; 0 is unknown
+    std::uint16_t column = 0;
+    std::uint16_t length = 0;
+};
+
+/// Who was made, connected or given a constant where.
+class Places {
+public:
+    enum Event : std::uintptr_t { MADE = 0, CONNECTED = 1, CONSTANT = 2, ASSIGNED = 3 };
+    static constexpr std::uint32_t EVER = UINT32_MAX;
+
+    /// The lines to come are of this file; `shownName` is what the user called it.
+    void BeginFile(std::string const &path, std::string const &shownName);
+    /// Counts a line and gives its number.
+    std::uint32_t NextLine() { return ++lineCount; }
+
+    void Put(Event event, void const *object, Spot spot) {
+        entries.push_back({KeyOf(event, object), spot});
+    }
+    /// The last place that was put before a line. An object that died may have left its address to
+    /// another: ask for the former one with the line at which it was alive.
+    Spot Find(Event event, void const *object, std::uint32_t before = EVER) const;
+
+    Place GetPlace(Spot spot) const;
+    /// Gives each diagnostic with a column the text of its line, as far as files can be read again.
+    /// They have to be in order of their places.
+    void AddSources(std::vector<Diagnostic> &diagnostics, std::vector<Spot> const &spots) const;
+
+private:
+    struct Entry {
+        std::uintptr_t key;
+        Spot spot;
+    };
+    struct File {
+        std::string path;
+        std::string shownName;
+        std::uint32_t linesBefore;
+    };
+
+    /// Objects stand at even addresses of eight bytes: the low bits are free for the event.
+    static std::uintptr_t KeyOf(Event event, void const *object) {
+        return reinterpret_cast<std::uintptr_t>(object) | event;
+    }
+    File const &FileOf(std::uint32_t line) const;
+
+    std::vector<File> files;
+    std::uint32_t lineCount = 0;
+    mutable std::vector<Entry> entries; ///< those in front sorted by key, then by line
+    mutable std::size_t sortedCount = 0;
+};
+
+} // namespace Checks

@@ -1,0 +1,90 @@
+#pragma once
+
+#include <string>
+#include <unordered_map>
+#include <unordered_set>
+#include <vector>
+
+#include "tool/check/Findings.h"
+#include "tool/check/Places.h"
+#include "tool/check/Text.h"
+#include "tool/diagnostics/LineTokens.h"
+#include "vesk_hdl/Vesk_Hdl.h"
+
+namespace Checks {
+
+/// How a scalar came to be called like one bit of a bus.
+enum class Origin { DECLARED, COMPOUND, BRACKETS };
+
+/// Watches lines run: notes what each of them makes and connects, and finds what can be seen only
+/// then, such as a bus that gives way to a wider one. Before looks at the names on the line and
+/// After at what has become of them, so that a line costs its own length and not the design's.
+class Recorder {
+public:
+    Recorder(Vesk_Hdl::Model &watched, Places &madePlaces, Findings &foundThings)
+        : model(watched), netlist(*watched.GetNetlist()), places(madePlaces),
+          findings(foundThings) {}
+
+    void Before(LineTokens const &lineTokens, std::uint32_t line);
+    /// A line that did not run may have made a net all the same.
+    void After(bool ran);
+
+    /// Of a scalar whose name has brackets.
+    Origin GetOrigin(Vesk_Hdl::Signal const *signal) const;
+
+private:
+    /// A net that the line names.
+    struct Named {
+        std::string name;
+        int token;
+        bool existed;
+        Origin origin;
+    };
+    /// A bus that may give way, and what it would lose.
+    struct Widened {
+        Vesk_Hdl::Bus *bus;
+        std::string name;
+        std::string losses;
+        int token;
+    };
+
+    Spot SpotOf(int token) const;
+    void Name(std::string const &name, int token);
+    void NameMember(std::string const &name, int token, Origin origin);
+    void WatchBus(std::string const &name, int token);
+    static std::string LossesOf(Vesk_Hdl::Bus const &bus);
+    void NamePin(int token);
+    Vesk_Hdl::AttributeHolder *HolderOf(int token, std::string_view kind) const;
+
+    void RecordNets();
+    void CompareSpelling(Named const &named, Vesk_Hdl::Signal const &signal);
+    void RecordPin();
+    void RecordWidening(Widened const &widened);
+    void RecordAssignment();
+    void RecordDeclaration();
+    void RecordAttribute();
+
+    Vesk_Hdl::Model &model;
+    Vesk_Hdl::Netlist &netlist;
+    Places &places;
+    Findings &findings;
+
+    // The line that runs.
+    LineTokens const *tokens = nullptr;
+    std::uint32_t lineNumber = 0;
+    std::string_view keyword;
+    int firstArgument = 0;
+    std::vector<Named> nets;
+    std::vector<Widened> buses;
+    Vesk_Hdl::Pin *pin = nullptr;
+    Vesk_Hdl::Signal *formerNet = nullptr; ///< of the pin
+    Text formerNetName;
+    Vesk_Hdl::AttributeHolder *holder = nullptr;
+    int attributeToken = 0;
+
+    std::unordered_map<Vesk_Hdl::Signal const *, Origin> origins;
+    std::unordered_set<Vesk_Hdl::Signal const *> respelled;
+    std::unordered_map<Vesk_Hdl::Pin *, Vesk_Hdl::Signal *> moved; ///< pins and their last nets
+};
+
+} // namespace Checks

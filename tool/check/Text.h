@@ -1,0 +1,97 @@
+#pragma once
+
+#include <algorithm>
+#include <string>
+#include <string_view>
+
+#include "vesk_hdl/Vesk_Hdl.h"
+
+// Names as the checks compare and show them.
+
+namespace Checks {
+
+using Text = Basis::StringBase<char>;
+
+inline std::string Quote(std::string_view text) { return '"' + std::string(text) + '"'; }
+
+inline char Lower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; }
+
+inline std::string Folded(std::string_view text) {
+    std::string folded(text);
+    std::transform(folded.begin(), folded.end(), folded.begin(), Lower);
+    return folded;
+}
+
+inline bool SameFolded(std::string_view left, std::string_view right) {
+    return left.size() == right.size() &&
+           std::equal(left.begin(), left.end(), right.begin(),
+                      [](char a, char b) { return Lower(a) == Lower(b); });
+}
+
+/// What stands in front of the brackets of a net's name, if it has any; no copy.
+inline std::string_view BaseOf(std::string_view name) {
+    std::size_t const open = name.find('(');
+    bool const plain = open == std::string_view::npos || name.find(')') == std::string_view::npos ||
+                       name.find(',') != std::string_view::npos;
+    return plain ? name : name.substr(0, open);
+}
+inline std::string_view BaseOf(Vesk_Hdl::Object const &object) {
+    return BaseOf(object.GetNameRef().View());
+}
+
+/// The bits of a bus, a slice or one bit, as its name tells them.
+struct Range {
+    long long left = 0;
+    long long right = 0;
+
+    long long Low() const { return std::min(left, right); }
+    long long High() const { return std::max(left, right); }
+    long long Width() const { return High() - Low() + 1; }
+    bool IsDown() const { return left > right; }
+    bool Holds(Range const &other) const { return Low() <= other.Low() && other.High() <= High(); }
+};
+
+/// Whether the name has bounds or an index; a scalar's is the one bit 0.
+inline bool GetRange(Text const &name, Range &range) {
+    Text base;
+    int left = 0;
+    int right = 0;
+    if (Vesk_Hdl::Bus::ParseBusName(name, base, left, right)) {
+        range = {left, right};
+        return true;
+    }
+    if (Vesk_Hdl::BusIndex::ParseBusIndexName(name, base, left)) {
+        range = {left, left};
+        return true;
+    }
+    range = {};
+    return false;
+}
+
+inline std::string Normal(std::string_view name) {
+    Text text(name);
+    Vesk_Hdl::Object::NormalizeName(text);
+    return std::string(text.View());
+}
+
+/// "INSTANCE.PIN" without its first point, as the commands split it.
+inline bool SplitPin(std::string_view token, std::string &owner, std::string &pin) {
+    std::size_t const begin = std::min(token.find_first_not_of('.'), token.size());
+    std::size_t const point = token.find('.', begin);
+    if (point == std::string_view::npos || point + 1 >= token.size())
+        return false;
+    owner = token.substr(0, point);
+    pin = token.substr(point + 1);
+    return true;
+}
+
+inline std::string PinName(Vesk_Hdl::Object const &owner, Vesk_Hdl::Pin const &pin) {
+    return "pin " +
+           Quote(std::string(owner.GetNameRef().View()) + "." + pin.GetNameRef().GetText());
+}
+
+inline std::string NetName(Vesk_Hdl::Signal const &signal) {
+    return (signal.IsPort() ? "port " : "net ") + Quote(signal.GetNameRef().View());
+}
+
+} // namespace Checks

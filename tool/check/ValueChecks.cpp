@@ -1,0 +1,426 @@
+// Constants of nets and pins, attributes, and their values as they are going to be written.
+
+#include <cstring>
+#include <unordered_map>
+#include <unordered_set>
+
+#include "tool/check/Attributes.h"
+#include "tool/check/Design.h"
+#include "tool/check/Fold.h"
+
+using namespace Vesk_Hdl;
+
+namespace Checks {
+
+std::string VhdlTypeOf(Attribute const &attribute) {
+    switch (attribute.GetValueType()) {
+    case Attribute::VALUE_STRING:
+        return "string";
+    case Attribute::VALUE_INTEGER:
+        return "integer";
+    case Attribute::VALUE_FLOAT:
+        return "real";
+    case Attribute::VALUE_BOOLEAN:
+        return "boolean";
+    case Attribute::VALUE_BIT:
+        return "bit";
+    case Attribute::VALUE_BIT_VECTOR:
+        return "bit_vector";
+    case Attribute::VALUE_USER:
+        return Folded(static_cast<AttributeUser const &>(attribute).GetUserType().View());
+    }
+    return {};
+}
+
+namespace {
+
+/// The constant of a net, against the net's width.
+class ConstantChecker {
+public:
+    ConstantChecker(Design const &checked, Signal const &checkedNet)
+        : design(checked), net(checkedNet), value(checkedNet.GetConstantValue()),
+          text(value.GetValue()), digits(text.View()) {}
+
+    void Run() {
+        Signal::SignalType const type = net.GetSignalType();
+        if (type == Signal::SIGNAL_COMPOUND_BUS)
+            return Add(Id::COMPOUND_ASSIGNMENT, BOTH);
+        if (net.GetPortPolarity() == Polarity::INPUT)
+            Add(Id::ASSIGNED_IN_PORT, BOTH);
+        if (type == Signal::SIGNAL_BUS_SLICE || type == Signal::SIGNAL_BUS_INDEX)
+            Add(Id::CONSTANT_ON_PART, VERILOG);
+        if (type == Signal::SIGNAL_SCALAR || type == Signal::SIGNAL_BUS_INDEX)
+            CheckBit();
+        else if (value.HasBaseAndLength())
+            CheckBased();
+        else
+            CheckBare();
+    }
+
+private:
+    void Add(Id id, Languages languages, std::string detail = {}) {
+        design.findings.Add(
+            {id,
+             design.ConstantAt(net),
+             (id == Id::COMPOUND_ASSIGNMENT ? "compound " + Quote(net.GetNameRef().View())
+                                            : NetName(net)),
+             {},
+             languages,
+             std::move(detail)});
+    }
+
+    /// Of a bit the last digit is written, as 0 if it is 0 and otherwise as 1.
+    void CheckBit() {
+        std::size_t const at =
+            value.GetLength() > 0 ? static_cast<std::size_t>(value.GetLength()) - 1 : digits.size();
+        char const digit = at < digits.size() ? digits[at] : '1';
+        if (value.GetLength() != 1 || digits.size() != 1)
+            Add(Id::CONSTANT_WIDTH, BOTH, std::string("written as ") + (digit == '0' ? '0' : '1'));
+        else if (digit != '0' && digit != '1')
+            Add(Id::CONSTANT_DIGIT, BOTH, "written as 1");
+    }
+
+    void CheckBased() {
+        int const base = value.GetBase();
+        std::string_view const known = base == 2   ? "01"
+                                       : base == 8 ? "01234567"
+                                                   : "0123456789abcdefABCDEF";
+        std::size_t const bitsOfDigit = base == 2 ? 1 : base == 8 ? 3 : 4;
+        Languages const bad = (AreAll(known, "_") ? NO_LANGUAGE : VHDL) |
+                              (AreAll(known, "_xXzZ?") ? NO_LANGUAGE : VERILOG);
+        if (bad != NO_LANGUAGE)
+            Add(Id::CONSTANT_DIGIT, bad, std::string(digits));
+        auto const count = static_cast<std::size_t>(digits.size()) -
+                           static_cast<std::size_t>(std::count(digits.begin(), digits.end(), '_'));
+        auto const width = static_cast<std::size_t>(std::max(net.GetWidth(), 0));
+        bool const fitsVerilog =
+            value.GetLength() > 0 && static_cast<std::size_t>(value.GetLength()) == width;
+        Languages const wrong = (count * bitsOfDigit == width ? NO_LANGUAGE : VHDL) |
+                                (fitsVerilog ? NO_LANGUAGE : VERILOG);
+        if (wrong != NO_LANGUAGE)
+            Add(Id::CONSTANT_WIDTH, wrong,
+                std::to_string(count * bitsOfDigit) + " bits of digits, declared as " +
+                    std::to_string(value.GetLength()) + ", on " + std::to_string(width));
+    }
+
+    void CheckBare() {
+        Languages const bad = (AreAll("01", "UXZWLH") ? NO_LANGUAGE : VHDL) |
+                              (AreAll("0123456789", "_") ? NO_LANGUAGE : VERILOG);
+        if (bad != NO_LANGUAGE)
+            Add(Id::CONSTANT_DIGIT, bad, std::string(digits));
+        if (static_cast<int>(digits.size()) != net.GetWidth())
+            Add(Id::CONSTANT_WIDTH, VHDL,
+                std::to_string(digits.size()) + " digits on " + std::to_string(net.GetWidth()));
+        if (digits.size() > 1)
+            Add(Id::CONSTANT_WITHOUT_BASE, BOTH, std::string(digits));
+    }
+
+    bool AreAll(std::string_view known, std::string_view further) const {
+        return !digits.empty() && digits.front() != '_' &&
+               std::all_of(digits.begin(), digits.end(), [&](char c) {
+                   return known.find(c) != std::string_view::npos ||
+                          further.find(c) != std::string_view::npos;
+               });
+    }
+
+    Design const &design;
+    Signal const &net;
+    BitVectorValue const value;
+    Text const text;
+    std::string_view digits;
+};
+
+/// Two pins whose INSTANCE_PIN is the same name.
+void CheckSharedConstants(Design const &design) {
+    std::unordered_map<Signal const *, Pin const *> pinOfTie;
+    design.ForEachPin([&](Instance const &instance, Pin const &pin) {
+        Signal const *const signal = pin.GetSignal();
+        if (!signal || !signal->HasConstantValue())
+            return;
+        std::string tie = std::string(instance.GetNameRef().View()) + "_";
+        tie += BaseOf(pin);
+        tie += "_CONST_SIGNAL";
+        if (!SameFolded(BaseOf(*signal), tie))
+            return;
+        auto const [former, isNew] = pinOfTie.try_emplace(signal, &pin);
+        if (!isNew)
+            design.findings.Add({Id::SHARED_CONSTANT,
+                                 design.ConnectedAt(instance, pin),
+                                 PinName(instance, pin),
+                                 {{former->second, "the other pin is here", Places::CONNECTED}},
+                                 BOTH,
+                                 Quote(signal->GetNameRef().View())});
+    });
+}
+
+class AttributeChecker {
+public:
+    explicit AttributeChecker(Design const &checked)
+        : design(checked), useAttrType(checked.options.vhdlOption.useAttrType) {
+        ForEachAttribute(design, [this](AttributeUse const &use) {
+            if (!use.generic && use.attribute->IsSynDeclared())
+                (IsPort(use) ? declaredByPorts : declared)
+                    .insert(Folded(use.attribute->GetNameRef().View()));
+        });
+    }
+
+    void Run() {
+        ForEachAttribute(design, [this](AttributeUse const &use) {
+            if (!use.generic)
+                CheckDeclared(use);
+            else if (use.kind == AttributeUse::INSTANCE)
+                CheckGeneric(use);
+            CheckValue(use);
+        });
+        CheckInheritedFolds();
+        FindUnwritten();
+    }
+
+private:
+    static bool IsPort(AttributeUse const &use) {
+        return use.kind == AttributeUse::SIGNAL && static_cast<Signal const *>(use.owner)->IsPort();
+    }
+
+    void Add(Id id, AttributeUse const &use, Languages languages = BOTH, std::string detail = {}) {
+        Spot const spot = design.MadeAt(use.attribute);
+        design.findings.Add({id,
+                             spot.line > 0 ? spot : design.MadeAt(use.owner),
+                             "attribute " + Quote(use.attribute->GetNameRef().View()) + " of " +
+                                 Quote(use.owner->GetNameRef().View()),
+                             {},
+                             languages,
+                             std::move(detail)});
+    }
+
+    /// The packages of the user may declare what nobody here does.
+    void CheckDeclared(AttributeUse const &use) {
+        std::string const name = Folded(use.attribute->GetNameRef().View());
+        bool const isDeclared =
+            declaredByPorts.count(name) > 0 || (!IsPort(use) && declared.count(name) > 0);
+        bool const isLeftOut =
+            use.kind == AttributeUse::COMPONENT && design.options.vhdlOption.suppressComponent;
+        if (!isDeclared && !isLeftOut && design.options.vhdlOption.useLibraries.IsEmpty())
+            Add(Id::UNDECLARED_ATTRIBUTE, use, VHDL);
+    }
+
+    void CheckGeneric(AttributeUse const &use) {
+        auto const *const instance = static_cast<Instance const *>(use.owner);
+        Attribute const *const generic = instance->GetComponentAttr(use.attribute->GetNameRef());
+        bool const isKnown = generic && (generic->IsGenericSyn() || generic->IsGenericNoSyn());
+        if (!isKnown && !design.options.vhdlOption.suppressComponent)
+            return Add(Id::UNKNOWN_GENERIC, use, VHDL);
+        // What a type of the user's takes is the user's affair.
+        auto const isUser = [](Attribute const &attribute) {
+            return attribute.GetValueType() == Attribute::VALUE_USER;
+        };
+        if (isKnown && generic->GetValueType() != use.attribute->GetValueType() &&
+            !isUser(*generic) && !isUser(*use.attribute))
+            Add(Id::GENERIC_TYPE, use, VHDL,
+                use.attribute->GetValueTypeName().GetText() + std::string(" for ") +
+                    generic->GetValueTypeName().GetText());
+    }
+
+    // How a value is written: as a string in both languages, in one of them, or in none.
+
+    Languages QuotedIn(AttributeUse const &use) const {
+        Attribute::ValueType const type = use.attribute->GetValueType();
+        bool const asString = type == Attribute::VALUE_STRING;
+        Languages quoted = NO_LANGUAGE;
+        bool const isLeftOut =
+            use.kind == AttributeUse::COMPONENT && design.options.vhdlOption.suppressComponent;
+        if ((asString || (!use.generic && !useAttrType)) && !isLeftOut)
+            quoted |= VHDL;
+        // A component's generic is a parameter of each instance; other attributes are comments.
+        if (use.generic && (asString || type == Attribute::VALUE_USER))
+            quoted |= VERILOG;
+        return quoted;
+    }
+
+    /// Values of a user's type keep their quotes in Verilog.
+    static Text ValueInVerilog(Attribute const &attribute) {
+        Text const value = attribute.GetValueString();
+        return attribute.GetValueType() == Attribute::VALUE_USER
+                   ? value
+                   : HdlUtilities::RemoveQuotes(value);
+    }
+
+    void CheckValue(AttributeUse const &use) {
+        Languages const quoted = QuotedIn(use);
+        if (quoted == NO_LANGUAGE)
+            return;
+        Text const bare = HdlUtilities::RemoveQuotes(use.attribute->GetValueString());
+        Text const verilog = ValueInVerilog(*use.attribute);
+        Languages const bad = (BreaksVhdl(bare.View()) ? VHDL : NO_LANGUAGE) |
+                              (BreaksVerilog(verilog.View()) ? VERILOG : NO_LANGUAGE);
+        if ((bad & quoted) != NO_LANGUAGE)
+            Add(Id::QUOTED_VALUE, use, bad & quoted);
+        if (bare.View().find(' ') == std::string_view::npos)
+            return;
+        Languages const broken = (quoted & VHDL ? FoldsInVhdl(use, bare) : NO_LANGUAGE) |
+                                 (quoted & VERILOG ? FoldsInVerilog(use, verilog) : NO_LANGUAGE);
+        if (broken != NO_LANGUAGE)
+            Add(Id::FOLDED_VALUE, use, broken);
+    }
+
+    static bool BreaksVhdl(std::string_view value) {
+        for (std::size_t i = 0; i < value.size(); ++i)
+            if (value[i] == '"' && (i + 1 == value.size() || value[++i] != '"'))
+                return true;
+        return false;
+    }
+
+    static bool BreaksVerilog(std::string_view value) {
+        for (std::size_t i = 0; i < value.size(); ++i)
+            if (value[i] == '"' || (value[i] == '\\' && ++i == value.size()))
+                return true;
+        return false;
+    }
+
+    static Languages FoldsInVhdl(AttributeUse const &use, Text const &value) {
+        std::string_view const name = use.attribute->GetNameRef().View();
+        if (!use.generic)
+            return FoldsInAttribute(use, value.View());
+        bool const isMap = use.kind == AttributeUse::INSTANCE;
+        Fold fold(use.kind == AttributeUse::COMPONENT ? 2 : 1);
+        // A clause begins with its word, later items with blanks in place of it.
+        if (IsFirstGeneric(use))
+            fold.Put(isMap ? "generic map" : "generic").Put("( ");
+        else
+            fold.Put("         ");
+        fold.Put(name).Put(isMap ? " => " : " : ");
+        if (!isMap)
+            fold.Put("string").Put(" :=  ");
+        fold.Put("\"").Put(value.View(), true).Put("\"").Put(")").Put(isMap ? "" : ";");
+        return fold.IsBroken() ? VHDL : NO_LANGUAGE;
+    }
+
+    /// Generics of option SYN come first.
+    static bool IsFirstGeneric(AttributeUse const &use) {
+        Attribute const *first = nullptr;
+        ForEach(dynamic_cast<AttributeHolder const &>(*use.owner).GetAttrIterator(),
+                [&first](Attribute const *attribute) {
+                    bool const better = attribute->IsGenericSyn()
+                                            ? !first || !first->IsGenericSyn()
+                                            : attribute->IsGenericNoSyn() && !first;
+                    if (better)
+                        first = attribute;
+                });
+        return first == use.attribute;
+    }
+
+    static Languages FoldsInAttribute(AttributeUse const &use, std::string_view value) {
+        std::string_view const objectClass = use.kind == AttributeUse::SIGNAL     ? "signal"
+                                             : use.kind == AttributeUse::INSTANCE ? "label"
+                                                                                  : "component";
+        Fold fold(1);
+        fold.Put("attribute").Put(" ").Put(use.attribute->GetNameRef().View()).Put(" ");
+        fold.Put("of").Put(" ").Put(BaseOf(*use.owner)).Put(" : ").Put(objectClass);
+        fold.Put(" ").Put("is").Put(" ").Put("\"").Put(value, true).Put("\"").Put(";");
+        return fold.IsBroken() ? VHDL : NO_LANGUAGE;
+    }
+
+    static bool FoldsAsParameter(Fold fold, AttributeUse const &use, Text const &value) {
+        fold.Put(use.attribute->GetNameRef().View()).Put(" = ");
+        fold.Put("\"").Put(value.View(), true).Put("\"").Put(";");
+        return fold.IsBroken();
+    }
+
+    static bool FoldsAsDefparam(Object const &instance, AttributeUse const &use,
+                                Text const &value) {
+        return FoldsAsParameter(
+            Fold(1).Put("defparam").Put(" ").Put(instance.GetNameRef().View()).Put("."), use,
+            value);
+    }
+
+    static Languages FoldsInVerilog(AttributeUse const &use, Text const &value) {
+        bool const broken =
+            use.kind == AttributeUse::MODULE
+                ? FoldsAsParameter(Fold(1).Put("parameter").Put(" "), use, value)
+                : use.kind == AttributeUse::INSTANCE && FoldsAsDefparam(*use.owner, use, value);
+        return broken ? VERILOG : NO_LANGUAGE;
+    }
+
+    /// A component's generic stands in a Verilog line of each instance that has none of its own.
+    void CheckInheritedFolds() {
+        design.ForEachInstance([this](Instance const *instance) {
+            Component const *const component = instance->GetComponent();
+            if (!component || !component->HasAttrs())
+                return;
+            ForEach(component->GetAttrIterator(), [&](Attribute const *attribute) {
+                AttributeUse const use{attribute, AttributeUse::COMPONENT, component, true};
+                Text const value = ValueInVerilog(*attribute);
+                if ((attribute->IsGenericSyn() || attribute->IsGenericNoSyn()) &&
+                    (QuotedIn(use) & VERILOG) != NO_LANGUAGE &&
+                    value.View().find(' ') != std::string_view::npos &&
+                    !instance->GetAttr(attribute->GetNameRef()) &&
+                    FoldsAsDefparam(*instance, use, value))
+                    Add(Id::FOLDED_VALUE, use, VERILOG,
+                        "at the instance " + Quote(instance->GetNameRef().View()));
+            });
+        });
+    }
+
+    /// Attribute statements are written of whole nets, instances and components alone.
+    void FindUnwritten() {
+        auto const find = [this](AttributeHolder const &holder, Object const &owner) {
+            if (holder.HasAttrs())
+                ForEach(holder.GetAttrIterator(), [&](Attribute const *attribute) {
+                    if (attribute->IsSynAssigned())
+                        Add(Id::UNWRITTEN_ATTRIBUTE,
+                            {attribute, AttributeUse::MODULE, &owner, false});
+                });
+        };
+        find(design.netlist, design.netlist);
+        design.ForEachSignal([&](Signal const *signal) {
+            if (!signal->IsNeededToDeclared())
+                find(*signal, *signal);
+        });
+        design.ForEachUsedComponent([&](Component const *component) {
+            ForEach(component->GetPinIterator(), [&](Pin const *pin) { find(*pin, *pin); });
+        });
+    }
+
+    Design const &design;
+    bool useAttrType;
+    std::unordered_set<std::string> declared;
+    std::unordered_set<std::string> declaredByPorts;
+};
+
+/// In a macro the INIT of an instance is handed on, and one of option NOSYN is written as well.
+void CheckDefparams(Design const &design) {
+    std::string_view const name = design.netlist.GetNameRef().View();
+    auto const holds = [name](char const *mark) {
+        return name.find(mark) != std::string_view::npos;
+    };
+    auto const isInit = [](Attribute const &attribute) { return attribute.GetNameRef() == "INIT"; };
+    bool isMacro = false;
+    ForEachAttribute(design, [&](AttributeUse const &use) {
+        isMacro |= use.kind == AttributeUse::MODULE && isInit(*use.attribute) &&
+                   use.attribute->IsGenericSyn();
+    });
+    if (!isMacro || !(holds("MORVANE") || holds("HORVANE")))
+        return;
+    ForEachAttribute(design, [&](AttributeUse const &use) {
+        if (use.generic && use.kind == AttributeUse::INSTANCE && isInit(*use.attribute) &&
+            use.attribute->IsGenericNoSyn()) {
+            Spot const spot = design.MadeAt(use.attribute);
+            design.findings.Add({Id::DOUBLE_DEFPARAM,
+                                 spot.line > 0 ? spot : design.MadeAt(use.owner),
+                                 "attribute \"INIT\" of " + Quote(use.owner->GetNameRef().View())});
+        }
+    });
+}
+
+} // namespace
+
+void CheckValues(Design const &design) {
+    design.ForEachSignal([&](Signal const *signal) {
+        if (signal->HasConstantValue())
+            ConstantChecker(design, *signal).Run();
+    });
+    CheckSharedConstants(design);
+    AttributeChecker(design).Run();
+    CheckDefparams(design);
+}
+
+} // namespace Checks

@@ -52,9 +52,10 @@ install(FILES
     COMPONENT development)
 
 # Names for vesk_hdl.pc: from its folder up to the prefix, and from there down again. A folder given
-# as an absolute path (distributions do that) stays as it is.
+# as an absolute path (distributions do that) stays as it is, and so does a package's prefix, whose
+# folders pkg-config then knows to be those of the system.
 set(pc_prefix ${CMAKE_INSTALL_PREFIX})
-if(NOT IS_ABSOLUTE ${CMAKE_INSTALL_LIBDIR})
+if(NOT IS_ABSOLUTE ${CMAKE_INSTALL_LIBDIR} AND NOT VESK_HDL_DEBIAN)
     file(RELATIVE_PATH up ${CMAKE_INSTALL_PREFIX}/${pkgconfig_dir} ${CMAKE_INSTALL_PREFIX})
     string(REGEX REPLACE "/$" "" pc_prefix "\${pcfiledir}/${up}")
 endif()

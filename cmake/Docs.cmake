@@ -7,7 +7,7 @@ if(NOT VESK_HDL_DOXYGEN)
 endif()
 
 get_target_property(reference_inputs Vesk_Hdl HEADER_SET)
-list(PREPEND reference_inputs ${PROJECT_SOURCE_DIR}/docs/README.md)
+list(PREPEND reference_inputs ${PROJECT_SOURCE_DIR}/docs/reference.md)
 list(JOIN reference_inputs " " reference_inputs)
 configure_file(docs/Doxyfile.in ${PROJECT_BINARY_DIR}/Doxyfile @ONLY)
 

@@ -1,4 +1,4 @@
-// The cells of the designs in golden/, without function.
+// The cells of the designs in golden/ and examples/, without function.
 `timescale 1ns / 1ps
 
 module AND2(input I0, input I1, output O);
@@ -53,4 +53,23 @@ endmodule
 
 module TITLED(input I, output O);
     parameter TITLE = "";
+endmodule
+
+module INV(input I, output O);
+endmodule
+
+module XOR2(input I0, input I1, output O);
+endmodule
+
+module DFF(input C, input D, output Q);
+endmodule
+
+module LUT2(input I0, input I1, output O);
+    parameter INIT = 0;
+endmodule
+
+module ADD4(input [3:0] A, input [3:0] B, input CI, output [3:0] S, output CO);
+endmodule
+
+module REG9(input C, input [8:0] D, output [8:0] Q);
 endmodule

@@ -1,4 +1,4 @@
--- The cells of the designs in golden/. They have ports and no function; a written configuration
+-- The cells of the designs in golden/ and examples/. They have ports and no function; a written configuration
 -- binds each of them by the configuration CFG_<cell>.
 library ieee;
 use ieee.std_logic_1164.all;
@@ -102,3 +102,61 @@ entity TITLED is
 end TITLED;
 architecture EMPTY of TITLED is begin end EMPTY;
 configuration CFG_TITLED of TITLED is for EMPTY end for; end CFG_TITLED;
+
+library ieee;
+use ieee.std_logic_1164.all;
+entity INV is
+    port (I : in std_logic; O : out std_logic);
+end INV;
+architecture EMPTY of INV is begin end EMPTY;
+configuration CFG_INV of INV is for EMPTY end for; end CFG_INV;
+
+library ieee;
+use ieee.std_logic_1164.all;
+entity XOR2 is
+    port (I0, I1 : in std_logic; O : out std_logic);
+end XOR2;
+architecture EMPTY of XOR2 is begin end EMPTY;
+configuration CFG_XOR2 of XOR2 is for EMPTY end for; end CFG_XOR2;
+
+library ieee;
+use ieee.std_logic_1164.all;
+entity DFF is
+    port (C, D : in std_logic; Q : out std_logic);
+end DFF;
+architecture EMPTY of DFF is begin end EMPTY;
+configuration CFG_DFF of DFF is for EMPTY end for; end CFG_DFF;
+
+library ieee;
+use ieee.std_logic_1164.all;
+entity LUT2 is
+    generic (INIT : integer := 0);
+    port (I0, I1 : in std_logic; O : out std_logic);
+end LUT2;
+architecture EMPTY of LUT2 is begin end EMPTY;
+configuration CFG_LUT2 of LUT2 is for EMPTY end for; end CFG_LUT2;
+
+library ieee;
+use ieee.std_logic_1164.all;
+entity ADD4 is
+    port (
+        A, B : in std_logic_vector(3 downto 0);
+        CI : in std_logic;
+        S : out std_logic_vector(3 downto 0);
+        CO : out std_logic
+    );
+end ADD4;
+architecture EMPTY of ADD4 is begin end EMPTY;
+configuration CFG_ADD4 of ADD4 is for EMPTY end for; end CFG_ADD4;
+
+library ieee;
+use ieee.std_logic_1164.all;
+entity REG9 is
+    port (
+        C : in std_logic;
+        D : in std_logic_vector(8 downto 0);
+        Q : out std_logic_vector(8 downto 0)
+    );
+end REG9;
+architecture EMPTY of REG9 is begin end EMPTY;
+configuration CFG_REG9 of REG9 is for EMPTY end for; end CFG_REG9;

@@ -1,6 +1,7 @@
 #!/usr/bin/env bash
-# judge.sh FOLDER: asks independent readers whether the written files that FOLDER/judge lists are
-# legal. GHDL analyses and elaborates VHDL-93, Icarus and Verilator read Verilog. 77: no reader here.
+# judge.sh FOLDER [TOOL]: asks independent readers whether the written files that FOLDER/judge lists
+# are legal; with a TOOL, those that it writes when it runs the command file of FOLDER. GHDL analyses
+# and elaborates VHDL-93, Icarus and Verilator read Verilog. 77: no reader here.
 set -euo pipefail
 judges=$(cd "$(dirname "${BASH_SOURCE[0]}")" && pwd)
 folder=$(cd "$1" && pwd)
@@ -45,12 +46,21 @@ judge() {
     esac
 }
 
+written=$folder
+if (($# > 1)); then
+    written=$work/written
+    mkdir "$written"
+    "$2" run --output-dir "$written" "$folder/${folder##*/}.cmd"
+fi
+
+files() { if [[ $written == "$folder" ]]; then cat judge; else ls; fi; }
+
 # Whatever a reader says is a complaint.
 failures=0
 while read -r file; do
-    if ! said=$(judge "$folder/$file" 2>&1) || [[ -n $said ]]; then
+    if ! said=$(judge "$written/$file" 2>&1) || [[ -n $said ]]; then
         printf '%s:\n%s\n' "$file" "$said"
         failures=$((failures + 1))
     fi
-done < "$folder/judge"
+done < <(cd "$written" && files)
 exit $((failures > 0))

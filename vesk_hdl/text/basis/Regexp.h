@@ -2,8 +2,8 @@
 
 #include "vesk_hdl/text/basis/StringBase.h"
 
-/// A compiled regular expression of plain characters, `.`, bracket classes such as `[A-Za-z_]` and
-/// `[^,]`, a backslash in front of a character that stands for itself, each with `?`, `*` or `+`
+/// A compiled regular expression of plain characters, ".", bracket classes such as "[A-Za-z_]" and
+/// "[^,]", a backslash in front of a character that stands for itself, each with "?", "*" or "+"
 /// behind it. Matching takes one pass over the text, however long. Not copyable.
 class VESK_HDL_API Basis_Regexp {
 public:

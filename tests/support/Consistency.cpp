@@ -77,7 +77,7 @@ private:
         if (type != Signal::SIGNAL_BUS_SLICE && type != Signal::SIGNAL_BUS_INDEX)
             return;
         Bus const *const bus = netlist.GetParentBus(signal->GetName());
-        if (!bus || IsMadeByWrite(signal)) // of a dummy there may be two
+        if (!bus || IsMadeByLibrary(signal)) // of a dummy there may be two
             return;
         bool listed = false;
         ForEach(bus->GetBusSliceIterator(), [&](Signal *slice) { listed |= slice == signal; });
@@ -85,10 +85,11 @@ private:
             Fail(*signal, "its bus does not list it");
     }
 
-    static bool IsMadeByWrite(Signal const *signal) {
+    static bool IsMadeByLibrary(Signal const *signal) {
         std::string const name(signal->GetName());
         return Basis::strimatch(name.c_str(), "*_openSignal*") ||
-               Basis::strimatch(name.c_str(), "*_DUMMY*");
+               Basis::strimatch(name.c_str(), "*_DUMMY*") ||
+               Basis::strimatch(name.c_str(), "*_CONST_SIGNAL*");
     }
 
     void WalkPin(Pin *pin) {
@@ -97,7 +98,7 @@ private:
         if (!signal)
             return;
         WalkSignal(signal);
-        bool listed = signal->HasConstantValue() || IsMadeByWrite(signal);
+        bool listed = IsMadeByLibrary(signal);
         ForEach(signal->GetPinIterator(), [&](Pin *other) { listed |= other == pin; });
         if (!listed)
             Fail(*pin, ("is not listed by its signal " + std::string(signal->GetName())).c_str());

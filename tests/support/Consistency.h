@@ -9,8 +9,8 @@
 /// finds each pointer that outlived its object.
 ///
 /// - A name finds an object of that name, whatever its case; the object is one of the array's.
-/// - The signal of a pin lists the pin, unless they were joined one way: the signal has a constant,
-///   or a write made it for an open pin or took a dummy that had pins already.
+/// - The signal of a pin lists the pin, unless the library made it and joined them one way: for a
+///   constant, for an open pin, or as a dummy that had pins already.
 /// - A slice or bit is listed by the bus of its name, dummies aside.
 /// - No list holds null or the same pin twice.
 std::string Inconsistency(Vesk_Hdl::Netlist const &netlist);

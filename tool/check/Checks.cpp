@@ -49,7 +49,7 @@ std::vector<Row> const ROWS = {
      "is called like something else that is declared in the same place", "rename one of the two"},
     {Id::DUMMY_NAME_TAKEN, "dummy-name-taken", BOTH, WARNING,
      "is read or driven inside against its direction and gets a dummy signal, whose name is taken",
-     "rename what is called ..._DUMMY"},
+     "rename what is called ..._DUMMY; behind a WRITE line connect to the dummy signal itself"},
     {Id::DUMMY_OF_DUMMY, "dummy-of-dummy", BOTH, WARNING,
      "is read or driven inside against its direction, and its dummy signal gets the very same name",
      "give the port a name that does not end in _DUMMY"},

@@ -88,8 +88,11 @@ void Design::FindUses() {
             furtherUses[compound->GetAt(i)].push_back(use);
     };
     ForEachSignal([&](Signal const *signal) {
-        if (signal->GetSignalType() == Signal::SIGNAL_COMPOUND_BUS)
+        if (signal->GetSignalType() == Signal::SIGNAL_COMPOUND_BUS) {
             ForEachPinOn(*signal, [&](Pin const *pin) { addTo(signal, UseOf(pin)); });
+            if (signal->HasConstantValue())
+                addTo(signal, {Use::DRIVES, nullptr, nullptr});
+        }
         ForEach(signal->GetSignalIterator(), [&](Signal const *source) {
             addTo(source, {Use::READS, nullptr, nullptr});
             addTo(signal, {Use::DRIVES, nullptr, source});

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "tool/check/Text.h"
+
 namespace Checks {
 
 namespace {
@@ -32,7 +34,7 @@ void Findings::Add(Finding finding) {
     if ((finding.languages & languages) == 0 || !Wants(finding.id))
         return;
     std::string const key = std::to_string(static_cast<int>(finding.id)) + ' ' +
-                            std::to_string(finding.spot.line) + ' ' + finding.subject;
+                            std::to_string(finding.spot.line) + ' ' + Folded(finding.subject);
     if (told.insert(key).second)
         findings.push_back(std::move(finding));
 }

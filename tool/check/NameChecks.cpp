@@ -227,18 +227,15 @@ public:
     }
 
 private:
-    /// Of two things with one name, the one that was made later is told.
-    void AddClash(Id id, std::string const &what, Object const &left, Object const &right,
+    void AddClash(Id id, std::string const &what, Object const &found, Object const &other,
                   Languages languages = BOTH) {
-        Spot const leftSpot = design.MadeAt(&left);
-        Spot const rightSpot = design.MadeAt(&right);
-        bool const leftIsLater = leftSpot.line >= rightSpot.line;
+        Spot const spot = design.MadeAt(&found);
         design.findings.Add({id,
-                             leftIsLater ? leftSpot : rightSpot,
-                             what + " " + Quote(left.GetNameRef().View()),
-                             {{leftIsLater ? &right : &left, "the other one is here"}},
+                             spot.line > 0 ? spot : design.MadeAt(&other),
+                             what + " " + Quote(found.GetNameRef().View()),
+                             {{&other, "the other one is here"}},
                              languages,
-                             Quote(right.GetNameRef().View())});
+                             Quote(other.GetNameRef().View())});
     }
 
     void CheckBus(Bus const &bus) {

@@ -8,6 +8,7 @@
 #include <CLI/CLI.hpp>
 
 #include "tool/check/Design.h"
+#include "tool/check/Rewriting.h"
 #include "tool/diagnostics/Blame.h"
 #include "tool/session/LineReader.h"
 #include "tool/session/Session.h"
@@ -93,7 +94,10 @@ private:
             PassWrite(line, place, tokens, number, isVhdl ? Checks::VHDL : Checks::VERILOG);
             return;
         }
-        changed |= tokens.GetSize() > 0;
+        if (tokens.GetSize() > 0) {
+            changed = true;
+            RewriteDesign();
+        }
         // What happens while lines run concerns whatever will be written.
         findings.SetLanguages(requested != Checks::NO_LANGUAGE ? requested : Checks::BOTH);
         recorder.Before(tokens, number);
@@ -118,6 +122,20 @@ private:
         findings.SetLanguages(requested != Checks::NO_LANGUAGE ? requested : language);
         CheckWriteLine(tokens, number);
         CheckDesign(requested != Checks::NO_LANGUAGE ? requested : language);
+        lastWritten |= language;
+    }
+
+    /// What the lines that wrote did to the design, for the first line behind them: most often
+    /// there is none.
+    void RewriteDesign() {
+        for (Checks::Languages const language : {Checks::VHDL, Checks::VERILOG})
+            if ((lastWritten & language) != 0)
+                Checks::Rewrite(session.GetModel(), DesignNow(), places, language);
+        lastWritten = Checks::NO_LANGUAGE;
+    }
+
+    Checks::Design DesignNow() {
+        return Checks::Design(session.GetModel(), places, recorder, findings);
     }
 
     /// The number of tokens alone tells which one names the file.
@@ -145,7 +163,7 @@ private:
 
     void CheckDesign(Checks::Languages languages) {
         findings.SetLanguages(languages);
-        Checks::Design const design(session.GetModel(), places, recorder, findings);
+        Checks::Design const design = DesignNow();
         Checks::CheckNames(design);
         Checks::CheckNets(design);
         Checks::CheckPins(design);
@@ -162,7 +180,8 @@ private:
     Checks::Recorder recorder;
     Checks::Languages requested = Checks::NO_LANGUAGE;
     Checks::Languages written = Checks::NO_LANGUAGE;
-    bool changed = true; ///< since the last line that wrote
+    Checks::Languages lastWritten = Checks::NO_LANGUAGE; ///< and not yet rewritten for it
+    bool changed = true;                                 ///< since the last line that wrote
     bool failed = false;
 };
 

@@ -1,0 +1,151 @@
+#!/usr/bin/env python3
+"""run.py TOOL: the cases of *.cases, for each check a design that trips it and one that just does not.
+
+What the tool finds has to be what a case says, and nothing in its clean design. Both are written,
+and independent readers have to refuse of the first exactly the languages that the case says, of the
+second none: GHDL reads VHDL-93, Icarus and Verilator read Verilog. A case may instead tell, by
+regular expressions, what wrong text is there. The head of a case is `### CHECK`, then, behind
+semicolons, `alone` (without prelude.cmd), `refused LANGUAGE...`, `shows LANGUAGE EXPRESSION`.
+"""
+
+import concurrent.futures, json, os, pathlib, re, shutil, subprocess, sys, tempfile
+
+HERE = pathlib.Path(__file__).resolve().parent
+KELEMENTS = HERE.parents[1] / "judges" / "kelements.vhd"
+PAGE = HERE.parents[2] / "docs" / "checks.md"
+TOOL = os.path.abspath(sys.argv[1])
+WRITES = "WRITE VHDL -NOHEADER out.vhd\nWRITE VERILOG -NOHEADER out.v\n"
+
+
+def run(folder, *command):
+    return subprocess.run(command, cwd=folder, capture_output=True, text=True, errors="replace")
+
+
+def stubs(commands):
+    """A module for each component, with the parameters that the design knows."""
+    parameters = sorted(set(re.findall(r"ATTRIBUTE (?:BUF|keep) (?:-TYPE=\w+ )?(\w+)", commands)))
+    text = ""
+    for name in re.findall(r"^ADD COMPONENT (\w+)$", commands, re.M):
+        ports = {}
+        for base, left, right, direction in re.findall(
+            rf"^ADD PIN {name} (\w+)(?:[(\[](\d+)(?::(\d+))?[)\]])? (\w+)", commands, re.M):
+            bounds = f"[{left}:{right or 0}] " if left else ""
+            word = {"i": "input", "o": "output", "b": "inout"}[direction[0]]
+            ports[base] = f"{word} {bounds}{base}"
+        text += f"module {name}({', '.join(ports.values())});\n"
+        text += "".join(f"parameter {p} = 0;\n" for p in parameters) + "endmodule\n"
+    return text
+
+
+def accepts(folder, language, commands):
+    """Whether the readers take a written file, and what they say."""
+    top = re.findall(r"^SET NETLIST NAME (\S+)", commands, re.M)[-1]
+    if language == "vhdl":
+        steps = [["ghdl", "-a", "--std=93", "--work=KORBAL", KELEMENTS],
+                 ["ghdl", "-a", "--std=93", "out.vhd"],
+                 ["ghdl", "-r", "--std=93", "-Wno-binding", top, "--stop-time=0ns"]]
+    else:
+        (folder / "stubs.v").write_text(stubs(commands))
+        steps = [["iverilog", "-t", "null", "-s", top, "out.v", "stubs.v"],
+                 ["verilator", "--lint-only", "-Wno-lint", "-Wno-style", "-Wno-fatal",
+                  "--top-module", top, "-v", "stubs.v", "out.v"]]
+    for step in steps:
+        done = run(folder, *step)
+        if done.returncode != 0:
+            return False, done.stdout + done.stderr
+    return True, ""
+
+
+def findings(folder, *arguments):
+    told = run(folder, TOOL, "check", "--diagnostics", "json", *arguments).stderr.splitlines()
+    return [one for one in map(json.loads, told) if one["severity"] != "count"]
+
+
+def check(folder, check_name, *files):
+    off = [] if check_name == "unused-component" else ["--off", "unused-component"]
+    return [(one["file"], f"{one['line']}:{one['column']} {one.get('finding', one['message'])} "
+             + one.get("language", "")) for one in findings(folder, *off, *files)]
+
+
+def judge(case):
+    """The faults of one case."""
+    head, body = case.split("\n", 1)
+    trips, finds, clean = re.split(r"^--- (?:finds|clean)\n", body, flags=re.M)
+    name, *settings = [part.strip() for part in head.replace(";;", "\0").split(";")]
+    settings = [part.replace("\0", ";") for part in settings]
+    alone = "alone" in settings
+    refused = [w for s in settings if s.startswith("refused ") for w in s.split()[1:]]
+    shows = [s.split(" ", 2)[1:] for s in settings if s.startswith("shows ")]
+    prelude = "" if alone else (HERE / "prelude.cmd").read_text()
+    if name == "unused-component":  # of which the prelude has one
+        prelude = re.sub(r".*BUF4.*\n", "", prelude)
+    faults = []
+    for kind, commands in ("trips", trips), ("clean", clean):
+        with tempfile.TemporaryDirectory() as temporary:
+            folder = pathlib.Path(temporary)
+            (folder / "prelude.cmd").write_text(prelude)
+            (folder / "case.cmd").write_text(commands + WRITES)
+            files = ["case.cmd"] if alone else ["prelude.cmd", "case.cmd"]
+            found = [text for file, text in check(folder, name, *files)]
+            wanted = finds.splitlines() if kind == "trips" else []
+            if found != wanted:
+                faults.append(f"{kind}: found {found}")
+            run(folder, TOOL, "run", *files)
+            for language, file in ("vhdl", "out.vhd"), ("verilog", "out.v"):
+                accepted, said = accepts(folder, language, prelude + commands)
+                if accepted == (kind == "trips" and language in refused):
+                    faults.append(f"{kind}: {file} is {'taken' if accepted else 'refused'}: {said}")
+                text = (folder / file).read_text()
+                hits = [bool(re.search(e, text)) for where, e in shows if where == language]
+                if kind == "trips" and not all(hits) or kind == "clean" and hits and all(hits):
+                    faults.append(f"{kind}: {file} shows {hits}:\n{text}")
+    return [f"{name}: {fault}\n{trips}" for fault in faults]
+
+
+def folds():
+    """Values of all lengths, in each statement: found are those that the written text breaks."""
+    owners = {"MODULE": "", "COMPONENT": "BUF ", "INSTANCE": "keep ", "SIGNAL": "x "}
+    commands = (HERE / "prelude.cmd").read_text()
+    for owner, word in owners.items():
+        for length in range(30, 90):
+            name = f"{owner[0]}{length}"
+            option = "-SYNATTR=ASSIGN" if owner == "SIGNAL" else "-GENERIC=" + "NOSYN SYN".split()[length % 2]
+            commands += f'ADD {owner} ATTRIBUTE {word}{name} "{("ab " * 30)[:length - 1]}x"\n'
+            commands += f"SET {owner} ATTRIBUTE OPTION {word}{name} {option}\n"
+    with tempfile.TemporaryDirectory() as temporary:
+        folder = pathlib.Path(temporary)
+        (folder / "case.cmd").write_text(commands + WRITES)
+        found = {re.match(r'attribute "(\w+)"', one["message"])[1]
+                 for one in findings(folder, "--only", "folded-value", "case.cmd")}
+        run(folder, TOOL, "run", "case.cmd")
+        lines = (folder / "out.vhd").read_text().splitlines() + (folder / "out.v").read_text().splitlines()
+        broken, name = set(), ""
+        for line in lines:
+            name = (re.findall(r"\b[MCIS]\d\d\b", line) or [name])[0]
+            if line.count('"') % 2 == 1:
+                broken.add(name)
+    return [f"folds: {sorted(found ^ broken)}"] if found != broken or not broken else []
+
+
+def main():
+    missing = [tool for tool in ("ghdl", "iverilog", "verilator") if not shutil.which(tool)]
+    if missing:
+        print("not installed:", *missing)
+        return 77
+    cases = [case for file in sorted(HERE.glob("*.cases"))
+             for case in file.read_text().split("### ")[1:]]
+    faults = folds()
+    listed = run(HERE, TOOL, "check", "--list", "--markdown").stdout
+    if listed != PAGE.read_text():
+        faults.append("docs/checks.md: not what `vesk-hdl check --list --markdown` prints")
+    tried = {re.split(r"[;\n]", case)[0] for case in cases}
+    faults += [f"{name}: no case" for name in re.findall(r"^\| `([\w-]+)`", listed, re.M)
+               if name not in tried]
+    with concurrent.futures.ThreadPoolExecutor(2) as pool:
+        for found in pool.map(judge, cases):
+            faults += found
+    print(*faults, f"{len(cases)} cases, {len(faults)} faults", sep="\n")
+    return 1 if faults else 0
+
+
+sys.exit(main())

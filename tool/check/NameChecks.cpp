@@ -227,8 +227,25 @@ public:
     }
 
 private:
+    /// How a name is spelled in Verilog, for which names have to be alike in case to clash.
+    std::string InVerilog(Object const &object) const {
+        VerilogOption const &verilog = design.options.verilogOption;
+        VerilogOption::CaseType nameCase = VerilogOption::CASE_DEFAULT;
+        if (object.GetObjectType() == Object::OBJECT_SIGNAL)
+            nameCase = verilog.signalCase;
+        else if (object.GetObjectType() == Object::OBJECT_INSTANCE)
+            nameCase = verilog.instanceCase;
+        else if (object.GetObjectType() == Object::OBJECT_COMPONENT)
+            nameCase = verilog.componentCase;
+        return Cased(BaseOf(object), nameCase);
+    }
+
+    Languages Clash(Object const &left, Object const &right) const {
+        return InVerilog(left) == InVerilog(right) ? BOTH : VHDL;
+    }
+
     void AddClash(Id id, std::string const &what, Object const &found, Object const &other,
-                  Languages languages = BOTH) {
+                  Languages languages) {
         Spot const spot = design.MadeAt(&found);
         design.findings.Add({id,
                              spot.line > 0 ? spot : design.MadeAt(&other),
@@ -241,12 +258,13 @@ private:
     void CheckBus(Bus const &bus) {
         std::string const base(BaseOf(bus));
         if (Signal const *const scalar = design.netlist.GetSignal(base.c_str()))
-            AddClash(Id::NET_BESIDE_BUS, "net", *scalar, bus);
+            AddClash(Id::NET_BESIDE_BUS, "net", *scalar, bus, Clash(*scalar, bus));
         if (Instance const *const instance = design.netlist.GetInstance(base.c_str()))
-            AddClash(Id::INSTANCE_NAMED_LIKE_BUS, "instance", *instance, bus);
+            AddClash(Id::INSTANCE_NAMED_LIKE_BUS, "instance", *instance, bus,
+                     Clash(*instance, bus));
         Component const *const component = design.netlist.GetComponent(base.c_str());
         if (component && design.IsUsed(component))
-            AddClash(Id::COMPONENT_NAMED_LIKE_BUS, "component", *component, bus);
+            AddClash(Id::COMPONENT_NAMED_LIKE_BUS, "component", *component, bus, VHDL);
         ForEach(bus.GetBusSliceIterator(), [&](Signal const *part) { CheckCase(*part, bus); });
     }
 
@@ -271,10 +289,8 @@ private:
         Component const *const component = design.netlist.GetComponent(name);
         if (!component || !design.IsUsed(component))
             return;
-        bool const alike = Cased(component->GetNameRef().View(),
-                                 design.options.verilogOption.componentCase) == name.GetText();
         AddClash(Id::NETLIST_NAMED_LIKE_COMPONENT, "design", design.netlist, *component,
-                 alike ? BOTH : VHDL);
+                 Clash(design.netlist, *component));
     }
 
     void CheckAttribute(AttributeUse const &use) {
@@ -298,7 +314,8 @@ private:
         }
         if (other)
             AddClash(Id::ATTRIBUTE_NAMED_LIKE_NET, "attribute", *use.attribute, *other,
-                     use.generic && use.kind == AttributeUse::MODULE ? BOTH : VHDL);
+                     use.generic && use.kind == AttributeUse::MODULE ? Clash(*use.attribute, *other)
+                                                                     : VHDL);
     }
 
     void CheckDummy(Signal const &signal, Design::Dummy const &dummy) {
@@ -314,11 +331,13 @@ private:
             taken = design.netlist.GetInstance(base.c_str());
         if (!taken)
             return;
+        bool const alike =
+            Cased(base, design.options.verilogOption.signalCase) == InVerilog(*taken);
         design.findings.Add({itself ? Id::DUMMY_OF_DUMMY : Id::DUMMY_NAME_TAKEN,
                              design.MadeAt(&signal),
                              NetName(signal),
                              {{itself ? dummy.demand : taken, "the other one is here"}},
-                             BOTH,
+                             itself || alike ? BOTH : VHDL,
                              Quote(dummyName.View())});
     }
 

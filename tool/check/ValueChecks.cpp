@@ -281,32 +281,47 @@ private:
         if (!use.generic)
             return FoldsInAttribute(use, value.View());
         bool const isMap = use.kind == AttributeUse::INSTANCE;
+        Position const position(use);
         Fold fold(use.kind == AttributeUse::COMPONENT ? 2 : 1);
         // A clause begins with its word, later items with blanks in place of it.
-        if (IsFirstGeneric(use))
+        if (position.isFirst)
             fold.Put(isMap ? "generic map" : "generic").Put("( ");
         else
             fold.Put("         ");
         fold.Put(name).Put(isMap ? " => " : " : ");
         if (!isMap)
             fold.Put("string").Put(" :=  ");
-        fold.Put("\"").Put(value.View(), true).Put("\"").Put(")").Put(isMap ? "" : ";");
+        fold.Put("\"").Put(value.View(), true).Put("\"");
+        // What ends the clause or parts its items; translate marks have lines of their own.
+        if (!position.isLastOfKind)
+            fold.Put(",");
+        else if (!position.isMixed)
+            fold.Put(")").Put(isMap ? "" : ";");
         return fold.IsBroken() ? VHDL : NO_LANGUAGE;
     }
 
-    /// Generics of option SYN come first.
-    static bool IsFirstGeneric(AttributeUse const &use) {
-        Attribute const *first = nullptr;
-        ForEach(dynamic_cast<AttributeHolder const &>(*use.owner).GetAttrIterator(),
-                [&first](Attribute const *attribute) {
-                    bool const better = attribute->IsGenericSyn()
-                                            ? !first || !first->IsGenericSyn()
-                                            : attribute->IsGenericNoSyn() && !first;
-                    if (better)
-                        first = attribute;
-                });
-        return first == use.attribute;
-    }
+    /// Where a generic stands in its clause, which lists those of option SYN first.
+    struct Position {
+        bool isFirst = true;
+        bool isLastOfKind = true;
+        bool isMixed = false;
+
+        explicit Position(AttributeUse const &use) {
+            bool const isSyn = use.attribute->IsGenericSyn();
+            bool before = true;
+            ForEach(dynamic_cast<AttributeHolder const &>(*use.owner).GetAttrIterator(),
+                    [&](Attribute const *other) {
+                        bool const otherIsSyn = other->IsGenericSyn();
+                        if (other == use.attribute) {
+                            before = false;
+                        } else if (otherIsSyn || other->IsGenericNoSyn()) {
+                            isMixed |= otherIsSyn != isSyn;
+                            isFirst &= otherIsSyn == isSyn ? !before : isSyn;
+                            isLastOfKind &= otherIsSyn != isSyn || before;
+                        }
+                    });
+        }
+    };
 
     static Languages FoldsInAttribute(AttributeUse const &use, std::string_view value) {
         std::string_view const objectClass = use.kind == AttributeUse::SIGNAL     ? "signal"

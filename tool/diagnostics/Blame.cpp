@@ -327,7 +327,7 @@ void Refusal::BlameName() {
     FindName(name, kind);
     if (message.compare(close, std::string::npos, "\" not found.") == 0)
         HintForMissing(kind, name);
-    else if (message.find("already") != std::string::npos)
+    else if (kind == "identifier" || kind == "signal")
         HintForTaken(name);
 }
 

@@ -70,7 +70,7 @@ def vectors(inputs):
     widths = [width for _, width in inputs]
     clock, reset = ([name for name, _ in inputs].index(name) if (name, 1) in inputs else None
                     for name in ("clk", "rst"))
-    if clock is None and sum(widths) <= 13:
+    if clock is None and 10 <= sum(widths) <= 13:
         return ["".join(bits) for bits in itertools.product("01", repeat=sum(widths))]
     source = random.Random(1)
     rows = []
@@ -92,7 +92,8 @@ def main():
     ports = {"input": [], "output": []}
     maps = {"verilog_map": [], "vhdl_map": []}
     for name, left, right, way in re.findall(
-            r"^ADD PORT (\w+)(?:\((\d+):(\d+)\))? (input|output)$", text, re.M):
+            r"^ADD PORT (\w+)(?:[\[({<](\d+)[:-](\d+)[\])}>])? (input|output)$", text, re.M | re.I):
+        way = way.lower()
         wire, first = way[0], sum(width for _, width in ports[way])
         width = abs(int(left) - int(right)) + 1 if left else 1
         last = first + width - 1

@@ -22,13 +22,7 @@ module FA (input A, input B, input CI, output S, output CO);
     assign CO = (A & B) | (A & CI) | (B & CI);
 endmodule
 
-module ADD2 (input [1:0] A, input [1:0] B, input CI, output [1:0] S, output CO);
-    wire C;
-    FA low (.A(A[0]), .B(B[0]), .CI(CI), .S(S[0]), .CO(C));
-    FA high (.A(A[1]), .B(B[1]), .CI(C), .S(S[1]), .CO(CO));
-endmodule
-
-module MUX2X4 (input [3:0] A, input [3:0] B, input S, output [3:0] Y);
+module MUX2X4 (input [3:0] A, input [3:0] B, input S, output [0:3] Y);
     assign Y = S ? B : A;
 endmodule
 
@@ -43,14 +37,8 @@ module DFF (input C, input R, input E, input D, output reg Q, output QN);
     assign QN = ~Q;
 endmodule
 
-module REG8 (input C, input R, input E, input [7:0] D, output reg [7:0] Q);
+module REG8 (input C, input R, input E, input [0:7] D, output reg [7:0] Q);
     always @(posedge C)
         if (R) Q <= 8'b0;
-        else if (E) Q <= D;
-endmodule
-
-module REG16 (input C, input R, input E, input [15:0] D, output reg [15:0] Q);
-    always @(posedge C)
-        if (R) Q <= 16'b0;
         else if (E) Q <= D;
 endmodule

@@ -71,30 +71,11 @@ configuration CFG_FA of FA_CELL is for model end for; end CFG_FA;
 
 library ieee;
 use ieee.std_logic_1164.all;
-entity ADD2_CELL is
-    port (A : in std_logic_vector (1 downto 0);
-          B : in std_logic_vector (1 downto 0);
-          CI : in std_logic;
-          S : out std_logic_vector (1 downto 0);
-          CO : out std_logic);
-end ADD2_CELL;
-architecture model of ADD2_CELL is
-    signal C : std_logic;
-begin
-    C <= (A(0) and B(0)) or (A(0) and CI) or (B(0) and CI);
-    S(0) <= A(0) xor B(0) xor CI;
-    S(1) <= A(1) xor B(1) xor C;
-    CO <= (A(1) and B(1)) or (A(1) and C) or (B(1) and C);
-end model;
-configuration CFG_ADD2 of ADD2_CELL is for model end for; end CFG_ADD2;
-
-library ieee;
-use ieee.std_logic_1164.all;
 entity MUX2X4_CELL is
     port (A : in std_logic_vector (3 downto 0);
           B : in std_logic_vector (3 downto 0);
           S : in std_logic;
-          Y : out std_logic_vector (3 downto 0));
+          Y : out std_logic_vector (0 to 3));
 end MUX2X4_CELL;
 architecture model of MUX2X4_CELL is
 begin
@@ -152,7 +133,7 @@ entity REG8_CELL is
     port (C : in std_logic;
           R : in std_logic;
           E : in std_logic;
-          D : in std_logic_vector (7 downto 0);
+          D : in std_logic_vector (0 to 7);
           Q : out std_logic_vector (7 downto 0));
 end REG8_CELL;
 architecture model of REG8_CELL is
@@ -171,29 +152,3 @@ begin
     end process;
 end model;
 configuration CFG_REG8 of REG8_CELL is for model end for; end CFG_REG8;
-
-library ieee;
-use ieee.std_logic_1164.all;
-entity REG16_CELL is
-    port (C : in std_logic;
-          R : in std_logic;
-          E : in std_logic;
-          D : in std_logic_vector (15 downto 0);
-          Q : out std_logic_vector (15 downto 0));
-end REG16_CELL;
-architecture model of REG16_CELL is
-begin
-    process (C)
-    begin
-        if rising_edge(C) then
-            if R = '1' then
-                Q <= (others => '0');
-            elsif R = '0' and E = '1' then
-                Q <= D;
-            elsif R /= '0' or E /= '0' then
-                Q <= (others => 'X');
-            end if;
-        end if;
-    end process;
-end model;
-configuration CFG_REG16 of REG16_CELL is for model end for; end CFG_REG16;

@@ -118,6 +118,8 @@ std::vector<Row> const ROWS = {
      "assign the whole bus, or connect the pin itself to the bit"},
     {Id::ASSIGNMENT_WIDTH, "assignment-width", BOTH, WARNING,
      "is assigned from a net of another width or kind", "assign slices of equal width"},
+    {Id::SELF_ASSIGNMENT, "self-assignment", BOTH, WARNING, "is assigned from itself",
+     "leave the line out"},
     {Id::OUT_PORT_IN_COMPOUND, "out-port-in-compound", VHDL, WARNING,
      "holds an out port that an input pin reads; only a compound that begins with an out port is "
      "cured of that",

@@ -37,6 +37,8 @@ public:
         }
         if (compound)
             return;
+        if (&target == &source)
+            Add(Id::SELF_ASSIGNMENT, target);
         Signal const *const declared = DeclaredOf(design, target);
         Design::Dummy const *const dummy = design.DummyOf(declared);
         // What was assigned to an in port that is driven as well goes to its dummy.
@@ -101,8 +103,8 @@ private:
         Signal const *const declared = DeclaredOf(design, member);
         Design::Dummy const *const own = design.DummyOf(declared);
         if (dummy) {
-            // The members are treated like the first one.
-            if (polarity == (dummy->portTakesDummy ? Polarity::INPUT : Polarity::OUTPUT))
+            // The members are treated like the first one, unless they had a dummy before.
+            if (own && polarity == (own->portTakesDummy ? Polarity::INPUT : Polarity::OUTPUT))
                 Add(Id::IN_PORT_IN_COMPOUND, member, BOTH);
             return;
         }

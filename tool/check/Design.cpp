@@ -50,6 +50,12 @@ Spot Design::AssignedAt(Signal const &signal) const {
     return spot.line > 0 ? spot : NetAt(signal);
 }
 
+bool Design::IsWritten(Signal const &part) const {
+    bool onPin = false;
+    ForEachPinOn(part, [&onPin](Pin const *) { onPin = true; });
+    return onPin || !FurtherUses(&part).empty() || (part.HasConstantValue() && IsInside(part));
+}
+
 Bus *Design::BusOf(Signal const &part) const { return netlist.GetParentBus(part.GetNameRef()); }
 
 /// A walk over all pins at the first question, which only findings ask.

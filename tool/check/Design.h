@@ -49,6 +49,8 @@ public:
     bool IsInside(Vesk_Hdl::Signal const &signal) const {
         return netlist.GetSignal(signal.GetNameRef()) == &signal;
     }
+    /// Whether a bit or slice stands anywhere in the text.
+    bool IsWritten(Vesk_Hdl::Signal const &part) const;
     /// The bus of a bit or slice, null if there is none.
     Vesk_Hdl::Bus *BusOf(Vesk_Hdl::Signal const &part) const;
     Vesk_Hdl::Instance const *OwnerOf(Vesk_Hdl::Pin const *pin) const;

@@ -274,7 +274,7 @@ private:
         std::string const base = Cased(BaseOf(bus), nameCase);
         std::string const partBase =
             isInside ? Cased(BaseOf(part), nameCase) : std::string(BaseOf(part));
-        if (base == partBase)
+        if (base == partBase || !design.IsWritten(part))
             return;
         Id const id = isInside || nameCase == VerilogOption::CASE_DEFAULT ? Id::BIT_IN_OTHER_CASE
                                                                           : Id::WIDENED_SLICE_CASE;

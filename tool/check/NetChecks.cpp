@@ -87,7 +87,7 @@ private:
         Range bits;
         if (!GetRange(part.GetNameRef(), bits))
             return;
-        if (!whole.Holds(bits))
+        if (!whole.Holds(bits) && design.IsWritten(part))
             design.findings.Add({Id::OUTSIDE_BUS,
                                  design.NetAt(part),
                                  NetName(part),

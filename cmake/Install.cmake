@@ -22,15 +22,15 @@ if(VESK_HDL_BUILD_TOOL)
             DESTINATION ${CMAKE_INSTALL_MANDIR}/man1
             COMPONENT tool)
     endif()
-    install(DIRECTORY ${PROJECT_SOURCE_DIR}/docs/
+    # Beside each other, as in the source tree: the pages lead to the examples.
+    install(DIRECTORY ${PROJECT_SOURCE_DIR}/docs
         DESTINATION ${tool_doc_dir}
         COMPONENT tool
         FILES_MATCHING PATTERN *.md PATTERN *.svg
         PATTERN man EXCLUDE)
     install(DIRECTORY ${PROJECT_SOURCE_DIR}/examples
         DESTINATION ${tool_doc_dir}
-        COMPONENT tool
-        PATTERN client EXCLUDE)
+        COMPONENT tool)
 endif()
 
 install(EXPORT Vesk_HdlTargets

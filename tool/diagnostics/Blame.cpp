@@ -91,6 +91,7 @@ private:
     bool FindName(std::string_view name, std::string_view kind);
     void HintForMissing(std::string_view kind, std::string_view name);
     void HintForTaken(std::string const &name);
+    std::string PinOfThatBase() const;
 
     LineTokens tokens;
     Model const &model;
@@ -259,6 +260,29 @@ bool Refusal::FindName(std::string_view name, std::string_view kind) {
     return false;
 }
 
+/// OWNER.PIN of a pin that differs from the one in the line by its range alone; empty if there is
+/// none.
+std::string Refusal::PinOfThatBase() const {
+    std::string found;
+    for (int token = keywordWords; token < tokens.GetSize(); ++token) {
+        std::string const text(tokens.At(token));
+        std::size_t const point = text.find('.');
+        if (point == std::string::npos)
+            continue;
+        std::string const owner = text.substr(0, point);
+        auto const base = Object::GetBaseName(text.substr(point + 1).c_str());
+        auto const look = [&](Pin const *pin) {
+            if (SameIgnoringCase(pin->GetBaseName().View(), base.View()))
+                found = owner + "." + std::string(pin->GetNameRef().View());
+        };
+        if (Instance const *const instance = model.GetInstance(owner.c_str()))
+            ForEach(instance->GetPinIterator(), look);
+        else if (Component const *const component = model.GetComponent(owner.c_str()))
+            ForEach(component->GetPinIterator(), look);
+    }
+    return found;
+}
+
 /// What would make a name known, for a message that ends in "not found."
 void Refusal::HintForMissing(std::string_view kind, std::string_view name) {
     std::string const text(name);
@@ -281,6 +305,8 @@ void Refusal::HintForMissing(std::string_view kind, std::string_view name) {
         Hint("declare it first with ADD COMPONENT");
     } else if (kind == "attribute") {
         Hint("add it first with ADD ... ATTRIBUTE");
+    } else if (std::string const pin = PinOfThatBase(); kind == "pin" && !pin.empty()) {
+        Hint("the pin is called " + pin);
     } else if (kind == "pin") {
         Hint("declare it with ADD PIN before the instance is made: instances made earlier do not "
              "get it");

@@ -106,8 +106,9 @@ class Circuit:
         while rest:
             signal, place = rest[0]
             count = 1
-            while count < len(rest) and rest[count] == (signal, place + count) and not (
-                    self.chance(.05) and not (drives and (signal.way or signal.dummy))):
+            whole = drives and (signal.way or signal.dummy or signal.grows)
+            while count < len(rest) and rest[count] == (signal, place + count) and (
+                    whole or self.chance(.95)):
                 count += 1
             rest = rest[count:]
             parts.append(signal.part(place, count))
@@ -120,9 +121,9 @@ class Circuit:
             signal.split = bool(signal.indices)
         self.lines.append(("CONNECT SIGNAL", parts, pin))
 
-    def alias(self, target, source, first=False):
+    def alias(self, target, source):
         parts = [[bits[0][0].part(bits[0][1], len(bits))] for bits in (target, source)]
-        (self.first if first else self.lines).append(("CONNECT SIGNAL", *parts))
+        self.lines.append(("CONNECT SIGNAL", *parts))
         self.model.append(f"assign {cat(target)} = {cat(source)};")
 
     def cell(self, kind, **pins):
@@ -327,12 +328,17 @@ class RandomLogic:
         self.ready += sums
         for _ in range(rng.randint(5, 12)):
             self.todo += c.signal(rng.choice((1, 1, 3, 4, 8, 18)), rng.choice((None, "output")))
-        for bits in [c.signal(rng.randint(4, 9)) for _ in range(rng.randrange(3))]:
-            bits[0][0].grows = True
-            self.todo += bits
-            start, count = rng.randrange(2), rng.randint(2, 3)
-            c.alias(c.signal(count, rng.choice((None, "output"))), bits[start:start + count], True)
+        for bits in [c.signal(rng.randint(5, 9)) for _ in range(rng.randrange(3))]:
+            bits[0][0].grows, start = True, rng.randrange(2)
+            if c.chance(.5):
+                c.alias(c.signal(2, rng.choice((None, "output"))), bits[start:start + 2])
+            else:
+                pins = {"A": self.read(4), "B": self.read(4), "S": self.read(1)}
+                c.cell("MUX2X4", **pins, Y=bits[start:start + 4])
+                self.ready += bits[start:start + 4]
+            c.first.append(c.lines.pop())
             c.alias(c.signal(len(bits), "output"), bits)
+            self.todo += [bit for bit in bits if bit not in self.ready]
         registers, clock, comb = [], c.clock() if c.chance(.6) else None, self.todo
         self.todo = [bit for width in rng.choices((1, 1, 4, 10, 20), k=3 if clock else 0)
                      for bit in c.signal(width, rng.choice((None, "output")))]

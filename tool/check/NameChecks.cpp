@@ -175,11 +175,9 @@ private:
                 newer == BOTH   ? "VHDL-2008 and SystemVerilog"
                 : newer == VHDL ? "VHDL-2008"
                                 : "SystemVerilog");
-        // Labels are declared behind all that needs a type.
-        bool const hides =
-            name.what != "instance" && (vhdl == "std_logic" || vhdl == "std_logic_vector" ||
-                                        (usedTypes.count(vhdl) > 0 && name.what != "pin"));
-        if (hides)
+        bool const isOuter = name.what == "port" || name.what == "design";
+        if ((name.what == "pin" ? pinTypes : innerTypes).count(vhdl) > 0 ||
+            (isOuter && outerTypes.count(vhdl) > 0))
             Add(Id::STANDARD_NAME, name, VHDL);
     }
 
@@ -333,6 +331,10 @@ private:
             Component const *const component = design.netlist.GetComponent(name.c_str());
             if (!other && component && design.IsUsed(component))
                 other = component;
+            Attribute const *const generic = design.netlist.GetAttr(name.c_str());
+            if (!other && generic != use.attribute && generic &&
+                (generic->IsGenericSyn() || generic->IsGenericNoSyn()))
+                other = generic;
         }
         if (other)
             AddClash(Id::ATTRIBUTE_NAMED_LIKE_NET, "attribute", *use.attribute, *other,

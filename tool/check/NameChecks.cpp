@@ -175,7 +175,8 @@ private:
                 newer == BOTH   ? "VHDL-2008 and SystemVerilog"
                 : newer == VHDL ? "VHDL-2008"
                                 : "SystemVerilog");
-        bool const isOuter = name.what == "port" || name.what == "design";
+        bool const isOuter =
+            name.what == "port" || name.what == "design" || name.what == "attribute";
         if ((name.what == "pin" ? pinTypes : innerTypes).count(vhdl) > 0 ||
             (isOuter && outerTypes.count(vhdl) > 0))
             Add(Id::STANDARD_NAME, name, VHDL);

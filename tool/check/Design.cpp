@@ -8,6 +8,8 @@ namespace {
 
 constexpr std::string_view CONSTANT_TAG = "_CONST_SIGNAL";
 
+constexpr int IN_PORT_STAGE = 2;
+
 bool IsTieOfPin(std::string_view base) {
     return base.size() >= CONSTANT_TAG.size() &&
            base.substr(base.size() - CONSTANT_TAG.size()) == CONSTANT_TAG;
@@ -115,24 +117,24 @@ void Design::FindUses() {
 /// The three stages of the rewriting: out ports that are read, in ports that are driven, out ports
 /// with several drivers. A name that one stage took is out of the later ones.
 void Design::FindDummies() {
-    auto const stage = [this](Polarity::Value port, Polarity::Value use) {
+    auto const feedBack = [this](int stage, Polarity::Value port, Polarity::Value use) {
         ForEachPin([&](Instance const &, Pin const &pin) {
             Polarity const polarity = pin.GetPolarity();
             if (pin.GetSignal() && (polarity == use || polarity == Polarity::BIDIRECTIONAL) &&
                 pin.GetSignal()->GetPortPolarity() == port)
-                DemandDummy(pin.GetSignal(), port == Polarity::OUTPUT);
+                DemandDummy(pin.GetSignal(), stage);
         });
     };
-    stage(Polarity::OUTPUT, Polarity::INPUT);
-    stage(Polarity::INPUT, Polarity::OUTPUT);
+    feedBack(1, Polarity::OUTPUT, Polarity::INPUT);
+    feedBack(IN_PORT_STAGE, Polarity::INPUT, Polarity::OUTPUT);
     ForEachSignal([this](Signal const *signal) {
         if (signal->GetPortPolarity() == Polarity::OUTPUT && signal->HasMultiDriver())
-            DemandDummy(signal, true);
+            DemandDummy(signal, 3);
     });
 }
 
-void Design::DemandDummy(Signal const *signal, bool portTakesDummy) {
-    Dummy const dummy = {portTakesDummy, signal};
+void Design::DemandDummy(Signal const *signal, int stage) {
+    Dummy const dummy = {stage != IN_PORT_STAGE, signal, stage, nullptr};
     NeedDummy(signal, dummy);
     if (auto const *const compound = dynamic_cast<CompoundBus const *>(signal))
         for (int i = 0; i < compound->GetSize(); ++i)
@@ -144,8 +146,11 @@ void Design::NeedDummy(Signal const *signal, Dummy const &dummy) {
     Signal::SignalType const type = signal->GetSignalType();
     if (type == Signal::SIGNAL_BUS_SLICE || type == Signal::SIGNAL_BUS_INDEX)
         signal = BusOf(*signal);
-    if (signal)
-        dummies.try_emplace(signal, dummy);
+    if (!signal)
+        return;
+    auto const [found, isNew] = dummies.try_emplace(signal, dummy);
+    if (!isNew && type == Signal::SIGNAL_SCALAR && found->second.stage < dummy.stage)
+        found->second.again = dummy.demand;
 }
 
 } // namespace Checks

@@ -29,6 +29,9 @@ public:
     struct Dummy {
         bool portTakesDummy;            ///< the port is assigned from the dummy; else the reverse
         Vesk_Hdl::Signal const *demand; ///< on whose pins that was found
+        int stage;                      ///< of the rewriting
+        /// A later stage meets the dummy, which stands in a compound by then, and gives it one.
+        Vesk_Hdl::Signal const *again;
     };
 
     Design(Vesk_Hdl::Model &model, Places const &madePlaces, Recorder const &history,
@@ -98,7 +101,7 @@ public:
 private:
     void FindUses();
     void FindDummies();
-    void DemandDummy(Vesk_Hdl::Signal const *signal, bool portTakesDummy);
+    void DemandDummy(Vesk_Hdl::Signal const *signal, int stage);
     void NeedDummy(Vesk_Hdl::Signal const *signal, Dummy const &dummy);
 
     std::unordered_map<Vesk_Hdl::Signal const *, std::vector<Use>> furtherUses;

@@ -93,14 +93,7 @@ Languages Of(bool vhdl, bool verilog) {
 
 class NameChecker {
 public:
-    explicit NameChecker(Design const &checked) : design(checked) {
-        ForEachAttribute(design, [this](AttributeUse const &use) {
-            if (use.generic || design.options.vhdlOption.useAttrType)
-                usedTypes.insert(VhdlTypeOf(*use.attribute));
-            else
-                usedTypes.insert("string");
-        });
-    }
+    explicit NameChecker(Design const &checked) : design(checked) { FindUsedTypes(); }
 
     void Run() {
         VerilogOption const &verilog = design.options.verilogOption;
@@ -123,6 +116,30 @@ public:
     }
 
 private:
+    /// The types that declarations of the entity and of the architecture name.
+    void FindUsedTypes() {
+        ForEachAttribute(design, [this](AttributeUse const &use) {
+            bool const isOuter = use.kind == AttributeUse::MODULE ||
+                                 (use.kind == AttributeUse::SIGNAL &&
+                                  static_cast<Signal const *>(use.owner)->IsPort());
+            bool const isTyped = use.generic || design.options.vhdlOption.useAttrType;
+            (isOuter ? outerTypes : innerTypes)
+                .insert(isTyped ? VhdlTypeOf(*use.attribute) : "string");
+        });
+        pinTypes.insert("std_logic");
+        bool hasVectors = false;
+        design.ForEachSignal([&](Signal const *signal) {
+            hasVectors |= signal->GetSignalType() == Signal::SIGNAL_BUS;
+        });
+        design.ForEachUsedComponent([&](Component const *component) {
+            ForEach(component->GetPinIterator(),
+                    [&](Pin const *pin) { hasVectors |= pin->GetPinType() == Pin::PIN_BUS; });
+        });
+        if (hasVectors)
+            pinTypes.insert("std_logic_vector");
+        innerTypes.insert(pinTypes.begin(), pinTypes.end());
+    }
+
     void Add(Id id, WrittenName const &name, Languages languages, std::string detail = {}) {
         Finding finding{id, design.MadeAt(name.object), name.Subject()};
         finding.languages = languages & name.languages;
@@ -158,8 +175,10 @@ private:
                 newer == BOTH   ? "VHDL-2008 and SystemVerilog"
                 : newer == VHDL ? "VHDL-2008"
                                 : "SystemVerilog");
-        if (vhdl == "std_logic" || vhdl == "std_logic_vector" ||
-            (usedTypes.count(vhdl) > 0 && name.what != "pin"))
+        bool const isOuter =
+            name.what == "port" || name.what == "design" || name.what == "attribute";
+        if ((name.what == "pin" ? pinTypes : innerTypes).count(vhdl) > 0 ||
+            (isOuter && outerTypes.count(vhdl) > 0))
             Add(Id::STANDARD_NAME, name, VHDL);
     }
 
@@ -207,7 +226,9 @@ private:
     }
 
     Design const &design;
-    std::unordered_set<std::string> usedTypes;
+    std::unordered_set<std::string> pinTypes;
+    std::unordered_set<std::string> innerTypes; ///< of the architecture
+    std::unordered_set<std::string> outerTypes; ///< of the entity
 };
 
 /// Names that meet although the library took both.
@@ -311,17 +332,30 @@ private:
             Component const *const component = design.netlist.GetComponent(name.c_str());
             if (!other && component && design.IsUsed(component))
                 other = component;
+            Attribute const *const generic = design.netlist.GetAttr(name.c_str());
+            if (!other && generic != use.attribute && generic &&
+                (generic->IsGenericSyn() || generic->IsGenericNoSyn()))
+                other = generic;
         }
         if (other)
             AddClash(Id::ATTRIBUTE_NAMED_LIKE_NET, "attribute", *use.attribute, *other,
-                     use.generic && use.kind == AttributeUse::MODULE ? Clash(*use.attribute, *other)
-                                                                     : VHDL);
+                     use.generic && use.kind == AttributeUse::MODULE &&
+                             other->GetObjectType() != Object::OBJECT_COMPONENT
+                         ? Clash(*use.attribute, *other)
+                         : VHDL);
     }
 
     void CheckDummy(Signal const &signal, Design::Dummy const &dummy) {
         if (signal.GetSignalType() == Signal::SIGNAL_COMPOUND_BUS)
             return;
         Text const dummyName = signal.GetDummySignalName();
+        if (dummy.again)
+            return design.findings.Add({Id::DUMMY_OF_DUMMY,
+                                        design.MadeAt(&signal),
+                                        NetName(signal),
+                                        {{dummy.again, "it is a member of this compound"}},
+                                        BOTH,
+                                        Quote(dummyName.View())});
         std::string const base(BaseOf(dummyName.View()));
         bool const itself = SameFolded(base, BaseOf(signal));
         Object const *taken = design.netlist.GetSignal(base.c_str());

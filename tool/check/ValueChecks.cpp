@@ -1,8 +1,6 @@
 // Constants of nets and pins, attributes, and their values as they are going to be written.
 
-#include <cstring>
 #include <unordered_map>
-#include <unordered_set>
 
 #include "tool/check/Attributes.h"
 #include "tool/check/Design.h"
@@ -160,7 +158,7 @@ public:
         ForEachAttribute(design, [this](AttributeUse const &use) {
             if (!use.generic && use.attribute->IsSynDeclared())
                 (IsPort(use) ? declaredByPorts : declared)
-                    .insert(Folded(use.attribute->GetNameRef().View()));
+                    .try_emplace(Folded(use.attribute->GetNameRef().View()), use.attribute);
         });
     }
 
@@ -195,11 +193,19 @@ private:
     /// The packages of the user may declare what nobody here does.
     void CheckDeclared(AttributeUse const &use) {
         std::string const name = Folded(use.attribute->GetNameRef().View());
-        bool const isDeclared =
-            declaredByPorts.count(name) > 0 || (!IsPort(use) && declared.count(name) > 0);
+        auto const findIn = [&name](auto const &map) {
+            auto const found = map.find(name);
+            return found == map.end() ? nullptr : found->second;
+        };
+        Attribute const *declaration = findIn(declaredByPorts);
+        if (!declaration && !IsPort(use))
+            declaration = findIn(declared);
+        if (declaration && useAttrType && VhdlTypeOf(*declaration) != VhdlTypeOf(*use.attribute))
+            Add(Id::ATTRIBUTE_TYPE, use, VHDL,
+                VhdlTypeOf(*use.attribute) + " for " + VhdlTypeOf(*declaration));
         bool const isLeftOut =
             use.kind == AttributeUse::COMPONENT && design.options.vhdlOption.suppressComponent;
-        if (!isDeclared && !isLeftOut && design.options.vhdlOption.useLibraries.IsEmpty())
+        if (!declaration && !isLeftOut && design.options.vhdlOption.useLibraries.IsEmpty())
             Add(Id::UNDECLARED_ATTRIBUTE, use, VHDL);
     }
 
@@ -397,8 +403,8 @@ private:
 
     Design const &design;
     bool useAttrType;
-    std::unordered_set<std::string> declared;
-    std::unordered_set<std::string> declaredByPorts;
+    std::unordered_map<std::string, Attribute const *> declared; ///< by name, the first
+    std::unordered_map<std::string, Attribute const *> declaredByPorts;
 };
 
 /// In a macro the INIT of an instance is handed on, and one of option NOSYN is written as well.

@@ -3,6 +3,7 @@
 #include <csignal>
 #include <cstdio>
 #include <exception>
+#include <iostream>
 #include <new>
 #include <string>
 
@@ -16,6 +17,14 @@
 #include "vesk_hdl/Vesk_Hdl.h"
 
 namespace {
+
+/// Standard output may be a file on a full disk.
+int ToldAll(int exitCode) {
+    if (std::cout.flush())
+        return exitCode;
+    std::cerr << "vesk-hdl: error: cannot write to standard output\n";
+    return SOMETHING_REFUSED;
+}
 
 int ParseAndRun(int argc, char **argv) {
     CLI::App app("Turns files of design-entry commands into structural VHDL and Verilog.",
@@ -34,9 +43,9 @@ int ParseAndRun(int argc, char **argv) {
     try {
         app.parse(argc, argv);
     } catch (CLI::ParseError const &error) {
-        return app.exit(error) == 0 ? ALL_WELL : USAGE_ERROR;
+        return app.exit(error) == 0 ? ToldAll(ALL_WELL) : USAGE_ERROR;
     }
-    return action();
+    return ToldAll(action());
 }
 
 } // namespace

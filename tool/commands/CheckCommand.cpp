@@ -181,7 +181,7 @@ private:
     Checks::Languages requested = Checks::NO_LANGUAGE;
     Checks::Languages written = Checks::NO_LANGUAGE;
     Checks::Languages lastWritten = Checks::NO_LANGUAGE; ///< and not yet rewritten for it
-    bool changed = true;                                 ///< since the last line that wrote
+    bool changed = false;                                ///< since the last line that wrote
     bool failed = false;
 };
 

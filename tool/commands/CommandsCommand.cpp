@@ -31,7 +31,7 @@ std::map<std::string, char const *> const &Glossary() {
         {"library", "the name of a library, or of what is used of it"},
         {"name", "a word; in quotes if it holds blanks"},
         {"option", "-NOHEADER, -APPEND or -OVERWRITE"},
-        {"pin", "the name of a pin: I0, or D(7:0) for eight bits, or D(3) for one of them"},
+        {"pin", "the name of a pin: I0, or D(7:0) for eight bits"},
         {"polarity", "Input, Output or BiDirectional, or any beginning of one, in any case"},
         {"setting", "-GENERIC=NONE, SYN or NOSYN; -SYNATTR=NONE, ASSIGN or ASSIGNNODEC"},
         {"signal", "NET, BUS(7:0), a part of a bus such as BUS(3) and BUS(6:4), or A,BUS(1:0),B"},

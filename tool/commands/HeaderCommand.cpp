@@ -24,9 +24,9 @@ int WriteHeader(HeaderOptions const &options) {
     TextFileOutStream stream(toStandardOutput ? nullptr : options.file.c_str(), false);
     if (toStandardOutput)
         stream.Adopt(::dup(STDOUT_FILENO));
-    NetlistHeader(options.application.c_str(), toStandardOutput ? "" : options.file.c_str(),
-                  options.command.c_str(), options.design.c_str(), options.device.c_str(),
-                  options.purpose.c_str(), options.reference.c_str(), !options.verilog, stream)
+    NetlistHeader(options.application.c_str(), options.file.c_str(), options.command.c_str(),
+                  options.design.c_str(), options.device.c_str(), options.purpose.c_str(),
+                  options.reference.c_str(), !options.verilog, stream)
         .Write();
     stream.Close();
     if (stream.GetError() == 0)

@@ -53,6 +53,26 @@ unsigned long long SizeOf(std::vector<std::string> const &files) {
     return total;
 }
 
+/// The file of --vhdl or --verilog is neither an input nor the other one.
+void RefuseToOverwrite(RunOptions const &options) {
+    auto const same = [](std::string const &left, std::string const &right) {
+        std::error_code error;
+        return fs::equivalent(left, right, error) ||
+               fs::absolute(left).lexically_normal() == fs::absolute(right).lexically_normal();
+    };
+    for (std::string const &output : {options.vhdlFile, options.verilogFile}) {
+        if (output.empty() || output == STANDARD_STREAM || fs::is_character_file(output))
+            continue;
+        for (std::string const &input : options.files)
+            if (input != STANDARD_STREAM && same(output, input))
+                throw CLI::ValidationError(output, "is an input, too");
+    }
+    if (!options.vhdlFile.empty() && options.vhdlFile != STANDARD_STREAM &&
+        !options.verilogFile.empty() && !fs::is_character_file(options.vhdlFile) &&
+        same(options.vhdlFile, options.verilogFile))
+        throw CLI::ValidationError(options.verilogFile, "is to hold the VHDL, too");
+}
+
 /// One run, from the first line to the last file.
 class Runner {
 public:
@@ -216,13 +236,16 @@ void AddRunCommand(CLI::App &app, Action &action) {
     run.add_flag("--keep-going", options->keepGoing,
                  "Go on after a refused line; the exit code still tells of it");
     run.add_flag("--stats", options->stats, "Tell the size of the design, time and memory");
-    run.add_flag("--quiet", options->quiet, "Errors a line each and nothing else");
+    run.add_flag("--quiet", options->quiet, "Errors a line each, without hints, and no bar");
     run.add_option("--progress", options->progress,
                    "A bar on standard error; 'auto' means on a terminal, when the work lasts")
         ->check(CLI::IsMember({"auto", "always", "never"}))
         ->capture_default_str();
     AddReportOptions(run, options->report);
-    run.callback([options, &action] { action = [options] { return Runner(*options).Run(); }; });
+    run.callback([options, &action] {
+        RefuseToOverwrite(*options);
+        action = [options] { return Runner(*options).Run(); };
+    });
 }
 
 int RunStandardInput(std::string const &modelName, std::string const &outputDir) {

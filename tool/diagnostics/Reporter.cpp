@@ -103,7 +103,15 @@ std::string JsonString(std::string_view text) {
     return json + '"';
 }
 
-Reporter::Reporter(std::ostream &output, ReportStyle style) : stream(output), reportStyle(style) {}
+Reporter::Reporter(std::ostream &destination, ReportStyle style)
+    : output(destination), reportStyle(style) {}
+
+/// In one piece: standard error is not buffered, and others may write to it.
+void Reporter::Show() {
+    output << stream.str();
+    output.flush();
+    stream.str("");
+}
 
 void Reporter::Report(Diagnostic const &diagnostic) {
     ++(diagnostic.severity == Severity::ERROR ? errors : warnings);
@@ -111,7 +119,7 @@ void Reporter::Report(Diagnostic const &diagnostic) {
         ReportJson(diagnostic);
     else
         ReportText(diagnostic);
-    stream.flush();
+    Show();
 }
 
 void Reporter::ReportText(Diagnostic const &diagnostic) {
@@ -213,5 +221,6 @@ void Reporter::ReportCount() {
         if (warnings > 0)
             stream << ", " << warnings << " warning" << plural(warnings);
     }
-    stream << std::endl;
+    stream << '\n';
+    Show();
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <iosfwd>
+#include <sstream>
 #include <string>
 #include <string_view>
 
@@ -20,7 +21,7 @@ struct ReportStyle {
 class Reporter {
 public:
     /// The stream is not owned.
-    Reporter(std::ostream &output, ReportStyle style);
+    Reporter(std::ostream &destination, ReportStyle style);
 
     void Report(Diagnostic const &diagnostic);
     /// How many there were, on a line of its own.
@@ -33,7 +34,10 @@ private:
     void ReportSource(Diagnostic const &diagnostic, char const *colour, char const *plain);
     void ReportJson(Diagnostic const &diagnostic);
 
-    std::ostream &stream;
+    void Show();
+
+    std::ostream &output;
+    std::ostringstream stream; ///< what is being put together
     ReportStyle reportStyle;
     unsigned long errors = 0;
     unsigned long warnings = 0;

@@ -44,7 +44,6 @@ public:
     /// False with errno set if a component cannot be entered. On success `rest` is the last
     /// component, not looked at yet.
     bool ToFolderOf(std::string const &path) {
-        folders.clear();
         Push(path);
         return Root() && Enter();
     }
@@ -125,8 +124,11 @@ private:
                     folders.pop_back();
             } else if (!Step(name.c_str())) {
                 // A link is no folder (ENOTDIR) until it is followed.
-                if ((errno != ENOTDIR && errno != ELOOP) || !Follow(name))
+                int const error = errno;
+                if ((error != ENOTDIR && error != ELOOP) || !Follow(name)) {
+                    errno = errno == EINVAL ? error : errno; // no link either
                     return false;
+                }
             }
         }
         last = toGo.empty() ? "." : toGo.front();
@@ -153,8 +155,8 @@ Confinement::Confinement(std::string const &folder) : device(0), inode(0) {
 }
 
 int Confinement::Open(std::string const &name, bool append) const {
-    if (name.empty()) {
-        errno = ENOENT;
+    if (name.empty() || name.back() == '/') {
+        errno = name.empty() ? ENOENT : EISDIR;
         return -1;
     }
     std::error_code error;
@@ -171,7 +173,10 @@ int Confinement::Open(std::string const &name, bool append) const {
             errno = EXDEV;
             return -1;
         }
-        int const opened = walk.OpenLast(append);
+        int opened = -1;
+        do
+            opened = walk.OpenLast(append);
+        while (opened < 0 && errno == EINTR);
         if (opened >= 0 || errno != ELOOP)
             return opened;
         if (!walk.FollowLast())

@@ -1,9 +1,12 @@
 #include "tool/shell/LineEditor.h"
 
+#include <clocale>
 #include <cstdio>
 #include <fcntl.h>
 #include <histedit.h>
 #include <unistd.h>
+
+#include "tool/diagnostics/Format.h"
 
 namespace {
 
@@ -21,7 +24,7 @@ void List(std::vector<std::string> const &candidates) {
             std::fputc('\n', stdout);
             column = 0;
         }
-        std::fprintf(stdout, "%-*s", static_cast<int>(width), each.c_str());
+        std::fprintf(stdout, "%-*s", static_cast<int>(width), Harmless(each).c_str());
         column += width;
     }
     std::fputc('\n', stdout);
@@ -41,6 +44,18 @@ struct LineEditor::Record {
         void *record = nullptr;
         el_get(editor, EL_CLIENTDATA, &record);
         return *static_cast<Record *>(record);
+    }
+
+    void SaveHistory() const {
+        HistEvent event;
+        if (historyFile.empty())
+            return;
+        // Nobody else is to read it, so it is made before it is written.
+        int const made = ::open(historyFile.c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600);
+        if (made < 0)
+            return;
+        ::close(made);
+        ::history(history, &event, H_SAVE, historyFile.c_str());
     }
 
     static char *Prompt(EditLine *editor) { return Of(editor).prompt.data(); }
@@ -82,6 +97,7 @@ struct LineEditor::Record {
 LineEditor::LineEditor(std::string const &prompt, std::string const &historyFile,
                        Completer completer)
     : record(std::make_unique<Record>()) {
+    std::setlocale(LC_CTYPE, ""); // letters beyond ASCII; the library does not look at it
     record->prompt = prompt;
     record->historyFile = historyFile;
     record->completer = std::move(completer);
@@ -95,6 +111,7 @@ LineEditor::LineEditor(std::string const &prompt, std::string const &historyFile
     record->editor = el_init("vesk-hdl", stdin, stdout, stderr);
     EditLine *const editor = record->editor;
     el_set(editor, EL_CLIENTDATA, record.get());
+    el_set(editor, EL_SIGNAL, 1); // the terminal is put back before a signal ends or stops us
     el_set(editor, EL_PROMPT, Record::Prompt);
     el_set(editor, EL_EDITOR, "emacs");
     el_set(editor, EL_HIST, history, record->history);
@@ -109,15 +126,6 @@ LineEditor::LineEditor(std::string const &prompt, std::string const &historyFile
 }
 
 LineEditor::~LineEditor() {
-    HistEvent event;
-    if (!record->historyFile.empty()) {
-        // Nobody else is to read it, so it is made before it is written.
-        int const made = ::open(record->historyFile.c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600);
-        if (made >= 0) {
-            ::close(made);
-            history(record->history, &event, H_SAVE, record->historyFile.c_str());
-        }
-    }
     el_end(record->editor);
     history_end(record->history);
 }
@@ -131,7 +139,9 @@ std::optional<std::string> LineEditor::Next() {
     while (!line.empty() && (line.back() == '\n' || line.back() == '\r'))
         line.pop_back();
     HistEvent event;
-    if (line.find_first_not_of(' ') != std::string::npos)
+    if (line.find_first_not_of(' ') != std::string::npos) {
         history(record->history, &event, H_ENTER, line.c_str());
+        record->SaveHistory(); // the line may be the last one
+    }
     return line;
 }

@@ -97,8 +97,8 @@ private:
                                 (fitsVerilog ? NO_LANGUAGE : VERILOG);
         if (wrong != NO_LANGUAGE)
             Add(Id::CONSTANT_WIDTH, wrong,
-                std::to_string(count * bitsOfDigit) + " bits of digits, declared as " +
-                    std::to_string(value.GetLength()) + ", on " + std::to_string(width));
+                "digits: " + std::to_string(count * bitsOfDigit) + ", told: " +
+                    std::to_string(value.GetLength()) + ", width: " + std::to_string(width));
     }
 
     void CheckBare() {
@@ -108,7 +108,8 @@ private:
             Add(Id::CONSTANT_DIGIT, bad, std::string(digits));
         if (static_cast<int>(digits.size()) != net.GetWidth())
             Add(Id::CONSTANT_WIDTH, VHDL,
-                std::to_string(digits.size()) + " digits on " + std::to_string(net.GetWidth()));
+                "digits: " + std::to_string(digits.size()) +
+                    ", width: " + std::to_string(net.GetWidth()));
         if (digits.size() > 1)
             Add(Id::CONSTANT_WITHOUT_BASE, BOTH, std::string(digits));
     }

@@ -98,7 +98,7 @@ private:
         }
         // What happens while lines run concerns whatever will be written.
         findings.SetLanguages(requested != Checks::NO_LANGUAGE ? requested : Checks::BOTH);
-        recorder.Before(tokens, number);
+        recorder.Before(tokens, command, words, number);
         std::optional<Diagnostic> const diagnostic = session.RunLine(line, place);
         recorder.After(!diagnostic);
         if (diagnostic)

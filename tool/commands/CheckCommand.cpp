@@ -166,7 +166,8 @@ private:
         Checks::CheckNets(design);
         Checks::CheckPins(design);
         Checks::CheckConnections(design);
-        Checks::CheckValues(design);
+        Checks::CheckConstants(design);
+        Checks::CheckAttributes(design);
     }
 
     CheckOptions const &options;

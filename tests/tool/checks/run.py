@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""run.py TOOL: the cases of *.cases, for each check a design that trips it and one that just does not.
+"""run.py TOOL: the cases of *.cases: for each check designs that trip it and that just do not.
 
 What the tool finds has to be what a case says, and nothing in its clean design. Both are written,
 and independent readers have to refuse of the first exactly the languages that the case says, of the

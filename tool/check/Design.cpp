@@ -149,7 +149,8 @@ void Design::NeedDummy(Signal const *signal, Dummy const &dummy) {
     if (!signal)
         return;
     auto const [found, isNew] = dummies.try_emplace(signal, dummy);
-    if (!isNew && type == Signal::SIGNAL_SCALAR && found->second.stage < dummy.stage)
+    bool const isMember = dummy.demand != signal;
+    if (!isNew && isMember && type == Signal::SIGNAL_SCALAR && found->second.stage < dummy.stage)
         found->second.again = dummy.demand;
 }
 

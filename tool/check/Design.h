@@ -113,6 +113,7 @@ void CheckNames(Design const &design);
 void CheckNets(Design const &design);
 void CheckPins(Design const &design);
 void CheckConnections(Design const &design);
-void CheckValues(Design const &design);
+void CheckConstants(Design const &design);
+void CheckAttributes(Design const &design);
 
 } // namespace Checks

@@ -21,8 +21,11 @@ struct WrittenName {
     VerilogOption::CaseType nameCase = VerilogOption::CASE_DEFAULT;
     Languages languages = BOTH;
     std::string_view shown = {}; ///< where it differs from the name
+    std::string owner = {};      ///< with a point, of a pin
 
-    std::string Subject() const { return what + " " + Quote(shown.empty() ? name : shown); }
+    std::string Subject() const {
+        return what + " " + Quote(owner + std::string(shown.empty() ? name : shown));
+    }
 };
 
 bool IsLetter(char c) { return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z'); }
@@ -100,7 +103,8 @@ public:
         Check({design.netlist.GetNameRef().View(), "design", &design.netlist});
         design.ForEachUsedComponent([&](Component const *component) {
             Check({component->GetNameRef().View(), "component", component, verilog.componentCase});
-            ForEach(component->GetPinIterator(), [&](Pin const *pin) { CheckPin(*pin); });
+            ForEach(component->GetPinIterator(),
+                    [&](Pin const *pin) { CheckPin(*component, *pin); });
         });
         design.ForEachInstance([&](Instance const *instance) {
             Check({instance->GetNameRef().View(), "instance", instance, verilog.instanceCase});
@@ -210,8 +214,9 @@ private:
         return true;
     }
 
-    void CheckPin(Pin const &pin) {
+    void CheckPin(Component const &component, Pin const &pin) {
         WrittenName name{BaseOf(pin), "pin", &pin};
+        name.owner = std::string(component.GetNameRef().View()) + ".";
         name.shown = pin.GetNameRef().View();
         if (HasNegativeBound(name.shown))
             Add(Id::NEGATIVE_BOUND, name, BOTH);

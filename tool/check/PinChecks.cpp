@@ -1,7 +1,6 @@
 // Pins of components and of instances, and the parts of buses that are on them.
 
 #include <map>
-#include <unordered_set>
 
 #include "tool/check/Design.h"
 
@@ -10,8 +9,6 @@ using namespace Vesk_Hdl;
 namespace Checks {
 
 namespace {
-
-std::string PinOf(Component const &component, Pin const &pin) { return PinName(component, pin); }
 
 bool IsScalarWithBrackets(Pin const &pin) {
     return pin.GetPinType() == Pin::PIN_SCALAR &&
@@ -36,11 +33,11 @@ void CheckComponent(Design const &design, Component const &component) {
         if (IsScalarWithBrackets(*pin) && (isBit || Bus::IsBusName(pin->GetNameRef())))
             design.findings.Add({Id::BRACKETED_PIN,
                                  spot,
-                                 PinOf(component, *pin),
+                                 PinName(component, *pin),
                                  {},
                                  isBit && isDeclared ? BOTH : VERILOG});
         else if (isBit && isDeclared)
-            design.findings.Add({Id::ONE_BIT_PIN, spot, PinOf(component, *pin)});
+            design.findings.Add({Id::ONE_BIT_PIN, spot, PinName(component, *pin)});
         auto const [former, isNew] = pinsByBase.try_emplace(Folded(BaseOf(*pin)), pin);
         if (isNew || IsScalarWithBrackets(*pin))
             return;
@@ -48,7 +45,7 @@ void CheckComponent(Design const &design, Component const &component) {
         bool const formerIsBit = BusIndex::IsBusIndexName(former->second->GetNameRef());
         design.findings.Add({Id::REPEATED_PIN,
                              spot,
-                             PinOf(component, *pin),
+                             PinName(component, *pin),
                              {{former->second, "the other one is here"}},
                              isBit && formerIsBit ? VERILOG : BOTH});
     });
@@ -67,7 +64,7 @@ void CheckLatePins(Design const &design, Instance const &instance) {
         if (Pin const *const pin = all.Current(); pin && !instance.GetPin(pin->GetNameRef()))
             design.findings.Add({Id::LATE_PIN,
                                  design.MadeAt(pin),
-                                 PinOf(*component, *pin),
+                                 PinName(*component, *pin),
                                  {{&instance, "this instance goes without it"}}});
 }
 

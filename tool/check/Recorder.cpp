@@ -1,7 +1,5 @@
 #include "tool/check/Recorder.h"
 
-#include "tool/diagnostics/Blame.h"
-
 using namespace Vesk_Hdl;
 
 namespace Checks {
@@ -25,15 +23,16 @@ Spot Recorder::SpotOf(int token) const {
     return {lineNumber, Short(tokens->GetColumn(token)), Short(tokens->GetLength(token))};
 }
 
-void Recorder::Before(LineTokens const &lineTokens, std::uint32_t line) {
+void Recorder::Before(LineTokens const &lineTokens, CommandHelp const *command, int words,
+                      std::uint32_t line) {
     tokens = &lineTokens;
     lineNumber = line;
     nets.clear();
     buses.clear();
     pin = nullptr;
     holder = nullptr;
-    CommandHelp const *const command = KeywordOf(lineTokens.GetTokens(), firstArgument);
     keyword = command ? command->keyword : "";
+    firstArgument = words;
     std::string const first(lineTokens.At(firstArgument));
     if (keyword == CONNECT) {
         Name(first, firstArgument);

@@ -25,7 +25,9 @@ public:
         : model(watched), netlist(*watched.GetNetlist()), places(madePlaces),
           findings(foundThings) {}
 
-    void Before(LineTokens const &lineTokens, std::uint32_t line);
+    /// The command is null for none; its keyword has so many words.
+    void Before(LineTokens const &lineTokens, Vesk_Hdl::CommandHelp const *command, int words,
+                std::uint32_t line);
     /// A line that did not run may have made a net all the same.
     void After(bool ran);
 

@@ -100,7 +100,7 @@ private:
         }
         // What happens while lines run concerns whatever will be written.
         findings.SetLanguages(requested != Checks::NO_LANGUAGE ? requested : Checks::BOTH);
-        recorder.Before(tokens, number);
+        recorder.Before(tokens, command, words, number);
         std::optional<Diagnostic> const diagnostic = session.RunLine(line, place);
         recorder.After(!diagnostic);
         if (diagnostic)
@@ -168,7 +168,8 @@ private:
         Checks::CheckNets(design);
         Checks::CheckPins(design);
         Checks::CheckConnections(design);
-        Checks::CheckValues(design);
+        Checks::CheckConstants(design);
+        Checks::CheckAttributes(design);
     }
 
     CheckOptions const &options;

@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""run.py TOOL: the cases of *.cases, for each check a design that trips it and one that just does not.
+"""run.py TOOL: the cases of *.cases: for each check designs that trip it and that just do not.
 
 What the tool finds has to be what a case says, and nothing in its clean design. Both are written,
 and independent readers have to refuse of the first exactly the languages that the case says, of the
@@ -8,7 +8,15 @@ regular expressions, what wrong text is there. The head of a case is `### CHECK`
 semicolons, `alone` (without prelude.cmd), `refused LANGUAGE...`, `shows LANGUAGE EXPRESSION`.
 """
 
-import concurrent.futures, json, os, pathlib, re, shutil, subprocess, sys, tempfile
+import concurrent.futures
+import json
+import os
+import pathlib
+import re
+import shutil
+import subprocess
+import sys
+import tempfile
 
 HERE = pathlib.Path(__file__).resolve().parent
 KELEMENTS = HERE.parents[1] / "judges" / "kelements.vhd"
@@ -109,7 +117,8 @@ def folds():
     for owner, word in owners.items():
         for length in range(30, 90):
             name = f"{owner[0]}{length}"
-            option = "-SYNATTR=ASSIGN" if owner == "SIGNAL" else "-GENERIC=" + "NOSYN SYN".split()[length % 2]
+            generic = "-GENERIC=" + ("SYN" if length % 2 else "NOSYN")
+            option = "-SYNATTR=ASSIGN" if owner == "SIGNAL" else generic
             commands += f'ADD {owner} ATTRIBUTE {word}{name} "{("ab " * 30)[:length - 1]}x"\n'
             commands += f"SET {owner} ATTRIBUTE OPTION {word}{name} {option}\n"
     with tempfile.TemporaryDirectory() as temporary:
@@ -127,6 +136,39 @@ def folds():
     return [f"folds: {sorted(found ^ broken)}"] if found != broken or not broken else []
 
 
+def options():
+    """Exit codes, and what the options leave of four findings and a refused line."""
+    design = "ADD PORT wire in\nADD PORT signal in\nADD SIGNAL n\nADD SIGNAL n\nADD COMPONENT C\n"
+    good = "SET NETLIST NAME t\nADD PORT a in\n"
+    n, c, w, s = "3:unused-net", "5:unused-component", "1:reserved-word", "2:reserved-word"
+    rows = [
+        (design, 1, [w, s, n, c], []),
+        (good, 0, [], ["--strict"]),
+        (good + "ADD SIGNAL n", 0, [n], []),
+        (good + "ADD SIGNAL n", 1, [n], ["--strict"]),
+        (design, 1, [s, n, c], ["--language", "vhdl"]),
+        (design + "WRITE VERILOG f.v\n", 1, [w, n, c], []),
+        (design + "WRITE VERILOG f.v\n", 1, [w, s, n, c], ["--language", "both"]),
+        (design, 1, [w, s], ["--off", "unused-net,unused-component"]),
+        (design, 1, [w, s, c], ["--only", "unused-component", "--only", "reserved-word"]),
+        (good, 2, [], ["--off", "nonsense"]),
+        (good, 2, [], ["--language", "C"]),
+    ]
+    faults = []
+    for commands, code, wanted, arguments in rows:
+        done = subprocess.run([TOOL, "check", "--diagnostics", "json", *arguments, "-"],
+                              input=commands, capture_output=True, text=True)
+        said = [json.loads(line) for line in done.stderr.splitlines()] if code != 2 else []
+        said = [one for one in said if one["severity"] != "count"]
+        found = [f"{one['line']}:{one['finding']}" for one in said if "finding" in one]
+        refused = [one["line"] for one in said if "finding" not in one]
+        if (done.returncode, found) != (code, wanted) or refused != [4] * (design in commands):
+            faults.append(f"{arguments}: exit code {done.returncode}, {found}, refused {refused}")
+    if list(pathlib.Path().glob("f.v")):
+        faults.append("something was written")
+    return faults
+
+
 def main():
     missing = [tool for tool in ("ghdl", "iverilog", "verilator") if not shutil.which(tool)]
     if missing:
@@ -134,7 +176,7 @@ def main():
         return 77
     cases = [case for file in sorted(HERE.glob("*.cases"))
              for case in file.read_text().split("### ")[1:]]
-    faults = folds()
+    faults = folds() + options()
     listed = run(HERE, TOOL, "check", "--list", "--markdown").stdout
     if listed != PAGE.read_text():
         faults.append("docs/checks.md: not what `vesk-hdl check --list --markdown` prints")

@@ -34,8 +34,10 @@ public:
     }
 
 private:
+    /// Not what would want quotes: half of it, put in without them, would name something else.
     void Offer(std::string_view candidate) {
-        if (BeginsWith(candidate, word))
+        bool const wantsQuotes = candidate.find_first_of(" \"'") != std::string_view::npos;
+        if (BeginsWith(candidate, word) && !wantsQuotes)
             result.candidates.emplace_back(candidate);
     }
 

@@ -4,6 +4,7 @@
 
 #include "tests/support/Lines.h"
 #include "tests/support/Owners.h"
+#include "tests/support/RandomText.h"
 
 using namespace Vesk_Hdl;
 
@@ -49,6 +50,40 @@ TEST(Component, PinsKeepOrderAndTheFirstOfTwoIsFound) {
         renamed.AddPin(("p" + std::to_string(i)).c_str(), Polarity::OUTPUT, "");
     renamed.GetPin("p1")->SetName("Z"); // last, for from then on nobody trusts an index
     EXPECT_TRUE(renamed.GetPin("Z") && !renamed.GetPin("p1"));
+}
+
+/// Random instances, sorted twice: their pins' names.
+std::string SortedPins() {
+    std::mt19937 random(3);
+    std::string names;
+    for (int i = 0; i < 200; ++i) {
+        Component component("C");
+        for (unsigned int pins = random() % 8; pins > 0; --pins)
+            component.AddPin(RandomText(random, "aAb12", 3).c_str(),
+                             static_cast<Polarity::Value>(random() % 3), "");
+        Instance first("u", &component);
+        component.AddPin("late", Polarity::INPUT, "");
+        Instance second("v", &component);
+        for (Instance *const instance : {&first, &second, &first, &second}) {
+            instance->SortPinName();
+            names += NamesOf(instance->GetPinIterator()) + "\n";
+        }
+    }
+    return names;
+}
+
+/// What sorts a component's pins is found once for all instances, until a client changes any pin.
+TEST(Instance, BothWaysOfSortingGiveTheSame) {
+    std::string const quick = SortedPins();
+    Component component("C");
+    for (char const *const name : {"b", "c"})
+        component.AddPin(name, Polarity::INPUT, "");
+    Instance instance("u", &component);
+    instance.SortPinName();
+    instance.GetPin("b")->SetPolarity(Polarity::OUTPUT);
+    instance.SortPinName();
+    EXPECT_EQ("c b", NamesOf(instance.GetPinIterator()));
+    EXPECT_EQ(quick, SortedPins());
 }
 
 TEST(Component, TakesNamePolarityAndDefaultOfAPin) {

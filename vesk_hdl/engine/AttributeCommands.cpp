@@ -43,13 +43,12 @@ struct NamedOwner {
 /// A pin of a component or an instance, HOLDER.PIN.
 struct PinOwner {
     static constexpr int TOKENS = 1;
-    bool Parse(Text const &token) { return SplitPinReference(token, holder, pin); }
+    bool Parse(Text const &token) { return pin.Parse(token.View()); }
     template <class Operation, class... Rest> void Call(Model &model, Operation op, Rest... rest) {
-        (model.*op)(holder, pin, rest...);
+        (model.*op)(pin.GetHolder(), pin.GetPin(), rest...);
     }
 
-    Text holder;
-    Text pin;
+    PinReference pin;
 };
 
 /// If the token begins with the prefix, in any case, the rest of it goes into `rest`.
@@ -147,16 +146,13 @@ template <class Owner> struct CommentArguments {
 
 // What a row of any family declares.
 #define ARGUMENTS(Class, Family, Owner, first)                                                     \
-    struct Class::Arguments : Family<Owner> {};                                                    \
-    VESK_HDL_COMMAND_LIFE(Class)                                                                   \
-    bool Class::ParseArguments(StringArray const &tokens) {                                        \
-        return arguments->Parse(tokens, first);                                                    \
-    }
+    VESK_HDL_COMMAND(Class, Family<Owner>)                                                         \
+    bool Class::ParseArguments(StringArray const &tokens) { return arguments.Parse(tokens, first); }
 
 #define ADD_ATTR(Class, Owner, first, operation)                                                   \
     ARGUMENTS(Class, AddAttrArguments, Owner, first)                                               \
     void Class::Execute() {                                                                        \
-        Arguments &a = *arguments;                                                                 \
+        auto &a = arguments;                                                                       \
         a.owner.Call(RequireModel(), &Model::operation, a.attrName, a.value, a.attrType);          \
     }
 ADD_ATTR(AddModuleAttrCommand, ModuleOwner, 3, AddModuleAttr)
@@ -169,7 +165,7 @@ ADD_ATTR(AddInstancePinAttrCommand, PinOwner, 4, AddInstancePinAttr)
 #define SET_ATTR(Class, Owner, first, operation)                                                   \
     ARGUMENTS(Class, SetAttrArguments, Owner, first)                                               \
     void Class::Execute() {                                                                        \
-        Arguments &a = *arguments;                                                                 \
+        auto &a = arguments;                                                                       \
         a.owner.Call(RequireModel(), &Model::operation, a.attrName, a.value);                      \
     }
 SET_ATTR(SetModuleAttrValueCommand, ModuleOwner, 4, SetModuleAttrValue)
@@ -190,7 +186,7 @@ SET_ATTR(SetInstancePinAttrUserTypeCommand, PinOwner, 5, SetInstancePinUserType)
     ARGUMENTS(Class, AttrOptionArguments, Owner, first)                                            \
     void Class::Execute() {                                                                        \
         Model &owningModel = RequireModel();                                                       \
-        Arguments &a = *arguments;                                                                 \
+        auto &a = arguments;                                                                       \
         if (a.hasGeneric)                                                                          \
             a.owner.Call(owningModel, &Model::genericOperation, a.attrName, a.genericValue);       \
         if (a.hasSyn)                                                                              \
@@ -212,7 +208,7 @@ ATTR_OPTION(SetInstancePinAttrOptionCommand, PinOwner, 5, SetInstancePinGenericA
 #define COMMENT(Class, Owner, first, operation)                                                    \
     ARGUMENTS(Class, CommentArguments, Owner, first)                                               \
     void Class::Execute() {                                                                        \
-        arguments->owner.Call(RequireModel(), &Model::operation, arguments->text);                 \
+        arguments.owner.Call(RequireModel(), &Model::operation, arguments.text);                   \
     }
 COMMENT(AddModuleCommentCommand, ModuleOwner, 3, AddNotes)
 COMMENT(AddNotesCommand, ModuleOwner, 2, AddNotes)

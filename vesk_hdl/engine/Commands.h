@@ -5,29 +5,28 @@
 
 namespace Vesk_Hdl {
 
-// One class for each row of the table. What a command reads from its line is its struct Arguments,
-// which stands with the bodies in the file of its family: DesignCommands.cpp,
-// AttributeCommands.cpp, OptionCommands.cpp, WriteCommands.cpp. GetKeyword comes from the table, in
-// HdlCmd.cpp.
+// One class for each row of the table. It stands with what it reads from its line, its arguments,
+// in the file of its family: DesignCommands.cpp, AttributeCommands.cpp, OptionCommands.cpp,
+// WriteCommands.cpp. All that others need is its creator.
 #define VESK_HDL_DECLARE_COMMAND(keyword, Class, ...)                                              \
-    class Class : public Command {                                                                 \
-    public:                                                                                        \
-        explicit Class(Model *owner);                                                              \
-        ~Class() override;                                                                         \
-        bool ParseArguments(StringArray const &tokens) override;                                   \
-        void Execute() override;                                                                   \
-        char const *GetKeyword() const override;                                                   \
-                                                                                                   \
-    private:                                                                                       \
-        struct Arguments;                                                                          \
-        std::unique_ptr<Arguments> arguments;                                                      \
-    };
+    inline constexpr char Class##Keyword[] = keyword;                                              \
+    Command *Make##Class(Model *model, StringArray const &);
 VESK_HDL_COMMANDS(VESK_HDL_DECLARE_COMMAND)
 #undef VESK_HDL_DECLARE_COMMAND
 
 } // namespace Vesk_Hdl
 
-/// Construction and destruction of a command, where its Arguments are known.
-#define VESK_HDL_COMMAND_LIFE(Class)                                                               \
-    Class::Class(Model *owner) : Command(owner), arguments(std::make_unique<Arguments>()) {}       \
-    Class::~Class() = default;
+/// Defines a command but for its two operations. The arguments are a member, so that a command is
+/// one piece of memory.
+#define VESK_HDL_COMMAND(Class, Arguments)                                                         \
+    class Class : public Command {                                                                 \
+    public:                                                                                        \
+        using Command::Command;                                                                    \
+        bool ParseArguments(StringArray const &tokens) override;                                   \
+        void Execute() override;                                                                   \
+        char const *GetKeyword() const override { return Class##Keyword; }                         \
+                                                                                                   \
+    private:                                                                                       \
+        Arguments arguments;                                                                       \
+    };                                                                                             \
+    Command *Make##Class(Model *model, StringArray const &) { return new Class(model); }

@@ -12,8 +12,8 @@ using Text = Basis::StringBase<char>;
 
 // NOOP
 
-struct NoOperationCommand::Arguments {};
-VESK_HDL_COMMAND_LIFE(NoOperationCommand)
+struct NoOperationArguments {};
+VESK_HDL_COMMAND(NoOperationCommand, NoOperationArguments)
 
 bool NoOperationCommand::ParseArguments(StringArray const &) { return true; }
 
@@ -21,186 +21,185 @@ void NoOperationCommand::Execute() {} // the one command that needs no model
 
 // SET NETLIST NAME name
 
-struct SetNetlistNameCommand::Arguments {
+struct SetNetlistNameArguments {
     Text name;
 };
-VESK_HDL_COMMAND_LIFE(SetNetlistNameCommand)
+VESK_HDL_COMMAND(SetNetlistNameCommand, SetNetlistNameArguments)
 
 bool SetNetlistNameCommand::ParseArguments(StringArray const &tokens) {
-    arguments->name = tokens.At(3);
-    return !arguments->name.IsEmpty();
+    arguments.name = tokens.At(3);
+    return !arguments.name.IsEmpty();
 }
 
-void SetNetlistNameCommand::Execute() { RequireModel().SetName(arguments->name); }
+void SetNetlistNameCommand::Execute() { RequireModel().SetName(arguments.name); }
 
 // SET SOURCE FILE file
 
-struct SetSourceFileCommand::Arguments {
+struct SetSourceFileArguments {
     Text name;
 };
-VESK_HDL_COMMAND_LIFE(SetSourceFileCommand)
+VESK_HDL_COMMAND(SetSourceFileCommand, SetSourceFileArguments)
 
 bool SetSourceFileCommand::ParseArguments(StringArray const &tokens) {
-    arguments->name = tokens.At(3);
-    return !arguments->name.IsEmpty();
+    arguments.name = tokens.At(3);
+    return !arguments.name.IsEmpty();
 }
 
-void SetSourceFileCommand::Execute() { RequireModel().SetSourceFileName(arguments->name); }
+void SetSourceFileCommand::Execute() { RequireModel().SetSourceFileName(arguments.name); }
 
 // ADD COMPONENT name
 
-struct AddComponentCommand::Arguments {
+struct AddComponentArguments {
     Text name;
 };
-VESK_HDL_COMMAND_LIFE(AddComponentCommand)
+VESK_HDL_COMMAND(AddComponentCommand, AddComponentArguments)
 
 bool AddComponentCommand::ParseArguments(StringArray const &tokens) {
-    arguments->name = tokens.At(2);
-    return !arguments->name.IsEmpty();
+    arguments.name = tokens.At(2);
+    return !arguments.name.IsEmpty();
 }
 
-void AddComponentCommand::Execute() { RequireModel().AddComponent(arguments->name); }
+void AddComponentCommand::Execute() { RequireModel().AddComponent(arguments.name); }
 
 // ADD PIN component pin polarity [value]
 
-struct AddPinCommand::Arguments {
+struct AddPinArguments {
     Text componentName;
     Text pinName;
     Text initialValue;
     Polarity polarity;
 };
-VESK_HDL_COMMAND_LIFE(AddPinCommand)
+VESK_HDL_COMMAND(AddPinCommand, AddPinArguments)
 
 bool AddPinCommand::ParseArguments(StringArray const &tokens) {
     if (tokens.GetSize() < 5)
         return false;
-    arguments->componentName = tokens.At(2);
-    arguments->pinName = tokens.At(3);
-    arguments->polarity.SetValue(tokens.At(4).GetText());
+    arguments.componentName = tokens.At(2);
+    arguments.pinName = tokens.At(3);
+    arguments.polarity.SetValue(tokens.At(4).GetText());
     if (tokens.GetSize() >= 6)
-        arguments->initialValue = tokens.At(5);
-    return arguments->polarity != Polarity::INVALID;
+        arguments.initialValue = tokens.At(5);
+    return arguments.polarity != Polarity::INVALID;
 }
 
 void AddPinCommand::Execute() {
-    RequireModel().AddPin(arguments->pinName, arguments->polarity, arguments->componentName,
-                          arguments->initialValue);
+    RequireModel().AddPin(arguments.pinName, arguments.polarity, arguments.componentName,
+                          arguments.initialValue);
 }
 
 // ADD INSTANCE component instance
 
-struct AddInstanceCommand::Arguments {
+struct AddInstanceArguments {
     Text componentName;
     Text instanceName;
 };
-VESK_HDL_COMMAND_LIFE(AddInstanceCommand)
+VESK_HDL_COMMAND(AddInstanceCommand, AddInstanceArguments)
 
 bool AddInstanceCommand::ParseArguments(StringArray const &tokens) {
-    arguments->componentName = tokens.At(2);
-    arguments->instanceName = tokens.At(3);
+    arguments.componentName = tokens.At(2);
+    arguments.instanceName = tokens.At(3);
     return tokens.GetSize() >= 4;
 }
 
 void AddInstanceCommand::Execute() {
-    RequireModel().AddInstance(arguments->instanceName, arguments->componentName);
+    RequireModel().AddInstance(arguments.instanceName, arguments.componentName);
 }
 
 // ADD SIGNAL name [polarity]
 
-struct AddSignalCommand::Arguments {
+struct AddSignalArguments {
     Text name;
     Polarity polarity; ///< checked and then dropped: a signal is no port
 };
-VESK_HDL_COMMAND_LIFE(AddSignalCommand)
+VESK_HDL_COMMAND(AddSignalCommand, AddSignalArguments)
 
 bool AddSignalCommand::ParseArguments(StringArray const &tokens) {
-    arguments->name = tokens.At(2);
-    arguments->polarity.SetValue(tokens.At(3).GetText());
+    arguments.name = tokens.At(2);
+    arguments.polarity.SetValue(tokens.At(3).GetText());
     return tokens.GetSize() == 3 ||
-           (tokens.GetSize() > 3 && arguments->polarity != Polarity::INVALID);
+           (tokens.GetSize() > 3 && arguments.polarity != Polarity::INVALID);
 }
 
-void AddSignalCommand::Execute() { RequireModel().AddSignal(arguments->name); }
+void AddSignalCommand::Execute() { RequireModel().AddSignal(arguments.name); }
 
 // ADD PORT name polarity
 
-struct AddPortCommand::Arguments {
+struct AddPortArguments {
     Text name;
     Polarity polarity;
 };
-VESK_HDL_COMMAND_LIFE(AddPortCommand)
+VESK_HDL_COMMAND(AddPortCommand, AddPortArguments)
 
 bool AddPortCommand::ParseArguments(StringArray const &tokens) {
-    arguments->name = tokens.At(2);
-    arguments->polarity.SetValue(tokens.At(3).GetText());
-    return tokens.GetSize() >= 4 && arguments->polarity != Polarity::INVALID;
+    arguments.name = tokens.At(2);
+    arguments.polarity.SetValue(tokens.At(3).GetText());
+    return tokens.GetSize() >= 4 && arguments.polarity != Polarity::INVALID;
 }
 
 void AddPortCommand::Execute() {
     Model &model = RequireModel();
-    if (!model.AddSignal(arguments->name))
+    if (!model.AddSignal(arguments.name))
         return;
-    if (Signal *const port = model.GetSignal(arguments->name))
-        port->SetPortPolarity(arguments->polarity);
+    if (Signal *const port = model.GetSignal(arguments.name))
+        port->SetPortPolarity(arguments.polarity);
 }
 
 // CONNECT SIGNAL signal (signal | instance.pin)
 
-struct ConnectSignalCommand::Arguments {
+struct ConnectSignalArguments {
     Text signalName;
     Text targetSignal;
-    Text instanceName;
-    Text pinName;
+    PinReference pin;
     bool isPin = false;
 };
-VESK_HDL_COMMAND_LIFE(ConnectSignalCommand)
+VESK_HDL_COMMAND(ConnectSignalCommand, ConnectSignalArguments)
 
 bool ConnectSignalCommand::ParseArguments(StringArray const &tokens) {
     if (tokens.GetSize() < 4)
         return false;
-    arguments->signalName = tokens.At(2);
-    arguments->isPin = SplitPinReference(tokens.At(3), arguments->instanceName, arguments->pinName);
-    if (!arguments->isPin)
-        arguments->targetSignal = tokens.At(3);
+    arguments.signalName = tokens.At(2);
+    arguments.isPin = arguments.pin.Parse(tokens.At(3).View());
+    if (!arguments.isPin)
+        arguments.targetSignal = tokens.At(3);
     return true;
 }
 
 void ConnectSignalCommand::Execute() {
     Model &model = RequireModel();
-    if (arguments->isPin)
-        model.ConnectSignalToPin(arguments->signalName, arguments->instanceName,
-                                 arguments->pinName);
+    if (arguments.isPin)
+        model.ConnectSignalToPin(arguments.signalName, arguments.pin.GetHolder(),
+                                 arguments.pin.GetPin());
     else
-        model.ConnectSignals(arguments->signalName, arguments->targetSignal);
+        model.ConnectSignals(arguments.signalName, arguments.targetSignal);
 }
 
 // ASSIGN CONSTANT (signal | instance.pin) value
 
-struct AssignConstantCommand::Arguments {
+struct AssignConstantArguments {
     Text signalName;
-    Text instanceName;
-    Text pinName;
+    PinReference pin;
     bool isPin = false;
     Text value;
 };
-VESK_HDL_COMMAND_LIFE(AssignConstantCommand)
+VESK_HDL_COMMAND(AssignConstantCommand, AssignConstantArguments)
 
 bool AssignConstantCommand::ParseArguments(StringArray const &tokens) {
     if (tokens.GetSize() < 4)
         return false;
-    arguments->isPin = SplitPinReference(tokens.At(2), arguments->instanceName, arguments->pinName);
-    if (!arguments->isPin)
-        arguments->signalName = tokens.At(2);
-    arguments->value = tokens.At(3);
+    arguments.isPin = arguments.pin.Parse(tokens.At(2).View());
+    if (!arguments.isPin)
+        arguments.signalName = tokens.At(2);
+    arguments.value = tokens.At(3);
     return true;
 }
 
 void AssignConstantCommand::Execute() {
     Model &model = RequireModel();
-    if (arguments->isPin)
-        model.AssignConstantToPin(arguments->instanceName, arguments->pinName, arguments->value);
+    if (arguments.isPin)
+        model.AssignConstantToPin(arguments.pin.GetHolder(), arguments.pin.GetPin(),
+                                  arguments.value);
     else
-        model.AssignConstantToSignal(arguments->signalName, arguments->value);
+        model.AssignConstantToSignal(arguments.signalName, arguments.value);
 }
 
 } // namespace Vesk_Hdl

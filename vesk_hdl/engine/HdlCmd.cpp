@@ -1,8 +1,6 @@
 #include "vesk_hdl/engine/HdlCmd.h"
 
-#include <algorithm>
 #include <atomic>
-#include <deque>
 #include <string>
 #include <utility>
 #include <vector>
@@ -12,7 +10,6 @@
 #include "vesk_hdl/engine/PinReference.h"
 #include "vesk_hdl/model/HdlModel.h"
 #include "vesk_hdl/text/Raise.h"
-#include "vesk_hdl/text/StringTable.h"
 #include "vesk_hdl/text/basis/Ascii.h"
 
 #define RAISE(...) VESK_HDL_RAISE("HdlCmd", __VA_ARGS__)
@@ -30,30 +27,51 @@ Model &Command::RequireModel() const {
     return *commandModel;
 }
 
-#define KEYWORD_OF(keyword, Class, ...)                                                            \
-    char const *Class::GetKeyword() const { return keyword; }
-VESK_HDL_COMMANDS(KEYWORD_OF)
-#undef KEYWORD_OF
+namespace {
+
+/// A word of keywords, and what may follow it: the keywords are the ways through a tree.
+struct Word {
+    std::string text;
+    CommandCreator creator = nullptr; ///< of the keyword that ends here
+    std::vector<Word> next;
+
+    Word *Find(std::string_view word) {
+        for (Word &each : next)
+            if (Basis::Ascii::EqualIgnoringCase(each.text, word))
+                return &each;
+        return nullptr;
+    }
+    /// Behind all words of a token: one that was quoted may hold several.
+    Word *Follow(std::string_view token) {
+        Word *found = Find(token);
+        std::size_t const blank = found ? token.npos : token.find(' ');
+        if (blank == token.npos)
+            return found;
+        found = Find(token.substr(0, blank));
+        return found ? found->Follow(token.substr(blank + 1)) : nullptr;
+    }
+    /// The same, and makes what is missing.
+    Word &Enter(std::string_view token) {
+        std::size_t const blank = token.find(' ');
+        std::string_view const word = token.substr(0, blank);
+        Word *found = Find(word);
+        if (!found)
+            found = &next.emplace_back(Word{std::string(word), nullptr, {}});
+        return blank == token.npos ? *found : found->Enter(token.substr(blank + 1));
+    }
+};
+
+} // namespace
 
 struct CommandFactory::Record {
-    /// What a line may begin with: a keyword, or a part of one that a blank follows, or both.
-    struct Beginning {
-        CommandCreator creator = nullptr;
-        bool goesOn = false; ///< a blank and more may follow
-    };
-
-    StringTable beginnings{StringTable::CASE_IGNORED, 193}; ///< by the text with single blanks
-    std::deque<Beginning> memory;
-    std::size_t longestKeyword = 0; ///< in characters
+    Word keywords; ///< the root, which is no word
     std::atomic<unsigned int> owners{1};
 };
 
 CommandFactory::CommandFactory() : record(nullptr) {
     auto made = std::make_unique<Record>(); // stays owned until all commands are known
     record = made.get();
-#define REGISTER(keyword, Class, ...)                                                              \
-    AddCommandCreator(                                                                             \
-        keyword, [](Model *model, StringArray const &) -> Command * { return new Class(model); });
+#define REGISTER(keyword, Class, ...) AddCommandCreator(keyword, Make##Class);
     VESK_HDL_COMMANDS(REGISTER)
 #undef REGISTER
     made.release();
@@ -79,54 +97,17 @@ void CommandFactory::AddCommandCreator(char const *keyword, CommandCreator creat
 }
 
 void CommandFactory::AddCommandCreator(StringArray const &words, CommandCreator creator) {
-    StringBase<char> const key = words.Concatenate(" ");
-    auto const begin = [this](std::string_view text) -> Record::Beginning & {
-        if (StringTable::Node const *const known = record->beginnings.Find(text))
-            return *static_cast<Record::Beginning *>(known->value);
-        Record::Beginning &made = record->memory.emplace_back();
-        record->beginnings.GrowForOneMore();
-        record->beginnings.Insert(StringBase<char>(text), &made);
-        return made;
-    };
-    std::string_view const text = key.View();
-    for (std::size_t blank = text.find(' '); blank != text.npos; blank = text.find(' ', blank + 1))
-        begin(text.substr(0, blank)).goesOn = true;
-    begin(text).creator = creator;
-    record->longestKeyword = std::max<std::size_t>(record->longestKeyword, key.GetLength());
+    record->keywords.Enter(words.Concatenate(" ").View()).creator = creator;
 }
 
 /// Every beginning of the line is looked up and the last hit wins. The walk ends where no keyword
 /// goes on as the line does, for nothing longer can match.
 CommandCreator CommandFactory::GetCommandCreator(StringArray const &tokens) const {
-    char room[64];
-    std::unique_ptr<char[]> const largeRoom(
-        record->longestKeyword > sizeof room ? new char[record->longestKeyword] : nullptr);
-    char *const key = largeRoom ? largeRoom.get() : room;
-    std::size_t size = 0;
-    std::uint32_t hash = StringTable::FIRST_HASH; // of the text so far
+    Word *at = &record->keywords;
     CommandCreator found = nullptr;
-    for (int i = 0; i < tokens.GetSize(); ++i) {
-        std::string_view const token = tokens.At(i).View();
-        if (size + (i > 0 ? 1 : 0) + token.size() > record->longestKeyword)
-            break;
-        auto const append = [&](char c) {
-            key[size++] = c;
-            hash = StringTable::AddToHash(hash, Basis::Ascii::ToUpper(c));
-        };
-        if (i > 0)
-            append(' ');
-        for (char const c : token)
-            append(c);
-        StringTable::Node const *const node =
-            record->beginnings.Find(std::string_view(key, size), hash);
-        if (!node)
-            break;
-        auto const *const beginning = static_cast<Record::Beginning const *>(node->value);
-        if (beginning->creator)
-            found = beginning->creator;
-        if (!beginning->goesOn)
-            break;
-    }
+    for (int i = 0; i < tokens.GetSize() && (at = at->Follow(tokens.At(i).View())); ++i)
+        if (at->creator)
+            found = at->creator;
     return found;
 }
 
@@ -173,29 +154,13 @@ int CommandManager::GetDoneCommandCount() const { return static_cast<int>(record
 
 void CommandManager::Clear() { record->done.clear(); }
 
-namespace {
-
-/// The index of the point that ends the first part, NOT_FOUND if the text is no pin reference.
-unsigned int FindPoint(StringBase<char> const &text) {
-    std::string_view const whole = text.View();
-    std::size_t const begin = whole.find_first_not_of('.');
-    std::size_t const point = begin == whole.npos ? begin : whole.find('.', begin);
-    return point != whole.npos && point + 1 < whole.size() ? static_cast<unsigned int>(point)
-                                                           : Basis::NOT_FOUND;
-}
-
-} // namespace
-
-bool IsPinReference(StringBase<char> const &text) { return FindPoint(text) != Basis::NOT_FOUND; }
-
-bool SplitPinReference(StringBase<char> const &text, StringBase<char> &left,
-                       StringBase<char> &right) {
-    StringBase<char> const whole(text); // an output may be the text itself
-    unsigned int const point = FindPoint(whole);
-    if (point == Basis::NOT_FOUND)
+bool PinReference::Parse(std::string_view token) {
+    std::size_t const begin = token.find_first_not_of('.');
+    std::size_t const point = begin == token.npos ? begin : token.find('.', begin);
+    if (point == token.npos || point + 1 == token.size())
         return false;
-    left = StringBase<char>(whole.View().substr(0, point));
-    right = StringBase<char>(whole.View().substr(point + 1));
+    holder = token.substr(0, point);
+    pin = token.substr(point + 1);
     return true;
 }
 

@@ -72,9 +72,8 @@ struct CaseArguments {
 
 // A row: class, family, index of its first argument, what it does with the options.
 #define OPTION(Class, Family, at, action)                                                          \
-    struct Class::Arguments : Family {};                                                           \
-    VESK_HDL_COMMAND_LIFE(Class)                                                                   \
-    bool Class::ParseArguments(StringArray const &tokens) { return arguments->Parse(tokens, at); } \
+    VESK_HDL_COMMAND(Class, Family)                                                                \
+    bool Class::ParseArguments(StringArray const &tokens) { return arguments.Parse(tokens, at); }  \
     void Class::Execute() {                                                                        \
         HdlOptions &options = *RequireModel().GetOptions();                                        \
         action;                                                                                    \
@@ -83,31 +82,31 @@ struct CaseArguments {
 OPTION(SetPortOnePerLineCommand, NoArguments, 3, options.portOnePerLine = true)
 OPTION(UseAttrTypeCommand, NoArguments, 2, options.vhdlOption.useAttrType = true)
 
-OPTION(SetOpenPinCommand, FlagArguments, 3, options.vhdlOption.openPin = arguments->flag)
-OPTION(FlattenBusCommand, FlagArguments, 2, options.vhdlOption.flattenBus = arguments->flag)
+OPTION(SetOpenPinCommand, FlagArguments, 3, options.vhdlOption.openPin = arguments.flag)
+OPTION(FlattenBusCommand, FlagArguments, 2, options.vhdlOption.flattenBus = arguments.flag)
 OPTION(SuppressConfigurationCommand, FlagArguments, 2,
-       options.vhdlOption.suppressConfiguration = arguments->flag)
+       options.vhdlOption.suppressConfiguration = arguments.flag)
 OPTION(SuppressComponentCommand, FlagArguments, 2,
-       options.vhdlOption.suppressComponent = arguments->flag)
+       options.vhdlOption.suppressComponent = arguments.flag)
 OPTION(UseDefaultLibraryCommand, FlagArguments, 3,
-       options.vhdlOption.useDefaultLibrary = arguments->flag)
+       options.vhdlOption.useDefaultLibrary = arguments.flag)
 
-OPTION(AddLibraryCommand, NameArguments, 2, options.vhdlOption.libraries.Add(arguments->name))
-OPTION(AddUseLibraryCommand, NameArguments, 3, options.vhdlOption.useLibraries.Add(arguments->name))
-OPTION(AddIncludeCommand, NameArguments, 2, options.verilogOption.includes.Add(arguments->name))
+OPTION(AddLibraryCommand, NameArguments, 2, options.vhdlOption.libraries.Add(arguments.name))
+OPTION(AddUseLibraryCommand, NameArguments, 3, options.vhdlOption.useLibraries.Add(arguments.name))
+OPTION(AddIncludeCommand, NameArguments, 2, options.verilogOption.includes.Add(arguments.name))
 OPTION(SetSynthesisCommand, NameArguments, 2,
-       options.verilogOption.SetSynthesisType(arguments->name))
-OPTION(SetApplicationCommand, NameArguments, 2, options.application = arguments->name)
-OPTION(SetDeviceCommand, NameArguments, 2, options.device = arguments->name)
+       options.verilogOption.SetSynthesisType(arguments.name))
+OPTION(SetApplicationCommand, NameArguments, 2, options.application = arguments.name)
+OPTION(SetDeviceCommand, NameArguments, 2, options.device = arguments.name)
 
-OPTION(SetCommandStrCommand, TextArguments, 2, options.commandStr = arguments->text)
-OPTION(SetPurposeCommand, TextArguments, 2, options.purpose = arguments->text)
-OPTION(SetReferenceCommand, TextArguments, 2, options.reference = arguments->text)
+OPTION(SetCommandStrCommand, TextArguments, 2, options.commandStr = arguments.text)
+OPTION(SetPurposeCommand, TextArguments, 2, options.purpose = arguments.text)
+OPTION(SetReferenceCommand, TextArguments, 2, options.reference = arguments.text)
 
 // The two words for signals differ, and each command refuses the other's: "siganl" is meant.
 OPTION(UppercaseCommand, CaseArguments, "siganl",
-       arguments->Apply(options.verilogOption, HdlOptions::VerilogOption::CASE_UPPER))
+       arguments.Apply(options.verilogOption, HdlOptions::VerilogOption::CASE_UPPER))
 OPTION(LowercaseCommand, CaseArguments, "signal",
-       arguments->Apply(options.verilogOption, HdlOptions::VerilogOption::CASE_LOWER))
+       arguments.Apply(options.verilogOption, HdlOptions::VerilogOption::CASE_LOWER))
 
 } // namespace Vesk_Hdl

@@ -1,16 +1,24 @@
 #pragma once
 
-#include "vesk_hdl/text/basis/StringBase.h"
+#include <string>
+#include <string_view>
 
 namespace Vesk_Hdl {
 
-/// Whether a token names a pin, HOLDER.PIN: a first part that a point ends, and at least one more
-/// character. A bus form holds no point and so names a signal.
-bool IsPinReference(Basis::StringBase<char> const &text);
+/// A pin's name in a line, HOLDER.PIN: a first part that a point ends, and at least one more
+/// character. It is split at the first point behind the first other character. A bus form holds no
+/// point and so names a signal.
+class PinReference {
+public:
+    /// Whether the token names a pin. If not, nothing changes.
+    bool Parse(std::string_view token);
 
-/// The two parts of a pin's name, split at the first point behind the first other character. On
-/// false they stay as they were.
-bool SplitPinReference(Basis::StringBase<char> const &text, Basis::StringBase<char> &left,
-                       Basis::StringBase<char> &right);
+    char const *GetHolder() const { return holder.c_str(); }
+    char const *GetPin() const { return pin.c_str(); }
+
+private:
+    std::string holder; ///< short names need no memory besides the command's own
+    std::string pin;
+};
 
 } // namespace Vesk_Hdl

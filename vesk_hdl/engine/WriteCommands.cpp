@@ -54,29 +54,25 @@ void WriteFile(Model &model, WriteArguments const &arguments, Write writeNetlist
 
 } // namespace
 
-struct WriteVerilogCommand::Arguments : WriteArguments {};
-VESK_HDL_COMMAND_LIFE(WriteVerilogCommand)
+VESK_HDL_COMMAND(WriteVerilogCommand, WriteArguments)
 
 bool WriteVerilogCommand::ParseArguments(StringArray const &tokens) {
-    return arguments->Parse(tokens);
+    return arguments.Parse(tokens);
 }
 
 void WriteVerilogCommand::Execute() {
-    WriteFile(RequireModel(), *arguments,
+    WriteFile(RequireModel(), arguments,
               [](OutStream &stream, Netlist *netlist, HdlOptions const &options) {
                   VerilogNetlister(stream).WriteNetlist(netlist, options);
               });
 }
 
-struct WriteVhdlCommand::Arguments : WriteArguments {};
-VESK_HDL_COMMAND_LIFE(WriteVhdlCommand)
+VESK_HDL_COMMAND(WriteVhdlCommand, WriteArguments)
 
-bool WriteVhdlCommand::ParseArguments(StringArray const &tokens) {
-    return arguments->Parse(tokens);
-}
+bool WriteVhdlCommand::ParseArguments(StringArray const &tokens) { return arguments.Parse(tokens); }
 
 void WriteVhdlCommand::Execute() {
-    WriteFile(RequireModel(), *arguments,
+    WriteFile(RequireModel(), arguments,
               [](OutStream &stream, Netlist *netlist, HdlOptions const &options) {
                   VhdlNetlister(stream).WriteNetlist(netlist, &options);
               });

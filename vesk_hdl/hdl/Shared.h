@@ -1,7 +1,7 @@
 #pragma once
 
 #include "vesk_hdl/hdl/Pieces.h"
-#include "vesk_hdl/netlist/Signal.h"
+#include "vesk_hdl/netlist/Netlist.h"
 #include "vesk_hdl/text/StringArray.h"
 
 // What the writers of both languages decide alike.
@@ -21,6 +21,26 @@ inline void PutComment(OutStream &stream, Object const *object, char const *mark
 inline bool IsDeclaredPort(Signal const &signal) {
     return signal.IsPort() && signal.IsNeededToDeclared();
 }
+
+/// The signals that some part of the file is about, in their order. One walk finds them for several
+/// parts: with a million signals it takes longer than most of the parts.
+struct SignalLists {
+    explicit SignalLists(Netlist const &netlist) {
+        ForEach(netlist.GetSignalIterator(), [this](Signal *signal) {
+            if (IsDeclaredPort(*signal))
+                ports.Add(signal);
+            if (signal->HasAttrs() && signal->GetPortPolarity() == Polarity::INVALID &&
+                signal->IsNeededToDeclared())
+                innerWithAttrs.Add(signal);
+            if (signal->HasConstantValue() || signal->GetSignalIterator().HasMore())
+                assigned.Add(signal);
+        });
+    }
+
+    PtrArray<Signal *> ports;          ///< of the port list
+    PtrArray<Signal *> innerWithAttrs; ///< declared inside
+    PtrArray<Signal *> assigned;       ///< with a constant value or from other signals
+};
 
 /// Whether a constant of this signal is one digit.
 inline bool IsOneDigit(Signal const &signal) {

@@ -40,11 +40,6 @@ private:
     char const *separator = "";
 };
 
-/// A signal that the architecture declares.
-bool IsInnerSignal(Signal const &signal) {
-    return signal.GetPortPolarity() == Polarity::INVALID && signal.IsNeededToDeclared();
-}
-
 /// The instances that the declarations need: the first of each component and those with attributes
 /// of their own. The others would add nothing, so that one walk over a million of them is enough.
 void FindTelling(Netlist const *netlist, PtrArray<Instance *> &telling) {
@@ -128,65 +123,69 @@ bool VhdlNetlister::InitDefined(AttributeHolder const *holder) {
 void VhdlNetlister::WriteEntity(Netlist const *netlist, HdlOptions const *options) {
     if (!netlist)
         return;
+    SignalLists const signals(*netlist);
     bool const useAttrType = options->vhdlOption.useAttrType;
-    Iterator<Signal *> signals = netlist->GetSignalIterator();
     Put(*stream, "entity", " ", netlist->GetNameRef(), " ", "is", EOL);
     stream->Indent();
     WriteGenericMap(netlist, true);
-    int const width = Netlist::GetLongestPortName(signals);
-    PortClause ports(*stream);
-    ForEach(signals, [&](Signal const *signal) {
-        if (!IsDeclaredPort(*signal))
-            return;
-        ports.NextItem();
-        statements->WritePortStatement(signal->GetNameRef(), signal->GetPortPolarity(), width);
+    Iterator<Signal *> ports(&signals.ports);
+    int const width = Netlist::GetLongestPortName(ports);
+    PortClause clause(*stream);
+    ForEach(ports, [&](Signal const *port) {
+        clause.NextItem();
+        statements->WritePortStatement(port->GetNameRef(), port->GetPortPolarity(), width);
     });
-    ports.End();
-    ForEach(signals, [&](Signal const *signal) {
-        if (!IsDeclaredPort(*signal) || !signal->HasAttrs())
+    clause.End();
+    ForEach(ports, [&](Signal const *port) {
+        if (!port->HasAttrs())
             return;
-        statements->WriteAttrDeclaration(signal, declaredAttrs, useAttrType, 0);
-        statements->WriteAttrAssignment(signal, BaseNameOf(*signal), "signal", useAttrType);
+        statements->WriteAttrDeclaration(port, declaredAttrs, useAttrType, 0);
+        statements->WriteAttrAssignment(port, BaseNameOf(*port), "signal", useAttrType);
     });
     stream->Unindent();
     Put(*stream, "end", " ", netlist->GetNameRef(), ";", EOL, EOL);
 }
 
 void VhdlNetlister::WriteArchitecture(Netlist const *netlist, HdlOptions const *options) {
-    Iterator<Signal *> signals = netlist->GetSignalIterator();
     Put(*stream, "architecture", " BEHAVIORAL ", "of", " ", netlist->GetNameRef(), " ", "is", EOL);
     stream->Indent();
     Instances telling;
     FindTelling(netlist, telling);
-    WriteAttrDeclarations(netlist, telling, options);
-    int const width = Netlist::GetLongestSignalName(signals);
-    ForEach(signals, [&](Signal const *signal) { WriteSignalDeclaration(signal, options, width); });
+    SignalLists const signals(*netlist);
+    WriteAttrDeclarations(signals.innerWithAttrs, telling, options);
+    Iterator<Signal *> all = netlist->GetSignalIterator();
+    int const width = Netlist::GetLongestSignalName(all);
+    ForEach(all, [&](Signal const *signal) { WriteSignalDeclaration(signal, options, width); });
     if (!options->vhdlOption.suppressComponent)
         WriteComponents(telling, options);
-    WriteSynthesisAttrAssignment(netlist, telling, options);
+    WriteSynthesisAttrAssignment(signals.innerWithAttrs, telling, options);
     stream->Unindent();
     Put(*stream, "begin", EOL);
     stream->Indent();
-    WriteAssignments(netlist);
+    WriteAssignments(signals.assigned);
     ForEach(netlist->GetInstanceIterator(),
             [&](Instance const *instance) { WriteInstance(instance, options); });
     stream->Unindent();
     Put(*stream, "end", " BEHAVIORAL;", EOL);
 }
 
-/// The attributes of ports were declared in the entity.
-void VhdlNetlister::WriteAttrDeclarations(Netlist const *netlist, Instances const &telling,
-                                          HdlOptions const *options) {
+/// The attributes of ports were declared in the entity. The width is that of
+/// Netlist::GetLongestAttrName, which would walk over all signals and instances.
+void VhdlNetlister::WriteAttrDeclarations(PtrArray<Signal *> const &signals,
+                                          Instances const &telling, HdlOptions const *options) {
     bool const useAttrType = options->vhdlOption.useAttrType;
-    int const width = Netlist::GetLongestAttrName(netlist);
-    ForEach(netlist->GetSignalIterator(), [&](Signal const *signal) {
-        if (IsInnerSignal(*signal))
-            statements->WriteAttrDeclaration(signal, declaredAttrs, useAttrType, width);
-    });
-    ForEach(telling, [&](Instance const *instance) {
-        statements->WriteAttrDeclaration(instance->GetComponent(), declaredAttrs, useAttrType,
-                                         width);
-        statements->WriteAttrDeclaration(instance, declaredAttrs, useAttrType, width);
+    auto const forEachHolder = [&](auto act) {
+        ForEach(signals, act);
+        ForEach(telling, [&act](Instance const *instance) {
+            act(instance->GetComponent());
+            act(instance);
+        });
+    };
+    int width = 0;
+    forEachHolder(
+        [&width](AttributeHolder const *holder) { Netlist::GetLongestAttrName(holder, width); });
+    forEachHolder([&](AttributeHolder const *holder) {
+        statements->WriteAttrDeclaration(holder, declaredAttrs, useAttrType, width);
     });
 }
 
@@ -238,26 +237,26 @@ void VhdlNetlister::WriteComponent(Component const *component, HdlOptions const 
     *stream << EOL;
 }
 
-void VhdlNetlister::WriteSynthesisAttrAssignment(Netlist const *netlist, Instances const &telling,
+void VhdlNetlister::WriteSynthesisAttrAssignment(PtrArray<Signal *> const &signals,
+                                                 Instances const &telling,
                                                  HdlOptions const *options) {
-    ForEach(netlist->GetSignalIterator(), [&](Signal const *signal) {
-        if (signal->HasAttrs() && IsInnerSignal(*signal))
-            statements->WriteAttrAssignment(signal, BaseNameOf(*signal), "signal",
-                                            options->vhdlOption.useAttrType);
+    ForEach(signals, [&](Signal const *signal) {
+        statements->WriteAttrAssignment(signal, BaseNameOf(*signal), "signal",
+                                        options->vhdlOption.useAttrType);
     });
     ForEach(telling,
             [&](Instance const *instance) { WriteInstanceAttrAssignment(instance, options); });
 }
 
 /// Constants first, then what is assigned from another signal.
-void VhdlNetlister::WriteAssignments(Netlist const *netlist) {
-    ForEach(netlist->GetSignalIterator(), [&](Signal const *signal) {
+void VhdlNetlister::WriteAssignments(PtrArray<Signal *> const &signals) {
+    ForEach(signals, [&](Signal const *signal) {
         if (!signal->HasConstantValue())
             return;
         statements->WriteConstantSignalAssignment(signal->GetNameRef(), IsOneDigit(*signal),
                                                   signal->GetConstantValue());
     });
-    ForEach(netlist->GetSignalIterator(), [&](Signal const *target) {
+    ForEach(signals, [&](Signal const *target) {
         ForEach(target->GetSignalIterator(), [&](Signal const *source) {
             statements->WriteSignalAssignment(target->GetNameRef(), source->GetNameRef());
         });

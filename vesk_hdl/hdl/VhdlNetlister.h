@@ -34,14 +34,14 @@ private:
     void WriteEntity(Netlist const *netlist, HdlOptions const *options);
     void WriteArchitecture(Netlist const *netlist, HdlOptions const *options);
     using Instances = PtrArray<Instance *>;
-    void WriteAttrDeclarations(Netlist const *netlist, Instances const &telling,
+    void WriteAttrDeclarations(PtrArray<Signal *> const &signals, Instances const &telling,
                                HdlOptions const *options);
     void WriteSignalDeclaration(Signal const *signal, HdlOptions const *options, int width);
     void WriteComponents(Instances const &telling, HdlOptions const *options);
     void WriteComponent(Component const *component, HdlOptions const *options);
-    void WriteSynthesisAttrAssignment(Netlist const *netlist, Instances const &telling,
+    void WriteSynthesisAttrAssignment(PtrArray<Signal *> const &signals, Instances const &telling,
                                       HdlOptions const *options);
-    void WriteAssignments(Netlist const *netlist);
+    void WriteAssignments(PtrArray<Signal *> const &signals);
     void WriteConfiguration(Netlist const *netlist);
     void WriteConfigurationItem(Component const *component, PtrArray<Instance *> const &instances);
     bool InitDefined(AttributeHolder const *holder);

@@ -43,14 +43,16 @@ bool Model::AddPin(char const *pinName, Polarity const &polarity, char const *co
 bool Model::AddInstance(char const *instanceName, char const *componentName) {
     if (!instanceName)
         RAISE(Messages::INVALID_NAME);
-    if (IsNamedUsed(instanceName))
+    Netlist &netlist = *GetNetlist();
+    Names::Key const key(instanceName);
+    if (netlist.IsNameUsed(key))
         RAISE(Messages::IDENTIFIER_DEFINED, instanceName);
     Component *const component = GetComponent(componentName);
     if (!component)
         RAISE(Messages::COMPONENT_NOT_FOUND, OrEmpty(componentName));
-    if (GetInstance(instanceName)) // a guard: the identifier check has caught this
+    if (netlist.FindInstance(key)) // a guard: the identifier check has caught this
         RAISE(Messages::INSTANCE_EXISTS, instanceName);
-    GetNetlist()->Add(new Instance(instanceName, component));
+    netlist.Add(new Instance(instanceName, component));
     SetModifiedFlag(true);
     return true;
 }
@@ -58,10 +60,10 @@ bool Model::AddInstance(char const *instanceName, char const *componentName) {
 bool Model::AddSignal(char const *name) {
     if (!name)
         RAISE(Messages::INVALID_NAME);
-    if (IsNamedUsed(name))
-        RAISE(Messages::IDENTIFIER_DEFINED, name);
-    Names::Key const key(name);
     Netlist &netlist = *GetNetlist();
+    Names::Key const key(name);
+    if (netlist.IsNameUsed(key))
+        RAISE(Messages::IDENTIFIER_DEFINED, name);
     if (Names::IsBusName(key.View())) {
         if (netlist.GetParentBus(name))
             RAISE(Messages::SIGNAL_DECLARED, name);

@@ -19,13 +19,20 @@ namespace {
 
 constexpr std::string_view::size_type NPOS = std::string_view::npos;
 
-constexpr std::array<bool, 256> MarkRewritten() {
-    std::array<bool, 256> marks = {};
+constexpr char REWRITTEN = '\0'; ///< no name holds it
+
+/// What a character adds to the hash of a name, or REWRITTEN.
+constexpr std::array<char, 256> FoldAndMark() {
+    std::array<char, 256> folded = {};
+    for (unsigned int c = 0; c < folded.size(); ++c)
+        folded[c] = ToUpper(static_cast<char>(c));
     for (unsigned char const c : {'[', ']', '{', '}', '<', '>', '-'})
-        marks[c] = true;
-    return marks;
+        folded[c] = REWRITTEN;
+    return folded;
 }
-constexpr std::array<bool, 256> IS_REWRITTEN = MarkRewritten();
+constexpr std::array<char, 256> FOLDED = FoldAndMark();
+
+char Folded(char c) { return FOLDED[static_cast<unsigned char>(c)]; }
 
 bool IsMember(std::string_view token) {
     std::string_view base;
@@ -156,8 +163,15 @@ StringBase<char> BitName(std::string_view base, int index) {
 bool IsNormal(std::string_view name) {
     bool isNormal = true;
     for (char const c : name)
-        isNormal &= !IS_REWRITTEN[static_cast<unsigned char>(c)];
+        isNormal &= Folded(c) != REWRITTEN;
     return isNormal;
+}
+
+Key::Scan::Scan(std::string_view name) {
+    for (char const c : name) {
+        isNormal &= Folded(c) != REWRITTEN;
+        hash = StringTable::AddToHash(hash, Folded(c));
+    }
 }
 
 void Normalize(StringBase<char> &name) {

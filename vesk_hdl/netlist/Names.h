@@ -71,27 +71,48 @@ std::string_view BaseName(std::string_view name);
 bool EndsInDummyTag(std::string_view name);
 inline constexpr char const *DUMMY_TAG = "_DUMMY";
 
-/// A name as the tables know it: the text itself if it is normal, else a rewritten copy, and its
-/// hash. Null counts as empty. Valid as long as this object and the text.
-class Key {
+/// A name as objects bear it: the text itself if it is normal, else a rewritten copy. Null counts
+/// as empty. Valid as long as this object and the text.
+class NormalName {
 public:
-    explicit Key(char const *name) : Key(std::string_view(name ? name : "")) {}
-    explicit Key(std::string_view name) : view(name) {
-        if (!IsNormal(name)) {
-            rewritten = Basis::StringBase<char>(name);
-            Normalize(rewritten);
-            view = rewritten.View();
-        }
-        hash = StringTable::HashIgnoringCase(view);
-    }
-    Key(Key const &) = delete;
-    Key &operator=(Key const &) = delete;
+    explicit NormalName(char const *name) : NormalName(std::string_view(name ? name : "")) {}
+    explicit NormalName(std::string_view name) : NormalName(name, IsNormal(name)) {}
+    NormalName(NormalName const &) = delete;
+    NormalName &operator=(NormalName const &) = delete;
     std::string_view View() const { return view; }
-    std::uint32_t GetHash() const { return hash; }
+
+protected:
+    NormalName(std::string_view name, bool isNormal) : view(name) {
+        if (isNormal)
+            return;
+        rewritten = Basis::StringBase<char>(name);
+        Normalize(rewritten);
+        view = rewritten.View();
+    }
 
 private:
     Basis::StringBase<char> rewritten;
     std::string_view view;
+};
+
+/// A name as the tables know it, with its hash.
+class Key : public NormalName {
+public:
+    explicit Key(char const *name) : Key(std::string_view(name ? name : "")) {}
+    explicit Key(std::string_view name) : Key(name, Scan(name)) {}
+    std::uint32_t GetHash() const { return hash; }
+
+private:
+    /// IsNormal and StringTable::HashIgnoringCase in one walk.
+    struct Scan {
+        explicit Scan(std::string_view name);
+        bool isNormal = true;
+        std::uint32_t hash = StringTable::FIRST_HASH;
+    };
+    Key(std::string_view name, Scan const &scan)
+        : NormalName(name, scan.isNormal),
+          hash(scan.isNormal ? scan.hash : StringTable::HashIgnoringCase(View())) {}
+
     std::uint32_t hash;
 };
 

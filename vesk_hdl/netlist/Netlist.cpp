@@ -154,7 +154,7 @@ Instance *Netlist::GetInstance(char const *name) const { return FindInstance(Nam
 Component *Netlist::GetComponent(char const *name) const { return FindComponent(Names::Key(name)); }
 
 Bus *Netlist::GetParentBus(char const *name) const {
-    Names::Key const whole(name);
+    Names::NormalName const whole(name);
     return FindBus(Names::Key(Names::BaseName(whole.View())));
 }
 

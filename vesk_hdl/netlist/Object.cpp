@@ -132,8 +132,8 @@ bool Object::IsNamed(char const *name) const { return Basis::stricmp(record->nam
 void Object::NormalizeName(StringBase<char> &name) { Names::Normalize(name); }
 
 StringBase<char> Object::GetBaseName(char const *name) {
-    Names::Key const key(name);
-    return StringBase<char>(Names::BaseName(key.View()));
+    Names::NormalName const whole(name);
+    return StringBase<char>(Names::BaseName(whole.View()));
 }
 
 bool Object::IsValidBaseName(char const *name) { return name && Names::IsBaseName(name); }

@@ -2,6 +2,9 @@
 
 #include <atomic>
 #include <cstdint>
+#include <optional>
+#include <utility>
+#include <vector>
 
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/NaturalOrder.h"
@@ -29,8 +32,13 @@ Pin *FindPin(PtrArray<Pin *> const &pins, std::string_view name) {
     return nullptr;
 }
 
-/// Set once any pin was renamed, which only a client does: from then on nobody trusts an index.
-std::atomic<bool> somePinWasRenamed{false};
+/// Set once any pin got another name or polarity, which only a client does: from then on nobody
+/// trusts an index or an order that was found before.
+std::atomic<bool> somePinHasChanged{false};
+
+void SortByName(PtrArray<Pin *> &pins) {
+    SortNaturally(pins, [](Pin const *pin) { return pin->GetPolarity(); });
+}
 
 /// Where the pins of a large component stand, by name, in place of FindPin's walk. It answers as
 /// long as no two pins share a name and none was renamed.
@@ -46,7 +54,7 @@ public:
         if (isUnique)
             table.Insert(name, value);
     }
-    bool IsUsable() const { return isUnique && !somePinWasRenamed; }
+    bool IsUsable() const { return isUnique && !somePinHasChanged; }
     /// -1 when absent.
     int Find(std::string_view name) const {
         StringTable::Node const *const node = table.Find(name);
@@ -86,7 +94,7 @@ void FindOnPorts(PtrArray<Pin *> const &pins, Polarity::Value pinPolarity,
 Pin::Pin(char const *name, Polarity const &polarity) : signal(nullptr) {
     SetNormalizedName(name);
     SetObjectType(OBJECT_PIN);
-    SetPolarity(polarity);
+    Object::Own().polarity = static_cast<signed char>(polarity.GetValue());
 }
 
 Pin::Pin(Pin const &other) : Object(other), AttributeHolder(other), signal(other.GetSignal()) {
@@ -99,14 +107,14 @@ Pin::~Pin() = default;
 Object::ObjectType Pin::GetObjectType() const { return OBJECT_PIN; }
 void Pin::AcceptObject(ObjectVisitor &visitor) { visitor.VisitPin(this); }
 void Pin::SetName(char const *name) {
-    somePinWasRenamed = true;
+    somePinHasChanged = true;
     Object::SetName(name);
 }
 
 Pin &Pin::operator=(Pin const &other) {
     if (this == &other)
         return *this;
-    somePinWasRenamed = somePinWasRenamed || !IsCalled(this, other.GetNameRef().View());
+    somePinHasChanged = somePinHasChanged || Object::record != other.Object::record;
     AttributeHolder::operator=(other);
     Share(other);
     Connect(other.GetSignal());
@@ -133,6 +141,7 @@ void Pin::Disconnect() {
 
 Signal *Pin::GetSignal() const { return signal == Former() ? nullptr : signal; }
 void Pin::SetPolarity(Polarity const &polarity) {
+    somePinHasChanged = true;
     Object::Own().polarity = static_cast<signed char>(polarity.GetValue());
 }
 Polarity Pin::GetPolarity() const { return static_cast<Polarity::Value>(Object::record->polarity); }
@@ -187,8 +196,38 @@ StringBase<char> BusIndexPin::GetIndex() const {
 PinVisitor::~PinVisitor() = default;
 
 struct Component::Record {
+    /// How the pins are sorted.
+    struct Order {
+        bool isUnique = true; ///< no two pins are equal in it, so that it is the only one
+        std::vector<std::pair<int, int>> swaps; ///< exchanges of places, one after the other
+    };
+
     OwnPtrArray<Pin *> pins;
     std::unique_ptr<PinPositions> positions; ///< null while there are few pins
+    std::optional<Order> order;              ///< none until asked for, and after a change
+
+    Order const &GetOrder() {
+        if (order)
+            return *order;
+        PtrArray<Pin *> now;
+        PtrArray<Pin *> sorted;
+        for (PtrArray<Pin *> *const copy : {&now, &sorted})
+            ForEach(pins, [copy](Pin *pin) { copy->Add(pin); });
+        SortByName(sorted);
+        Order found;
+        for (int i = 0; i < now.GetSize(); ++i) {
+            Pin *const pin = sorted.GetAt(i);
+            Pin const *const last = sorted.GetAt(i - 1);
+            if (last && last->GetPolarity() == pin->GetPolarity() &&
+                NaturalCompare(last->GetNameRef(), pin->GetNameRef()) == 0)
+                found.isUnique = false;
+            if (now.GetAt(i) != pin) {
+                found.swaps.emplace_back(i, now.GetIndex(pin));
+                now.Swap(i, found.swaps.back().second);
+            }
+        }
+        return order.emplace(std::move(found));
+    }
 
     void AddPosition() {
         int const size = pins.GetSize();
@@ -227,6 +266,7 @@ void Component::AddPin(char const *name, Polarity const &polarity,
         pin->SetDefaultValue(defaultValue);
     record->pins.Add(pin.get());
     pin.release();
+    record->order.reset();
     record->AddPosition();
 }
 
@@ -239,10 +279,10 @@ void Component::AddPin(Pin const &pin) {
 }
 
 Pin *Component::GetPin(char const *name) const {
-    Names::Key const key(name);
+    Names::NormalName const normal(name);
     bool const isIndexed = record->positions && record->positions->IsUsable();
-    return isIndexed ? record->pins.GetAt(record->GetPosition(key.View()))
-                     : FindPin(record->pins, key.View());
+    return isIndexed ? record->pins.GetAt(record->GetPosition(normal.View()))
+                     : FindPin(record->pins, normal.View());
 }
 
 Iterator<Pin *> Component::GetPinIterator() const { return Iterator<Pin *>(&record->pins); }
@@ -255,8 +295,13 @@ struct Instance::Record {
 
     explicit Record(Component *placed) : component(placed) {}
 
+    /// As SortByName, by what sorts the component's pins, found but once. False, and nothing is
+    /// done, if it does not hold for these pins.
+    bool SortAsComponent();
+
     Component *const component;
     LentPtrArray<Pin *> pins;
+    bool isSorted = false;
 };
 
 namespace {
@@ -334,17 +379,32 @@ Attribute *Instance::GetComponentAttr(char const *name) const {
 
 /// A pin stands where the component's does until somebody sorts.
 Pin *Instance::GetPin(char const *name) const {
-    Names::Key const key(name);
+    Names::NormalName const normal(name);
     Component const *const component = record->component;
     Pin *const guess =
-        component ? record->pins.GetAt(component->record->GetPosition(key.View())) : nullptr;
-    return IsCalled(guess, key.View()) ? guess : FindPin(record->pins, key.View());
+        component ? record->pins.GetAt(component->record->GetPosition(normal.View())) : nullptr;
+    return IsCalled(guess, normal.View()) ? guess : FindPin(record->pins, normal.View());
 }
 
 Iterator<Pin *> Instance::GetPinIterator() const { return Iterator<Pin *>(&record->pins); }
 
+bool Instance::Record::SortAsComponent() {
+    if (somePinHasChanged || pins.GetSize() != component->record->pins.GetSize())
+        return false;
+    if (isSorted)
+        return true;
+    Component::Record::Order const &order = component->record->GetOrder();
+    if (!order.isUnique)
+        return false;
+    for (auto const &[place, other] : order.swaps)
+        pins.Swap(place, other);
+    isSorted = true;
+    return true;
+}
+
 void Instance::SortPinName() {
-    SortNaturally(record->pins, [](Pin const *pin) { return pin->GetPolarity(); });
+    if (!record->pins.IsEmpty() && !record->SortAsComponent())
+        SortByName(record->pins);
 }
 
 void Instance::GetOutPortConnectedToInPin(PtrArray<Pin *> &found) const {

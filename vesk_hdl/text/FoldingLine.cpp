@@ -16,12 +16,20 @@ void WriteBlanks(Basis::Stream &file, std::size_t count) {
 
 } // namespace
 
+void FoldingLine::FindLimit() {
+    limit = std::min(capacity, start + MAX_LENGTH - std::min(blanks, MAX_LENGTH));
+}
+
 void FoldingLine::Grow() {
     std::size_t const grown = std::max<std::size_t>(2 * capacity, 256);
     auto larger = std::make_unique<char[]>(grown);
-    std::copy_n(text.get(), size, larger.get());
+    if (text)
+        std::copy_n(text.get(), size, larger.get());
+    else
+        std::fill_n(larger.get(), MARGIN, ' ');
     text = std::move(larger);
     capacity = grown;
+    FindLimit();
 }
 
 /// Whether the text in front of the last piece holds a comment mark.
@@ -56,31 +64,38 @@ void FoldingLine::Fold(Basis::Stream &file, std::size_t indentation) {
     blanks = indentation + FOLD_INDENT; // now in front, so that no comma will be asked for
     withoutBlank = pieceBegin;
     searched = std::max(searched, start);
-    if (start >= size - start)
+    if (start - MARGIN >= size - start)
         DropWritten();
+    FindLimit();
 }
 
 /// So that a line that folds a million times takes no more memory than one that folds once.
 void FoldingLine::DropWritten() {
-    std::copy(text.get() + start, text.get() + size, text.get());
+    std::copy(text.get() + start, text.get() + size, text.get() + MARGIN);
     for (std::size_t *const place : {&size, &pieceBegin, &searched, &withoutBlank})
-        *place -= start;
-    start = 0;
+        *place -= start - MARGIN;
+    start = MARGIN;
 }
 
 void FoldingLine::End(Basis::Stream &file) {
-    WriteBlanks(file, blanks);
-    if (size == capacity)
+    if (size >= capacity)
         Grow();
     text[size++] = '\n';
-    file.Write(std::string_view(text.get() + start, size - start));
-    blanks = size = start = pieceBegin = searched = withoutBlank = 0;
+    if (start == MARGIN && blanks <= MARGIN) {
+        start -= blanks;
+        file.Write(std::string_view(text.get() + start, size - start));
+    } else {
+        WriteBlanks(file, blanks);
+        file.Write(std::string_view(text.get() + start, size - start));
+    }
+    size = start = pieceBegin = searched = withoutBlank = MARGIN;
+    blanks = limit = 0;
     comment = false;
 }
 
 void FoldingLine::Break(Basis::Stream &file, std::size_t indentation) {
     End(file);
-    blanks = indentation + FOLD_INDENT;
+    Indent(indentation + FOLD_INDENT);
 }
 
 } // namespace Vesk_Hdl

@@ -21,22 +21,27 @@ public:
     std::size_t GetLength() const { return blanks + size - start; }
 
     /// Begins an empty line with blanks.
-    void Indent(std::size_t count) { blanks = count; }
+    void Indent(std::size_t count) {
+        blanks = count;
+        FindLimit();
+    }
+
+    /// The short way of Append and FoldIfTooLong, for a text without an end of line that neither
+    /// begins nor folds the line. Does nothing and gives false with any other.
+    bool AppendShort(char const *token) {
+        std::size_t const end = CopyUpTo(limit, token);
+        if (*token != '\0')
+            return false;
+        size = end;
+        return true;
+    }
 
     /// Appends a text up to its first end of line, if it has one, and tells where it stopped.
     char const *Append(char const *token) {
         pieceBegin = size;
         for (;;) {
-            char *const to = text.get() + size;
-            std::size_t const room = capacity - size;
-            std::size_t count = 0;
-            while (count < room && !IsEnd(token[count])) {
-                to[count] = token[count];
-                ++count;
-            }
-            size += count;
-            token += count;
-            if (count < room)
+            size = CopyUpTo(capacity, token);
+            if (size < capacity)
                 return token;
             Grow();
         }
@@ -56,6 +61,17 @@ private:
     static bool IsEnd(char c) {
         return static_cast<unsigned char>(c) <= '\n' && (c == '\n' || c == '\0');
     }
+    /// Copies behind the text what is no end of line, and tells up to where.
+    std::size_t CopyUpTo(std::size_t most, char const *&token) const {
+        char *const to = text.get() + size;
+        std::size_t const room = most > size ? most - size : 0;
+        std::size_t count = 0;
+        for (; count < room && !IsEnd(token[count]); ++count)
+            to[count] = token[count];
+        token += count;
+        return size + count;
+    }
+    void FindLimit();
     void Grow();
     bool IsComment();
     void Fold(Basis::Stream &file, std::size_t indentation);
@@ -63,15 +79,17 @@ private:
     std::size_t FindLast(char c, std::size_t from) const;
 
     static constexpr std::size_t NONE = static_cast<std::size_t>(-1);
+    static constexpr std::size_t MARGIN = 32; ///< blanks in front of every text
 
     std::size_t blanks = 0;
     std::unique_ptr<char[]> text; ///< from `start` to `size`; what stands before has been written
     std::size_t capacity = 0;
-    std::size_t size = 0;
-    std::size_t start = 0;
-    std::size_t pieceBegin = 0;   ///< where the piece appended last begins
-    std::size_t searched = 0;     ///< no comment mark ends in front of it, unless `comment`
-    std::size_t withoutBlank = 0; ///< no blank stands between `start` and here
+    std::size_t size = MARGIN;
+    std::size_t limit = 0; ///< up to where AppendShort can go; 0 while the line has not begun
+    std::size_t start = MARGIN;
+    std::size_t pieceBegin = MARGIN;   ///< where the piece that Append was told last begins
+    std::size_t searched = MARGIN;     ///< no comment mark ends in front of it, unless `comment`
+    std::size_t withoutBlank = MARGIN; ///< no blank stands between `start` and here
     bool comment = false;
 };
 

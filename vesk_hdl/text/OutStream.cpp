@@ -43,18 +43,9 @@ public:
             EndLine();
     }
 
-    /// What stands in front of a "\n" in one piece ends the line unfolded.
     void Write(char const *text) override {
-        if (!file)
-            return;
-        while (*text != '\0') {
-            IndentNewLine();
-            text = line.Append(text);
-            if (*text == '\0')
-                return line.FoldIfTooLong(*file, Indentation());
-            EndLine();
-            ++text;
-        }
+        if (file && !line.AppendShort(text))
+            WriteAny(text);
     }
     void Write(int value) override {
         char digits[16];
@@ -95,6 +86,19 @@ private:
         file = opened;
         error = file ? 0 : errno;
         return file != nullptr;
+    }
+
+    /// What stands in front of a "\n" in one piece ends the line unfolded. Apart, so that the short
+    /// way need not save what this one does with registers.
+    [[gnu::noinline]] void WriteAny(char const *text) {
+        while (*text != '\0') {
+            IndentNewLine();
+            text = line.Append(text);
+            if (*text == '\0')
+                return line.FoldIfTooLong(*file, Indentation());
+            EndLine();
+            ++text;
+        }
     }
 
     std::size_t Indentation() { return 3 * static_cast<std::size_t>(GetIndentLevel()); }

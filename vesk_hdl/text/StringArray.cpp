@@ -107,48 +107,45 @@ private:
     int count = 0;
 };
 
-/// The plain way of StringArray::Parse, where empty tokens do not count and no quote stands in the
-/// text: the tokens are the runs of characters that are no separators.
-class PlainText {
+/// What each character is to the plain way of StringArray::Parse, where empty tokens do not count
+/// and no quote stands in the text: the tokens are the runs of characters that are no separators.
+class PlainParser {
 public:
-    PlainText(char const *plain, std::string_view separators, std::string_view quotes)
-        : text(plain) {
+    constexpr PlainParser(std::string_view separators, std::string_view quotes) {
         for (char const c : separators)
-            KindOf(c) |= SEPARATOR;
+            KindOf(c) = SEPARATOR;
         for (char const c : quotes)
-            KindOf(c) |= QUOTE;
+            KindOf(c) = QUOTE;
         KindOf('\0') = END;
     }
 
-    bool HoldsQuote() {
-        unsigned char met = 0;
-        for (char const *at = text; !(met & END); ++at)
-            met |= KindOf(*at);
-        return met & QUOTE;
-    }
-
-    template <class Act> void ForEachToken(Act act) {
-        char const *at = text;
+    /// Up to the first quote; tells whether there is none.
+    template <class Act> bool ForEachToken(char const *at, Act act) const {
         for (;;) {
             while (KindOf(*at) == SEPARATOR)
                 ++at;
-            if (KindOf(*at) == END)
-                return;
             char const *const begin = at;
             while (KindOf(*at) == PLAIN)
                 ++at;
+            if (KindOf(*at) == QUOTE)
+                return false;
+            if (at == begin)
+                return true;
             act(std::string_view(begin, static_cast<std::size_t>(at - begin)));
         }
     }
 
 private:
-    enum Kind : unsigned char { PLAIN = 0, SEPARATOR = 1, QUOTE = 2, END = 4 };
+    enum Kind : unsigned char { PLAIN, SEPARATOR, QUOTE, END };
 
-    unsigned char &KindOf(char c) { return kinds[static_cast<unsigned char>(c)]; }
+    constexpr Kind &KindOf(char c) { return kinds[static_cast<unsigned char>(c)]; }
+    constexpr Kind KindOf(char c) const { return kinds[static_cast<unsigned char>(c)]; }
 
-    char const *text;
-    unsigned char kinds[256] = {};
+    Kind kinds[256] = {};
 };
+
+constexpr char BLANK[] = " ";
+constexpr char QUOTES[] = "\"\"''";
 
 } // namespace
 
@@ -219,45 +216,49 @@ int StringArray::Parse(char const *text, char const *separators, bool skipEmpty,
                        char const *quotePairs, std::vector<Basis_Range> *places) {
     std::string_view const set = ViewOf(separators);
     std::string_view const quotes = ViewOf(quotePairs);
-    PlainText plain(OrEmpty(text), set, quotes);
-    if (plain.HoldsQuote())
-        return QuotedParser(set, skipEmpty, quotes, *this, places).Parse(ViewOf(text));
-
+    std::string_view const whole = ViewOf(text);
     int const before = GetSize();
+    std::size_t const placesBefore = places ? places->size() : 0;
     auto const add = [&](std::string_view token) {
         record->strings.emplace_back(token);
         if (places) {
-            auto const begin = static_cast<std::size_t>(token.data() - text);
+            auto const begin = static_cast<std::size_t>(token.data() - whole.data());
             places->push_back(PlaceOf(begin, begin + token.size()));
         }
     };
+    bool isPlain = false;
     if (skipEmpty) {
-        plain.ForEachToken(add);
-    } else {
-        std::string_view const whole = ViewOf(text);
+        isPlain = PlainParser(set, quotes).ForEachToken(whole.data(), add);
+    } else if (whole.find_first_of(quotes) == whole.npos) {
+        isPlain = true;
         for (Basis_Range range = {1, 0}; Basis::NextToken(whole, range, set, false);)
             add(range.first > range.last ? whole.substr(range.last, 0)
                                          : Basis::TokenIn(whole, range));
     }
-    return GetSize() - before;
+    if (isPlain)
+        return GetSize() - before;
+    record->strings.resize(static_cast<std::size_t>(before));
+    if (places)
+        places->resize(placesBefore);
+    return QuotedParser(set, skipEmpty, quotes, *this, places).Parse(whole);
 }
 
-void StringArray::ParseAnew(char const *text, char const *separators, char const *quotePairs) {
-    PlainText plain(OrEmpty(text), ViewOf(separators), ViewOf(quotePairs));
-    if (plain.HoldsQuote()) {
-        Empty();
-        Parse(text, separators, true, quotePairs);
-        return;
-    }
+void StringArray::ParseLine(char const *line) {
+    static constexpr PlainParser PARSER(BLANK, QUOTES);
     std::vector<StringBase<char>> &strings = record->strings;
     std::size_t count = 0;
-    plain.ForEachToken([&](std::string_view token) {
+    bool const isPlain = PARSER.ForEachToken(OrEmpty(line), [&](std::string_view token) {
         if (count == strings.size())
             strings.emplace_back(token);
         else
             strings[count].Assign(token);
         ++count;
     });
+    if (!isPlain) {
+        Empty();
+        Parse(line, BLANK, true, QUOTES);
+        return;
+    }
     while (strings.size() > count)
         strings.pop_back();
 }

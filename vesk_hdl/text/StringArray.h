@@ -76,9 +76,9 @@ public:
 private:
     friend class Model;
 
-    /// Empty and Parse, skipping empty tokens, in one: the strings that nobody else holds give
-    /// their memory to the new ones.
-    void ParseAnew(char const *text, char const *separators, char const *quotePairs);
+    /// Empty and Parse of a command line, at blanks and with both kinds of quotes, in one: the
+    /// strings that nobody else holds give their memory to the new ones.
+    void ParseLine(char const *line);
 
     struct Record;
     Record *record;

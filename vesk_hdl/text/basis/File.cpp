@@ -45,18 +45,21 @@ int WriteAll(int descriptor, std::string_view text) {
 struct Stream::Record {
     int descriptor = -1; ///< of a file that is written, otherwise -1
     int error = 0;
-    std::string text; ///< written: what is not yet in the file; read: the whole file
-    std::size_t position = 0;
+    std::string text; ///< read: the whole file; written: a block, empty before the first text
+    std::size_t position = 0; ///< in the text; what stands before is read, or not yet written
 
     Record() = default;
     Record(Record const &) = delete;
     Record &operator=(Record const &) = delete;
     ~Record() { Close(); }
 
-    void Flush() {
+    void Put(std::string_view whole) {
         if (descriptor >= 0 && error == 0)
-            error = WriteAll(descriptor, text);
-        text.clear();
+            error = WriteAll(descriptor, whole);
+    }
+    void Flush() {
+        Put(std::string_view(text).substr(0, position));
+        position = 0;
     }
     int Close() {
         if (descriptor >= 0) {
@@ -78,9 +81,16 @@ Stream &Stream::operator<<(char const *text) { return Write(text ? text : ""); }
 Stream &Stream::Write(std::string_view text) {
     if (record->descriptor < 0)
         return *this;
-    record->text.append(text);
-    if (record->text.size() >= BLOCK)
+    if (text.size() > record->text.size() - record->position) {
         record->Flush();
+        record->text.resize(BLOCK);
+        if (text.size() > BLOCK) {
+            record->Put(text);
+            return *this;
+        }
+    }
+    text.copy(record->text.data() + record->position, text.size());
+    record->position += text.size();
     return *this;
 }
 

@@ -67,8 +67,6 @@ char *StringBase<char>::Writable(std::size_t length) {
     return rep->Text();
 }
 
-StringBase<char>::StringBase() noexcept : rep(&empty.rep) {}
-
 StringBase<char>::StringBase(char const *text) : StringBase(ViewOf(text)) {}
 
 StringBase<char>::StringBase(std::string_view text) : rep(&empty.rep) {
@@ -81,14 +79,8 @@ StringBase<char>::StringBase(StringBase const &other) noexcept : rep(other.rep) 
         Counting::Join(rep->owners);
 }
 
-StringBase<char>::StringBase(StringBase &&other) noexcept : rep(other.rep) {
-    other.rep = &empty.rep;
-}
-
 StringBase<char>::StringBase(StringBase const &whole, Basis_Range const &range)
     : StringBase(whole.Extract(range)) {}
-
-StringBase<char>::~StringBase() { Release(rep); }
 
 StringBase<char> &StringBase<char>::operator=(char const *text) {
     return *this = StringBase(ViewOf(text));
@@ -129,14 +121,6 @@ StringBase<char> &StringBase<char>::Append(StringBase const &text) { return *thi
 StringBase<char> &StringBase<char>::Append(char const *text, unsigned int count) {
     std::string_view const whole = ViewOf(text);
     return *this += whole.substr(0, count == NOT_FOUND ? whole.size() : count);
-}
-
-void StringBase<char>::Assign(std::string_view text) {
-    if (text.empty() || text.size() > rep->capacity ||
-        rep->owners.load(std::memory_order_acquire) != 1)
-        *this = StringBase(text);
-    else
-        std::memcpy(Writable(text.size()), text.data(), text.size());
 }
 
 void StringBase<char>::Empty() {

@@ -40,15 +40,18 @@ public:
     enum ParseType : int { PARSE_KEEPING_EMPTY = 0, PARSE_SKIPPING_EMPTY = 1 };
     enum TrimType : int { TRIM_BOTH_ENDS = 2 };
 
-    StringBase() noexcept;
+    StringBase() noexcept : rep(&empty.rep) {}
     StringBase(char const *text);
     StringBase(StringBase const &other) noexcept;
-    StringBase(StringBase &&other) noexcept;
+    StringBase(StringBase &&other) noexcept : rep(other.rep) { other.rep = &empty.rep; }
     /// The characters of `range`; what lies behind the end of `whole` is left out.
     StringBase(StringBase const &whole, Basis_Range const &range);
     /// The text holds no NUL character.
     explicit StringBase(std::string_view text);
-    ~StringBase();
+    ~StringBase() {
+        if (rep != &empty.rep)
+            Release(rep);
+    }
 
     StringBase &operator=(char const *text);
     StringBase &operator=(StringBase const &other) noexcept;
@@ -136,7 +139,16 @@ private:
     static StringBase MakeWithRoom(std::string_view text, std::size_t extra, void *&room);
 
     /// Replaces the text, in its memory if that serves, by one that is no piece of it.
-    void Assign(std::string_view text);
+    void Assign(std::string_view text) {
+        if (text.empty() || text.size() > rep->capacity ||
+            rep->owners.load(std::memory_order_acquire) != 1) {
+            *this = StringBase(text);
+            return;
+        }
+        text.copy(rep->Text(), text.size());
+        rep->Text()[text.size()] = '\0';
+        rep->length = static_cast<unsigned int>(text.size());
+    }
     static Rep *NewRep(std::size_t capacity, std::size_t extra = 0);
     static void Release(Rep *rep) noexcept;
     char *Writable(std::size_t length);

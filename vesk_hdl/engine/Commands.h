@@ -27,6 +27,6 @@ VESK_HDL_COMMANDS(VESK_HDL_DECLARE_COMMAND)
         char const *GetKeyword() const override { return Class##Keyword; }                         \
                                                                                                    \
     private:                                                                                       \
-        Arguments arguments;                                                                       \
+        [[maybe_unused]] Arguments arguments;                                                      \
     };                                                                                             \
     Command *Make##Class(Model *model, StringArray const &) { return new Class(model); }

@@ -65,7 +65,8 @@ def check(tool, source, page):
 
         open(work + "/script", "w", encoding="utf-8").write("".join(script))
         with open(work + "/.gitconfig", "w", encoding="utf-8") as config:
-            config.write("[safe]\n\tdirectory = *\n")  # the checkout may be another user's
+            # The checkout may be another user's, and on no branch.
+            config.write("[safe]\n\tdirectory = *\n[advice]\n\tdetachedHead = false\n")
         environment = {"PATH": os.path.dirname(tool) + ":" + os.environ["PATH"], "LC_ALL": "C.UTF-8",
                        "HOME": work, "TOOL": tool, "REPOSITORY": source}
         said = subprocess.run(["bash", work + "/script"], cwd=room, env=environment, text=True,

@@ -195,7 +195,14 @@ void Collections(Choices &choices) {
             map.Remove(name.c_str());
             pointers.erase(Upper(name));
         }
-        StringArray const copy(array);
+        StringArray copy(array);
+        FUZZ_EXPECT(copy.Contains(array) && copy.IContains(array), "a copy");
+        FUZZ_EXPECT(!array.Contains(name.c_str()) || array.IContains(Upper(name).c_str()), "case");
+        copy.Add(array);
+        FUZZ_EXPECT(copy.GetSize() == 2 * array.GetSize() && copy[-1].IsEmpty() &&
+                        copy.GetAt(array.GetSize()) == array.GetAt(0),
+                    "twice");
+        copy = array;
         std::string joined;
         for (std::size_t i = 0; i < strings.size(); ++i)
             (joined += i > 0 ? "|" : "") += strings[i];
@@ -206,6 +213,12 @@ void Collections(Choices &choices) {
         FUZZ_EXPECT(set.Contains(name.c_str()) == (exact.count(name) > 0) &&
                         set.IContains(name.c_str()) == (folded.count(Upper(name)) > 0),
                     "%s", name.c_str());
+        StringSet other(set); // which knows again what was emptied out
+        StringSetIterator place;
+        place = other.GetBeginPos();
+        FUZZ_EXPECT(exact.empty() || other.IContains((*place).GetText()), "copy");
+        IStringPtrMap<int *> otherMap(map);
+        FUZZ_EXPECT(otherMap.IsEmpty() == pointers.empty(), "copy");
         std::size_t walked = 0;
         for (StringSetIterator it = set.GetBeginPos(); it != set.GetEndPos(); ++it)
             walked += exact.count((*it).GetText());
@@ -217,8 +230,77 @@ void Collections(Choices &choices) {
     }
 }
 
-/// A design that no Model keeps in order. What the interface leaves to the client is left alone:
-/// a component with instances, and a signal that something points at, stay.
+/// Asks each object of a design for all that it tells.
+class Questions : public ObjectVisitor,
+                  public SignalVisitor,
+                  public PinVisitor,
+                  public AttributeVisitor {
+public:
+    explicit Questions(Netlist &netlist) {
+        netlist.AcceptObject(*this);
+        Holder(netlist);
+        ForEach(netlist.GetComponentIterator(), [this](Component *component) { Ask(*component); });
+        ForEach(netlist.GetInstanceIterator(), [this](Instance *instance) {
+            Ask(*instance);
+            told += instance->GetComponentName();
+        });
+        ForEach(netlist.GetSignalIterator(), [this](Signal *signal) {
+            signal->AcceptObject(*this);
+            signal->AcceptSignal(*this);
+            Holder(*signal);
+            told += signal->GetDummySignalName();
+            told += std::to_string(signal->GetWidth()).c_str();
+        });
+    }
+
+    unsigned int GetLength() const { return told.GetLength(); }
+
+private:
+    template <class Holding> void Ask(Holding &holding) {
+        holding.AcceptObject(*this);
+        Holder(holding);
+        ForEach(holding.GetPinIterator(), [this](Pin *pin) {
+            pin->AcceptObject(*this);
+            pin->AcceptPin(*this);
+            Holder(*pin);
+            told += pin->GetPolarityName();
+        });
+    }
+    void Holder(AttributeHolder const &holder) {
+        if (holder.HasAttrs())
+            ForEach(holder.GetAttrIterator(), [this](Attribute *attribute) {
+                attribute->AcceptObject(*this);
+                attribute->AcceptAttribute(*this);
+                for (Text const &each : {attribute->GetGeneric(), attribute->GetSynAttr(),
+                                         attribute->GetValueTypeName(), attribute->GetComment()})
+                    told += each;
+            });
+    }
+    void VisitNetlist(Netlist *netlist) override { told += netlist->GetSourceFileName(); }
+    void VisitBus(Bus *bus) override { Bounds(*bus); }
+    void VisitBusSlice(BusSlice *slice) override { Bounds(*slice); }
+    void VisitBusIndex(BusIndex *index) override { told += index->GetBaseName(); }
+    void VisitBusPin(BusPin *pin) override { Bounds(*pin); }
+    void VisitBusIndexPin(BusIndexPin *pin) override { told += pin->GetIndex(); }
+    void VisitAttributeString(AttributeString *attribute) override {
+        told += attribute->GetValue();
+    }
+    void VisitAttributeBit(AttributeBit *attribute) override { told += attribute->GetValue(); }
+    void VisitAttributeUser(AttributeUser *attribute) override { told += attribute->GetValue(); }
+
+    template <class Ranged> void Bounds(Ranged &object) {
+        Text left;
+        Text right;
+        object.GetIndex(left, right);
+        told += object.IsDownTo() ? left : right;
+        told += object.GetBaseName();
+    }
+
+    Text told;
+};
+
+/// A design that no Model keeps in order. What the interface leaves to the client is done first:
+/// what points at an object that is removed is taken away, or the object stays.
 class Builder {
 public:
     explicit Builder(Choices &bytes) : choices(bytes), netlist("top") {}
@@ -227,10 +309,25 @@ public:
         while (!choices.IsEmpty() && ++steps < 200)
             Step();
         TextMemOutStream vhdl("");
-        TextMemOutStream verilog("");
-        options.writeHeader = false;
-        VhdlNetlister(vhdl).WriteNetlist(&netlist, &options);
-        VerilogNetlister(verilog).WriteNetlist(&netlist, options);
+        TextMemOutStream verilog("text");
+        verilog.SetValue("");
+        HdlOptions options;
+        options.writeHeader = choices.Below(2) == 0;
+        options.vhdlOption.useAttrType = choices.Below(2) == 0;
+        options.vhdlOption.openPin = choices.Below(2) == 0;
+        HdlOptions copied(options);
+        copied = options;
+        VhdlStatements(vhdl).WriteTimeStamp("f");
+        VerilogStatements(verilog).WriteTimeStamp("f");
+        int const longest = Netlist::GetLongestAttrName(&netlist);
+        FUZZ_EXPECT(longest >= 0, "%d", longest);
+        if (choices.Below(2))
+            netlist.CreateVerilogDummySignals();
+        unsigned int const told = Questions(netlist).GetLength();
+        FUZZ_EXPECT(told == Questions(netlist).GetLength(), "asking changes the answer");
+        VhdlNetlister first(vhdl);
+        VhdlNetlister(first).WriteNetlist(&netlist, &copied);
+        VerilogNetlister(verilog).WriteNetlist(&netlist, copied);
         FUZZ_EXPECT(vhdl.GetValue().GetIndexOfString("entity top is", Text::COMPARE_EXACT) !=
                         Basis::NOT_FOUND,
                     "no entity");
@@ -292,12 +389,49 @@ private:
         holder->AddAttr(attr.release());
     }
 
+    void Remove(Component *component) {
+        PtrArray<Instance *> placed;
+        netlist.GetInstances(component->GetName(), placed);
+        netlist.GetInstances(component, placed);
+        if (placed.IsEmpty())
+            netlist.Remove(component);
+    }
+
+    void Remove(Instance *instance) {
+        FUZZ_EXPECT(instance->HasAttrs() || HdlUtilities::GetAttrNames(instance).IsEmpty(),
+                    "names of no attributes");
+        ForEach(instance->GetPinIterator(), [this](Pin *pin) {
+            ForEach(netlist.GetSignalIterator(), [pin](Signal *on) { on->Disconnect(pin); });
+        });
+        netlist.Remove(instance);
+    }
+
+    void Remove(Signal *signal) {
+        bool isFree = true;
+        ForEach(netlist.GetSignalIterator(), [&](Signal *other) {
+            other->Disconnect(signal);
+            if (auto *const bus = dynamic_cast<Bus *>(other))
+                bus->RemoveBusSlice(signal);
+            if (auto const *const compound = dynamic_cast<CompoundBus *>(other))
+                ForEach(compound->GetBusMemberIterator(),
+                        [&](Signal const *member) { isFree = isFree && member != signal; });
+        });
+        ForEach(netlist.GetInstanceIterator(), [&](Instance *instance) {
+            ForEach(instance->GetPinIterator(), [&](Pin *pin) {
+                if (pin->GetSignal() == signal)
+                    signal->Disconnect(pin);
+            });
+        });
+        if (isFree)
+            netlist.Remove(signal);
+    }
+
     void Step() {
         Component *const component = Any(netlist.GetComponentIterator());
         Instance *const instance = Any(netlist.GetInstanceIterator());
         Signal *const signal = Any(netlist.GetSignalIterator());
         Pin *const pin = AnyPin();
-        switch (choices.Below(14)) {
+        switch (choices.Below(17)) {
         case 0:
             return netlist.Add(new Component(choices.Name().c_str()));
         case 1:
@@ -348,24 +482,23 @@ private:
                 if (object && choices.Below(2))
                     object->AddComment(choices.Text().c_str());
             return;
+        case 13:
+            return component ? Remove(component) : void();
+        case 14:
+            return instance ? Remove(instance) : void();
+        case 15:
+            return signal ? Remove(signal) : void();
         default:
-            if (component && choices.Below(2)) {
-                PtrArray<Instance *> placed;
-                netlist.GetInstances(component, placed);
-                if (placed.IsEmpty())
-                    netlist.Remove(component);
-            } else if (instance) {
-                ForEach(instance->GetPinIterator(), [](Pin *each) {
-                    if (Signal *const on = each->GetSignal())
-                        on->Disconnect(each);
-                });
+            if (Signal *const other = Any(netlist.GetSignalIterator())) {
+                other->AssignConstantValue(signal->GetConstantValue());
+                static_cast<AttributeHolder &>(*other) = *signal;
+                static_cast<Object &>(*other) = *signal;
             }
         }
     }
 
     Choices &choices;
     Netlist netlist;
-    HdlOptions options;
     int steps = 0;
 };
 

@@ -1,6 +1,7 @@
 // Whole command files, with both languages written into memory. After each line the netlist hangs
-// together; the same lines, read token array by token array, write the same text. The fuzzer's
-// inputs are mutated line by line, with lines made from the grammar of the commands.
+// together; the same lines, read token array by token array, write the same text, and so does a
+// file of them, unless a line is refused, which ends it. The fuzzer's inputs are mutated line by
+// line, with lines made from the grammar of the commands.
 
 #include <algorithm>
 #include <random>
@@ -48,6 +49,25 @@ template <class Run> std::string Outcome(std::vector<std::string> lines, Run run
     return outcome;
 }
 
+/// The texts that one file of all these lines writes.
+std::string OutcomeOfFile(std::vector<std::string> const &lines) {
+    MemoryFile file;
+    int const descriptor = file.Open();
+    std::string text;
+    for (std::string const &line : lines)
+        text += line + "\n";
+    text += "WRITE VHDL -NOHEADER x\nWRITE VERILOG -NOHEADER x\n";
+    FUZZ_EXPECT(::write(descriptor, text.data(), text.size()) >= 0, "no file");
+    Engine engine;
+    Capture capture;
+    std::string const name = "/proc/self/fd/" + std::to_string(descriptor);
+    engine.CreateAndAddModel("hdlNetlist", name.c_str());
+    engine.GetModel("hdlNetlist")->SetWriteOpener(&capture);
+    FUZZ_EXPECT(engine.ReadCommandFile("HDLNETLIST", name.c_str()), "not read");
+    ::close(descriptor);
+    return capture.Take();
+}
+
 } // namespace
 
 int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
@@ -72,6 +92,12 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
     });
     bool const timed = byLine.find("Copyright") != std::string::npos; // a header tells the time
     FUZZ_EXPECT(timed || byLine == byTokens, "\n%s\nis not\n%s", byLine.c_str(), byTokens.c_str());
+    std::string byFile = byLine;
+    try {
+        byFile = OutcomeOfFile(lines);
+    } catch (Exception const &) {
+    }
+    FUZZ_EXPECT(timed || byLine == byFile, "\n%s\nis not\n%s", byLine.c_str(), byFile.c_str());
     return 0;
 }
 

@@ -9,6 +9,7 @@ if(VESK_HDL_SANITIZE)
     set(VESK_HDL_SANITIZE_FLAGS "-fsanitize=${sanitizers}")
     target_compile_options(vesk_hdl_sanitizers INTERFACE
         ${VESK_HDL_SANITIZE_FLAGS}
+        -fno-sanitize-recover=all
         -fno-omit-frame-pointer)
     target_link_options(vesk_hdl_sanitizers INTERFACE ${VESK_HDL_SANITIZE_FLAGS})
 endif()

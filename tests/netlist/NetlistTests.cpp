@@ -86,6 +86,20 @@ TEST(Netlist, RemoveFreesPinsAndNames) {
                                               "ADD COMPONENT EMPTY")));
 }
 
+/// A netlist goes on finding an object by the name that it was added under, but not when it is
+/// gone.
+TEST(Netlist, FindsNothingThatWasRenamedAndRemoved) {
+    Design design(Short("sig s; sig D(3:0)"));
+    Netlist &netlist = design.netlist;
+    for (char const *const name : {"s", "D(3:0)"}) {
+        Signal *const signal = netlist.GetSignal(name);
+        signal->SetName("E(1:0)");
+        EXPECT_EQ(signal, netlist.GetSignal(name));
+        netlist.Remove(signal);
+        EXPECT_TRUE(!netlist.GetSignal(name) && !netlist.GetParentBus(name)) << name;
+    }
+}
+
 TEST(Netlist, InstancesOfAComponent) {
     Design design(CellsAnd("ADD COMPONENT OTHER; ADD INSTANCE OTHER o1"));
     PtrArray<Instance *> found;

@@ -25,7 +25,21 @@ public:
         table.Insert(name, hash, object);
     }
 
-    void Remove(Basis::StringBase<char> const &name) { table.Remove(name.View()); }
+    /// Takes away what the name finds. An object that was renamed since it was added is still found
+    /// by its former name: then it is looked for everywhere, lest somebody find what is gone.
+    void Remove(Basis::StringBase<char> const &name, T const *object) {
+        StringTable::Node const *const found = table.Find(name.View());
+        bool const isFiledSo = found && found->value == object;
+        table.Remove(name.View());
+        if (isFiledSo)
+            return;
+        for (StringTable::Node const *node = table.GetFirst(); node; node = table.GetNext(node))
+            if (node->value == object) {
+                Basis::StringBase<char> const former = node->key;
+                table.Remove(former.View());
+                return;
+            }
+    }
 
 private:
     StringTable table{StringTable::CASE_IGNORED, 7, StringTable::ORDER_FREE};

@@ -33,7 +33,7 @@ template <class T> void Unfile(OwnPtrArray<T *> &array, NameTable<T> &map, T *ob
         array.RemoveTail();
     else
         array.Remove(object);
-    map.Remove(object->GetNameRef());
+    map.Remove(object->GetNameRef(), object);
 }
 
 /// The longest name of the signals that pass a test, a bus counted by its base name.
@@ -89,7 +89,7 @@ void Netlist::Add(Signal *signal) {
 void Netlist::Forget(Signal *signal) {
     record->referrers.Forget(signal);
     if (auto const *const bus = As<Bus>(signal)) {
-        record->busMap.Remove(bus->GetBaseName());
+        record->busMap.Remove(bus->GetBaseName(), signal);
     } else if (As<BusSlice>(signal) || As<BusIndex>(signal)) {
         if (Bus *const parent = GetParentBus(signal->GetNameRef()))
             parent->RemoveBusSlice(signal);
@@ -113,7 +113,7 @@ void Netlist::Remove(Signal *signal) {
     record->referrers.Forget(signal);
     signal->DisconnectAll();
     if (auto const *const bus = As<Bus>(signal))
-        record->busMap.Remove(bus->GetBaseName());
+        record->busMap.Remove(bus->GetBaseName(), signal);
     delete signal;
 }
 

@@ -63,8 +63,10 @@ private:
     }
     /// Copies behind the text what is no end of line, and tells up to where.
     std::size_t CopyUpTo(std::size_t most, char const *&token) const {
+        if (most <= size)
+            return size;
         char *const to = text.get() + size;
-        std::size_t const room = most > size ? most - size : 0;
+        std::size_t const room = most - size;
         std::size_t count = 0;
         for (; count < room && !IsEnd(token[count]); ++count)
             to[count] = token[count];

@@ -48,8 +48,8 @@ public:
             WriteAny(text);
     }
     void Write(int value) override {
-        char digits[16];
-        *std::to_chars(digits, digits + sizeof digits - 1, value).ptr = '\0';
+        char digits[16] = {};
+        std::to_chars(digits, digits + sizeof digits - 1, value);
         Write(digits);
     }
 

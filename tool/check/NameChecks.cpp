@@ -184,6 +184,18 @@ private:
         if ((name.what == "pin" ? pinTypes : innerTypes).count(vhdl) > 0 ||
             (isOuter && outerTypes.count(vhdl) > 0))
             Add(Id::STANDARD_NAME, name, VHDL);
+        if (name.what == "design" && IsLibrary(vhdl))
+            Add(Id::LIBRARY_NAME, name, VHDL);
+    }
+
+    /// Whether the file names a library so, or VHDL does for every file (IEEE 1076-1993, 11.2).
+    bool IsLibrary(std::string const &folded) const {
+        HdlOptions::VhdlOption const &vhdl = design.options.vhdlOption;
+        for (int i = 0; i < vhdl.libraries.GetSize(); ++i)
+            if (SameFolded(vhdl.libraries.At(i).View(), folded))
+                return true;
+        return folded == "std" || folded == "work" ||
+               (vhdl.useDefaultLibrary && (folded == "ieee" || folded == "korbal"));
     }
 
     void CheckSignal(Signal const &signal) {

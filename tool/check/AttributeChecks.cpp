@@ -24,7 +24,7 @@ std::string VhdlTypeOf(Attribute const &attribute) {
     case Attribute::VALUE_BIT_VECTOR:
         return "bit_vector";
     case Attribute::VALUE_USER:
-        return Folded(static_cast<AttributeUser const &>(attribute).GetUserType().View());
+        return Lowercase(static_cast<AttributeUser const &>(attribute).GetUserType().View());
     }
     return {};
 }
@@ -38,7 +38,7 @@ public:
         ForEachAttribute(design, [this](AttributeUse const &use) {
             if (!use.generic && use.attribute->IsSynDeclared())
                 (IsPort(use) ? declaredByPorts : declared)
-                    .try_emplace(Folded(use.attribute->GetNameRef().View()), use.attribute);
+                    .try_emplace(Lowercase(use.attribute->GetNameRef().View()), use.attribute);
         });
     }
 
@@ -63,8 +63,8 @@ private:
         Spot const spot = design.MadeAt(use.attribute);
         design.findings.Add({id,
                              spot.line > 0 ? spot : design.MadeAt(use.owner),
-                             "attribute " + Quote(use.attribute->GetNameRef().View()) + " of " +
-                                 Quote(use.owner->GetNameRef().View()),
+                             "attribute " + Quoted(use.attribute->GetNameRef().View()) + " of " +
+                                 Quoted(use.owner->GetNameRef().View()),
                              {},
                              languages,
                              std::move(detail)});
@@ -72,7 +72,7 @@ private:
 
     /// The packages of the user may declare what nobody here does.
     void CheckDeclared(AttributeUse const &use) {
-        std::string const name = Folded(use.attribute->GetNameRef().View());
+        std::string const name = Lowercase(use.attribute->GetNameRef().View());
         auto const findIn = [&name](auto const &map) {
             auto const found = map.find(name);
             return found == map.end() ? nullptr : found->second;
@@ -256,7 +256,7 @@ private:
                     !instance->GetAttr(attribute->GetNameRef()) &&
                     FoldsAsDefparam(*instance, use, value))
                     Add(Id::FOLDED_VALUE, use, VERILOG,
-                        "at the instance " + Quote(instance->GetNameRef().View()));
+                        "at the instance " + Quoted(instance->GetNameRef().View()));
             });
         });
     }
@@ -305,9 +305,9 @@ void CheckDefparams(Design const &design) {
         if (use.generic && use.kind == AttributeUse::INSTANCE && isInit(*use.attribute) &&
             use.attribute->IsGenericNoSyn()) {
             Spot const spot = design.MadeAt(use.attribute);
-            design.findings.Add({Id::DOUBLE_DEFPARAM,
-                                 spot.line > 0 ? spot : design.MadeAt(use.owner),
-                                 "attribute \"INIT\" of " + Quote(use.owner->GetNameRef().View())});
+            design.findings.Add(
+                {Id::DOUBLE_DEFPARAM, spot.line > 0 ? spot : design.MadeAt(use.owner),
+                 "attribute \"INIT\" of " + Quoted(use.owner->GetNameRef().View())});
         }
     });
 }

@@ -3,8 +3,6 @@
 #include <string_view>
 #include <vector>
 
-#include "tool/diagnostics/Diagnostic.h"
-
 // What `vesk-hdl check` looks for: one table, from which the code, the list and the page in docs/
 // take names, sentences and hints.
 
@@ -93,8 +91,7 @@ enum class Id {
 struct Row {
     Id id;
     char const *name;
-    Languages languages; ///< that it can concern; a finding may concern fewer
-    Severity severity;
+    Languages languages;  ///< that it can concern; a finding may concern fewer
     char const *sentence; ///< goes on behind the name of what was found
     char const *hint;
 };

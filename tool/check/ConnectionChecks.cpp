@@ -68,10 +68,10 @@ private:
         if (width != other)
             Add(Id::ASSIGNMENT_WIDTH, target, BOTH,
                 std::to_string(width) + " from " + std::to_string(other) + " of " +
-                    Quote(source.GetNameRef().View()));
+                    Quoted(source.GetNameRef().View()));
         else if (isVector(target) != isVector(source))
             Add(Id::ASSIGNMENT_WIDTH, target, VHDL,
-                "one bit and a vector of one bit, " + Quote(source.GetNameRef().View()));
+                "one bit and a vector of one bit, " + Quoted(source.GetNameRef().View()));
     }
 
     Design const &design;
@@ -124,10 +124,10 @@ private:
         design.findings.Add(
             {id,
              design.NetAt(compound),
-             "compound " + Quote(compound.GetNameRef().View()),
-             {{&member, "the member " + Quote(member.GetNameRef().View()) + " is here"}},
+             "compound " + Quoted(compound.GetNameRef().View()),
+             {{&member, "the member " + Quoted(member.GetNameRef().View()) + " is here"}},
              languages,
-             Quote(member.GetNameRef().View())});
+             Quoted(member.GetNameRef().View())});
     }
 
     Design const &design;
@@ -147,10 +147,10 @@ void CheckReturns(Design const &design, Signal const &signal) {
         design.findings.Add(
             {Id::PIN_RETURNS,
              design.places.Find(Places::CONNECTED, pin),
-             owner ? PinName(*owner, *pin) : "pin " + Quote(pin->GetNameRef().View()),
+             owner ? PinName(*owner, *pin) : "pin " + Quoted(pin->GetNameRef().View()),
              {{&signal, "its first net is here"}},
              BOTH,
-             "to the dummy signal of " + Quote(signal.GetNameRef().View())});
+             "to the dummy signal of " + Quoted(signal.GetNameRef().View())});
     });
 }
 

@@ -38,7 +38,7 @@ private:
         design.findings.Add(
             {id,
              design.ConstantAt(net),
-             (id == Id::COMPOUND_ASSIGNMENT ? "compound " + Quote(net.GetNameRef().View())
+             (id == Id::COMPOUND_ASSIGNMENT ? "compound " + Quoted(net.GetNameRef().View())
                                             : NetName(net)),
              {},
              languages,
@@ -117,7 +117,7 @@ void CheckSharedConstants(Design const &design) {
         std::string tie = std::string(instance.GetNameRef().View()) + "_";
         tie += BaseOf(pin);
         tie += "_CONST_SIGNAL";
-        if (!SameFolded(BaseOf(*signal), tie))
+        if (!SameIgnoringCase(BaseOf(*signal), tie))
             return;
         auto const [former, isNew] = pinOfTie.try_emplace(signal, &pin);
         if (!isNew)
@@ -126,7 +126,7 @@ void CheckSharedConstants(Design const &design) {
                                  PinName(instance, pin),
                                  {{former->second, "the other pin is here", Places::CONNECTED}},
                                  BOTH,
-                                 Quote(signal->GetNameRef().View())});
+                                 Quoted(signal->GetNameRef().View())});
     });
 }
 

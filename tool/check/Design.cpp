@@ -6,14 +6,7 @@ namespace Checks {
 
 namespace {
 
-constexpr std::string_view CONSTANT_TAG = "_CONST_SIGNAL";
-
 constexpr int IN_PORT_STAGE = 2;
-
-bool IsTieOfPin(std::string_view base) {
-    return base.size() >= CONSTANT_TAG.size() &&
-           base.substr(base.size() - CONSTANT_TAG.size()) == CONSTANT_TAG;
-}
 
 } // namespace
 
@@ -109,7 +102,7 @@ void Design::FindUses() {
     // A pin that is tied to a constant is not in the list of its signal.
     ForEachPin([&](Instance const &, Pin const &pin) {
         Signal const *const signal = pin.GetSignal();
-        if (signal && signal->HasConstantValue() && IsTieOfPin(BaseOf(*signal)))
+        if (signal && signal->HasConstantValue() && IsTieOfPin(*signal))
             addTo(signal, UseOf(&pin));
     });
 }

@@ -63,8 +63,12 @@ public:
     std::vector<Use> const &FurtherUses(Vesk_Hdl::Signal const *signal) const;
     static Use UseOf(Vesk_Hdl::Pin const *pin);
 
+    /// All but the nets that a write gave to open pins, of which no line says anything.
     template <class Act> void ForEachSignal(Act act) const {
-        Vesk_Hdl::ForEach(netlist.GetSignalIterator(), act);
+        Vesk_Hdl::ForEach(netlist.GetSignalIterator(), [&act](Vesk_Hdl::Signal *signal) {
+            if (!IsOfOpenPin(*signal))
+                act(signal);
+        });
     }
     template <class Act> void ForEachInstance(Act act) const {
         Vesk_Hdl::ForEach(netlist.GetInstanceIterator(), act);

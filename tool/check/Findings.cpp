@@ -2,16 +2,16 @@
 
 #include <algorithm>
 
-#include "tool/check/Text.h"
+#include "tool/diagnostics/Words.h"
 
 namespace Checks {
 
 namespace {
 
-Diagnostic DiagnosticOf(Finding const &finding, bool strict, Places const &places) {
+Diagnostic DiagnosticOf(Finding const &finding, Places const &places) {
     Row const &row = Get(finding.id);
     Diagnostic diagnostic;
-    diagnostic.severity = strict ? Severity::ERROR : row.severity;
+    diagnostic.severity = Severity::WARNING;
     diagnostic.place = places.GetPlace(finding.spot);
     diagnostic.message = finding.subject + " " + row.sentence;
     if (!finding.detail.empty())
@@ -34,12 +34,12 @@ void Findings::Add(Finding finding) {
     if ((finding.languages & languages) == 0 || !Wants(finding.id))
         return;
     std::string const key = std::to_string(static_cast<int>(finding.id)) + ' ' +
-                            std::to_string(finding.spot.line) + ' ' + Folded(finding.subject);
+                            std::to_string(finding.spot.line) + ' ' + Lowercase(finding.subject);
     if (told.insert(key).second)
         findings.push_back(std::move(finding));
 }
 
-void Findings::Deliver(Reporter &reporter, Places const &places) {
+std::vector<Diagnostic> Findings::Take(Places const &places) {
     std::stable_sort(findings.begin(), findings.end(), [](Finding const &a, Finding const &b) {
         return a.spot.line != b.spot.line ? a.spot.line < b.spot.line
                                           : a.spot.column < b.spot.column;
@@ -47,13 +47,12 @@ void Findings::Deliver(Reporter &reporter, Places const &places) {
     std::vector<Diagnostic> diagnostics;
     std::vector<Spot> spots;
     for (Finding const &finding : findings) {
-        diagnostics.push_back(DiagnosticOf(finding, strict, places));
+        diagnostics.push_back(DiagnosticOf(finding, places));
         spots.push_back(finding.spot);
     }
     findings.clear();
     places.AddSources(diagnostics, spots);
-    for (Diagnostic const &diagnostic : diagnostics)
-        reporter.Report(diagnostic);
+    return diagnostics;
 }
 
 } // namespace Checks

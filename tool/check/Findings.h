@@ -7,7 +7,7 @@
 
 #include "tool/check/Checks.h"
 #include "tool/check/Places.h"
-#include "tool/diagnostics/Reporter.h"
+#include "tool/diagnostics/Diagnostic.h"
 
 namespace Checks {
 
@@ -29,12 +29,10 @@ struct Finding {
     std::string detail = {};    ///< behind the sentence, in brackets
 };
 
-/// Takes findings, leaves out what nobody asked for or was told before, and shows the rest in the
+/// Takes findings, leaves out what nobody asked for or was told before, and gives the rest in the
 /// order of the lines.
 class Findings {
 public:
-    explicit Findings(bool strictly) : strict(strictly) {}
-
     void SwitchOff(Id id) { off.insert(id); }
     /// The languages that findings from now on have to concern.
     void SetLanguages(Languages wanted) { languages = wanted; }
@@ -42,11 +40,10 @@ public:
     /// Whether a check is worth its work.
     bool Wants(Id id) const { return (Get(id).languages & languages) != 0 && off.count(id) == 0; }
     void Add(Finding finding);
-    /// Shows what came in. Files are read again for the lines, hence no findings, no reading.
-    void Deliver(Reporter &reporter, Places const &places);
+    /// What came in. Files are read again for the lines, hence no findings, no reading.
+    std::vector<Diagnostic> Take(Places const &places);
 
 private:
-    bool strict;
     std::set<Id> off;
     Languages languages = BOTH;
     std::vector<Finding> findings;

@@ -24,7 +24,7 @@ struct WrittenName {
     std::string owner = {};      ///< with a point, of a pin
 
     std::string Subject() const {
-        return what + " " + Quote(owner + std::string(shown.empty() ? name : shown));
+        return what + " " + Quoted(owner + std::string(shown.empty() ? name : shown));
     }
 };
 
@@ -161,7 +161,7 @@ private:
     }
 
     void CheckWords(WrittenName const &name, Languages illegal) {
-        std::string const vhdl = Folded(name.name);
+        std::string const vhdl = Lowercase(name.name);
         std::string const verilog = Cased(name.name, name.nameCase);
         // "force" is missing in the library's table and reserved all the same.
         bool const reservedInVerilog =
@@ -192,7 +192,7 @@ private:
     bool IsLibrary(std::string const &folded) const {
         HdlOptions::VhdlOption const &vhdl = design.options.vhdlOption;
         for (int i = 0; i < vhdl.libraries.GetSize(); ++i)
-            if (SameFolded(vhdl.libraries.At(i).View(), folded))
+            if (SameIgnoringCase(vhdl.libraries.At(i).View(), folded))
                 return true;
         return folded == "std" || folded == "work" ||
                (vhdl.useDefaultLibrary && (folded == "ieee" || folded == "korbal"));
@@ -202,7 +202,7 @@ private:
         WrittenName name{BaseOf(signal), signal.IsPort() ? "port" : "net", &signal,
                          design.options.verilogOption.signalCase};
         name.shown = signal.GetNameRef().View();
-        if (SameFolded(name.shown, "open"))
+        if (SameIgnoringCase(name.shown, "open"))
             return Add(Id::OPEN_NAME, name, BOTH);
         if (signal.GetSignalType() == Signal::SIGNAL_SCALAR && CheckScalar(signal, name))
             return;
@@ -287,10 +287,10 @@ private:
         Spot const spot = design.MadeAt(&found);
         design.findings.Add({id,
                              spot.line > 0 ? spot : design.MadeAt(&other),
-                             what + " " + Quote(found.GetNameRef().View()),
+                             what + " " + Quoted(found.GetNameRef().View()),
                              {{&other, "the other one is here"}},
                              languages,
-                             Quote(other.GetNameRef().View())});
+                             Quoted(other.GetNameRef().View())});
     }
 
     void CheckBus(Bus const &bus) {
@@ -319,7 +319,7 @@ private:
         design.findings.Add({id,
                              design.NetAt(part),
                              NetName(part),
-                             {{&bus, "the bus is called " + Quote(BaseOf(bus)) + " here"}}});
+                             {{&bus, "the bus is called " + Quoted(BaseOf(bus)) + " here"}}});
     }
 
     void CheckNetlistName() {
@@ -337,7 +337,7 @@ private:
         if (use.generic && use.kind == AttributeUse::COMPONENT) {
             ForEach(static_cast<Component const *>(use.owner)->GetPinIterator(),
                     [&](Pin const *pin) {
-                        if (SameFolded(BaseOf(*pin), name))
+                        if (SameIgnoringCase(BaseOf(*pin), name))
                             other = pin;
                     });
         } else if (!use.generic || use.kind == AttributeUse::MODULE) {
@@ -372,9 +372,9 @@ private:
                                         NetName(signal),
                                         {{dummy.again, "it is a member of this compound"}},
                                         BOTH,
-                                        Quote(dummyName.View())});
+                                        Quoted(dummyName.View())});
         std::string const base(BaseOf(dummyName.View()));
-        bool const itself = SameFolded(base, BaseOf(signal));
+        bool const itself = SameIgnoringCase(base, BaseOf(signal));
         Object const *taken = design.netlist.GetSignal(base.c_str());
         if (!taken)
             taken = design.netlist.GetParentBus(base.c_str());
@@ -389,7 +389,7 @@ private:
                              NetName(signal),
                              {{itself ? dummy.demand : taken, "the other one is here"}},
                              itself || alike ? BOTH : VHDL,
-                             Quote(dummyName.View())});
+                             Quoted(dummyName.View())});
     }
 
     Design const &design;

@@ -91,7 +91,7 @@ private:
             design.findings.Add({Id::OUTSIDE_BUS,
                                  design.NetAt(part),
                                  NetName(part),
-                                 {{&net, "the bus is " + Quote(net.GetNameRef().View())}}});
+                                 {{&net, "the bus is " + Quoted(net.GetNameRef().View())}}});
         AddUses(part, bits);
     }
 
@@ -165,7 +165,7 @@ private:
         if (!bitUse.through)
             return {{&net, "driven from outside, being an in port"}};
         if (Signal const *const source = bitUse.use.source)
-            return {{bitUse.through, "assigned from " + Quote(source->GetNameRef().View()),
+            return {{bitUse.through, "assigned from " + Quoted(source->GetNameRef().View()),
                      Places::ASSIGNED}};
         return bitUse.use.kind == Use::READS
                    ? std::vector<Related>()
@@ -190,11 +190,11 @@ void CheckNets(Design const &design) {
     });
     if (!hasPorts)
         design.findings.Add({Id::NO_PORTS, design.MadeAt(&design.netlist),
-                             "design " + Quote(design.netlist.GetNameRef().View())});
+                             "design " + Quoted(design.netlist.GetNameRef().View())});
     ForEach(design.netlist.GetComponentIterator(), [&](Component const *component) {
         if (!design.IsUsed(component))
             design.findings.Add({Id::UNUSED_COMPONENT, design.MadeAt(component),
-                                 "component " + Quote(component->GetNameRef().View())});
+                                 "component " + Quoted(component->GetNameRef().View())});
     });
 }
 

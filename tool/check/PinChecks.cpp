@@ -38,7 +38,7 @@ void CheckComponent(Design const &design, Component const &component) {
                                  isBit && isDeclared ? BOTH : VERILOG});
         else if (isBit && isDeclared)
             design.findings.Add({Id::ONE_BIT_PIN, spot, PinName(component, *pin)});
-        auto const [former, isNew] = pinsByBase.try_emplace(Folded(BaseOf(*pin)), pin);
+        auto const [former, isNew] = pinsByBase.try_emplace(Lowercase(BaseOf(*pin)), pin);
         if (isNew || IsScalarWithBrackets(*pin))
             return;
         // Bits of one bus are a port map that VHDL takes, if a package declares the component.
@@ -86,7 +86,7 @@ void CheckInstancePin(Design const &design, Instance const &instance, Pin const 
                              {{signal, "the net is here"}},
                              BOTH,
                              std::to_string(pinWidth) + " to " + std::to_string(width) + " of " +
-                                 Quote(signal->GetNameRef().View())});
+                                 Quoted(signal->GetNameRef().View())});
     // A bit of a pin takes a slice of one bit, a scalar pin does not.
     bool const isPlain = pin.GetPinType() == Pin::PIN_SCALAR && !IsScalarWithBrackets(pin);
     if (isPlain && width == 1 && signal->GetSignalType() == Signal::SIGNAL_BUS_SLICE)
@@ -129,7 +129,7 @@ void CheckSlice(Design const &design, Bus const &bus, BusSlice const &slice) {
         design.findings.Add({Id::REVERSED_SLICE,
                              design.NetAt(slice),
                              NetName(slice),
-                             {{&bus, "the bus is " + Quote(bus.GetNameRef().View())}},
+                             {{&bus, "the bus is " + Quoted(bus.GetNameRef().View())}},
                              languages});
     }
 }

@@ -6,8 +6,29 @@
 
 namespace Checks {
 
+namespace {
+
+bool IsStandardInput(std::string const &path) { return path == "-"; }
+
+} // namespace
+
+Spot SpotOf(LineTokens const &tokens, int token, std::uint32_t line) {
+    constexpr unsigned MOST = 0xFFFF;
+    unsigned const column = tokens.GetColumn(token);
+    unsigned const length = std::min(tokens.GetLength(token), MOST);
+    if (column > MOST)
+        return {line};
+    return {line, static_cast<std::uint16_t>(column), static_cast<std::uint16_t>(length)};
+}
+
 void Places::BeginFile(std::string const &path, std::string const &shownName) {
-    files.push_back({path, shownName, lineCount});
+    files.push_back({path, shownName, lineCount, {}});
+}
+
+std::uint32_t Places::NextLine(std::string const &text) {
+    if (!files.empty() && IsStandardInput(files.back().path))
+        files.back().lines.push_back(text);
+    return ++lineCount;
 }
 
 Spot Places::Find(Event event, void const *object, std::uint32_t before) const {
@@ -51,14 +72,20 @@ void Places::AddSources(std::vector<Diagnostic> &diagnostics,
                         std::vector<Spot> const &spots) const {
     std::size_t next = 0;
     for (std::size_t i = 0; i < files.size() && next < spots.size(); ++i) {
+        File const &file = files[i];
         std::uint32_t const last = i + 1 < files.size() ? files[i + 1].linesBefore : lineCount;
-        std::uint32_t line = files[i].linesBefore;
-        while (next < spots.size() && spots[next].line <= line)
+        while (next < spots.size() && spots[next].line <= file.linesBefore)
             ++next;
-        if (files[i].path == "-" || next == spots.size() || spots[next].line > last)
+        if (IsStandardInput(file.path)) {
+            for (; next < spots.size() && spots[next].line <= last; ++next)
+                diagnostics[next].source = file.lines[spots[next].line - file.linesBefore - 1];
             continue;
-        LineReader reader(files[i].path);
+        }
+        if (next == spots.size() || spots[next].line > last)
+            continue;
+        LineReader reader(file.path);
         std::string text;
+        std::uint32_t line = file.linesBefore;
         while (next < spots.size() && spots[next].line <= last && reader.Next(text)) {
             ++line;
             for (; next < spots.size() && spots[next].line == line; ++next)

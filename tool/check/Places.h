@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "tool/diagnostics/Diagnostic.h"
+#include "tool/diagnostics/LineTokens.h"
 
 namespace Checks {
 
@@ -17,6 +18,9 @@ struct Spot {
     std::uint16_t length = 0;
 };
 
+/// Where a token stands, or its line as a whole if that is too far to the right for a spot.
+Spot SpotOf(LineTokens const &tokens, int token, std::uint32_t line);
+
 /// Who was made, connected or given a constant where.
 class Places {
 public:
@@ -25,8 +29,9 @@ public:
 
     /// The lines to come are of this file; `shownName` is what the user called it.
     void BeginFile(std::string const &path, std::string const &shownName);
-    /// Counts a line and gives its number.
-    std::uint32_t NextLine() { return ++lineCount; }
+    /// Counts a line and gives its number. Of standard input the text is kept, since nobody can
+    /// read it again.
+    std::uint32_t NextLine(std::string const &text);
 
     void Put(Event event, void const *object, Spot spot) {
         entries.push_back({KeyOf(event, object), spot});
@@ -36,8 +41,8 @@ public:
     Spot Find(Event event, void const *object, std::uint32_t before = EVER) const;
 
     Place GetPlace(Spot spot) const;
-    /// Gives each diagnostic with a column the text of its line, as far as files can be read again.
-    /// They have to be in order of their places.
+    /// Gives each diagnostic the text of its line, as far as files can be read again. They have to
+    /// be in order of their places.
     void AddSources(std::vector<Diagnostic> &diagnostics, std::vector<Spot> const &spots) const;
 
 private:
@@ -49,6 +54,7 @@ private:
         std::string path;
         std::string shownName;
         std::uint32_t linesBefore;
+        std::vector<std::string> lines; ///< of standard input
     };
 
     /// Objects stand at even addresses of eight bytes: the low bits are free for the event.

@@ -9,19 +9,11 @@ namespace {
 constexpr char const *CONNECT = "CONNECT SIGNAL";
 constexpr char const *ASSIGN = "ASSIGN CONSTANT";
 
-std::uint16_t Short(unsigned number) {
-    return static_cast<std::uint16_t>(std::min(number, 0xFFFFU));
-}
-
 bool Contains(std::string_view text, std::string_view part) {
     return text.find(part) != std::string_view::npos;
 }
 
 } // namespace
-
-Spot Recorder::SpotOf(int token) const {
-    return {lineNumber, Short(tokens->GetColumn(token)), Short(tokens->GetLength(token))};
-}
 
 void Recorder::Before(LineTokens const &lineTokens, CommandHelp const *command, int words,
                       std::uint32_t line) {
@@ -46,7 +38,7 @@ void Recorder::Before(LineTokens const &lineTokens, CommandHelp const *command, 
         bool const module = Contains(keyword, "MODULE");
         attributeToken = firstArgument + (module ? 0 : 1);
         if (keyword.substr(0, 4) == "ADD " &&
-            SameFolded(lineTokens.At(attributeToken).substr(0, 6), "-TYPE="))
+            SameIgnoringCase(lineTokens.At(attributeToken).substr(0, 6), "-TYPE="))
             ++attributeToken;
         holder = HolderOf(firstArgument, keyword);
         if (holder && holder->GetAttr(Normal(lineTokens.At(attributeToken)).c_str()))
@@ -113,6 +105,8 @@ void Recorder::NamePin(int token) {
     if (Instance const *const instance = model.GetInstance(owner.c_str()))
         pin = instance->GetPin(pinName.c_str());
     formerNet = pin ? pin->GetSignal() : nullptr;
+    if (formerNet && IsOfOpenPin(*formerNet))
+        formerNet = nullptr;
     formerNetName = formerNet ? formerNet->GetNameRef() : Text();
 }
 
@@ -172,13 +166,13 @@ void Recorder::RecordNets() {
 void Recorder::CompareSpelling(Named const &named, Signal const &signal) {
     std::string const typed = Normal(named.name);
     std::string_view const made = signal.GetNameRef().View();
-    if (typed == made || !SameFolded(typed, made) || named.origin == Origin::DECLARED ||
+    if (typed == made || !SameIgnoringCase(typed, made) || named.origin == Origin::DECLARED ||
         !respelled.insert(&signal).second)
         return;
     findings.Add({Id::CASE_DIFFERS,
                   SpotOf(named.token),
-                  "net " + Quote(typed),
-                  {{&signal, "it is called " + Quote(made) + " here"}}});
+                  "net " + Quoted(typed),
+                  {{&signal, "it is called " + Quoted(made) + " here"}}});
 }
 
 void Recorder::RecordPin() {
@@ -199,10 +193,10 @@ void Recorder::RecordPin() {
         findings.Add(
             {Id::PIN_MOVED,
              SpotOf(pinToken),
-             "pin " + Quote(tokens->At(pinToken)),
+             "pin " + Quoted(tokens->At(pinToken)),
              {{pin, "the former net was given here", Places::CONNECTED, lineNumber}},
              BOTH,
-             "from " + Quote(formerNetName.View()) + " to " + Quote(net->GetNameRef().View())});
+             "from " + Quoted(formerNetName.View()) + " to " + Quoted(net->GetNameRef().View())});
     }
     places.Put(Places::CONNECTED, pin, SpotOf(pinToken));
 }
@@ -220,10 +214,10 @@ void Recorder::RecordWidening(Widened const &widened) {
     if (!widened.losses.empty())
         findings.Add({Id::WIDENED_BUS,
                       SpotOf(widened.token),
-                      "bus " + Quote(widened.name),
+                      "bus " + Quoted(widened.name),
                       {{widened.bus, "it was made here", Places::MADE, lineNumber}},
                       BOTH,
-                      "to " + Quote(wide->GetNameRef().View()) + "; lost: " + widened.losses});
+                      "to " + Quoted(wide->GetNameRef().View()) + "; lost: " + widened.losses});
     for (auto &[movedPin, net] : moved) {
         Signal *const now = movedPin->GetSignal();
         if (net == widened.bus)
@@ -231,7 +225,7 @@ void Recorder::RecordWidening(Widened const &widened) {
         else if (now && now != net && now->GetNameRef() == widened.name.c_str() && movedPin != pin)
             findings.Add({Id::PIN_RETURNS,
                           SpotOf(widened.token),
-                          "pin " + Quote(movedPin->GetNameRef().View()),
+                          "pin " + Quoted(movedPin->GetNameRef().View()),
                           {{movedPin, "it was connected here", Places::CONNECTED, lineNumber}},
                           BOTH,
                           "widening takes along all that was ever connected"});

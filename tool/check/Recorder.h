@@ -50,7 +50,7 @@ private:
         int token;
     };
 
-    Spot SpotOf(int token) const;
+    Spot SpotOf(int token) const { return Checks::SpotOf(*tokens, token, lineNumber); }
     void Name(std::string const &name, int token);
     void NameMember(std::string const &name, int token, Origin origin);
     void WatchBus(std::string const &name, int token);

@@ -1,28 +1,22 @@
 #include "tool/check/Rewriting.h"
 
+#include <fcntl.h>
+#include <utility>
+
 using namespace Vesk_Hdl;
 
 namespace Checks {
 
 namespace {
 
-using VerilogOption = HdlOptions::VerilogOption;
-
-template <class Objects> void SetCase(Objects objects, VerilogOption::CaseType nameCase) {
-    if (nameCase != VerilogOption::CASE_DEFAULT)
-        ForEach(objects, [nameCase](Object *object) {
-            Text name = object->GetName();
-            if (nameCase == VerilogOption::CASE_UPPER)
-                name.MakeUpper();
-            else
-                name.MakeLower();
-            object->SetName(name);
-        });
-}
+class Nowhere : public WriteOpener {
+public:
+    int Open(char const *, bool) override { return ::open("/dev/null", O_WRONLY | O_CLOEXEC); }
+};
 
 } // namespace
 
-void Rewrite(Model &model, Design const &design, Places &places, Languages language) {
+void Rewrite(Session &session, Design const &design, Places &places, std::string const &line) {
     // A dummy signal was made where its port was.
     std::vector<std::pair<Text, Spot>> dummyNames;
     auto const note = [&](Signal const &signal) {
@@ -33,17 +27,13 @@ void Rewrite(Model &model, Design const &design, Places &places, Languages langu
         if (auto const *const bus = dynamic_cast<Bus const *>(signal))
             ForEach(bus->GetBusSliceIterator(), [&](Signal const *part) { note(*part); });
     }
-    Netlist &netlist = *model.GetNetlist();
-    netlist.CreateVhdlDummySignals();
+    Nowhere nowhere;
+    session.GetModel().SetWriteOpener(&nowhere);
+    session.RunLine(line, {});
+    session.GetModel().SetWriteOpener(nullptr);
     for (auto const &[name, spot] : dummyNames)
-        if (Signal const *const made = netlist.GetSignal(name))
+        if (Signal const *const made = design.netlist.GetSignal(name))
             places.Put(Places::MADE, made, spot);
-    if (language != VERILOG)
-        return;
-    VerilogOption const &verilog = design.options.verilogOption;
-    SetCase(netlist.GetSignalIterator(), verilog.signalCase);
-    SetCase(netlist.GetComponentIterator(), verilog.componentCase);
-    SetCase(netlist.GetInstanceIterator(), verilog.instanceCase);
 }
 
 } // namespace Checks

@@ -1,11 +1,13 @@
 #pragma once
 
 #include "tool/check/Design.h"
+#include "tool/session/Session.h"
 
 namespace Checks {
 
-/// Does to the netlist what a write does to it for good, as far as later lines can notice: ports
-/// give their connections to dummy signals, and a Verilog file changes the case of names.
-void Rewrite(Vesk_Hdl::Model &model, Design const &design, Places &places, Languages language);
+/// Lets a line that writes do to the netlist what it does to it for good: ports give their
+/// connections to dummy signals, open pins may get nets, a Verilog file changes the case of names.
+/// Its text is thrown away.
+void Rewrite(Session &session, Design const &design, Places &places, std::string const &line);
 
 } // namespace Checks

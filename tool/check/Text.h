@@ -4,6 +4,7 @@
 #include <string>
 #include <string_view>
 
+#include "tool/diagnostics/Words.h"
 #include "vesk_hdl/Vesk_Hdl.h"
 
 // Names as the checks compare and show them.
@@ -11,22 +12,6 @@
 namespace Checks {
 
 using Text = Basis::StringBase<char>;
-
-inline std::string Quote(std::string_view text) { return '"' + std::string(text) + '"'; }
-
-inline char Lower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; }
-
-inline std::string Folded(std::string_view text) {
-    std::string folded(text);
-    std::transform(folded.begin(), folded.end(), folded.begin(), Lower);
-    return folded;
-}
-
-inline bool SameFolded(std::string_view left, std::string_view right) {
-    return left.size() == right.size() &&
-           std::equal(left.begin(), left.end(), right.begin(),
-                      [](char a, char b) { return Lower(a) == Lower(b); });
-}
 
 /// What stands in front of the brackets of a net's name, if it has any; no copy.
 inline std::string_view BaseOf(std::string_view name) {
@@ -37,6 +22,15 @@ inline std::string_view BaseOf(std::string_view name) {
 }
 inline std::string_view BaseOf(Vesk_Hdl::Object const &object) {
     return BaseOf(object.GetNameRef().View());
+}
+
+/// Whether the net was made by a write for a pin that was open.
+inline bool IsOfOpenPin(Vesk_Hdl::Signal const &net) {
+    return BaseOf(net).ends_with("_openSignal");
+}
+/// Whether the net was made for a pin that was given a constant.
+inline bool IsTieOfPin(Vesk_Hdl::Signal const &net) {
+    return BaseOf(net).ends_with("_CONST_SIGNAL");
 }
 
 /// The bits of a bus, a slice or one bit, as its name tells them.
@@ -87,11 +81,11 @@ inline bool SplitPin(std::string_view token, std::string &owner, std::string &pi
 
 inline std::string PinName(Vesk_Hdl::Object const &owner, Vesk_Hdl::Pin const &pin) {
     return "pin " +
-           Quote(std::string(owner.GetNameRef().View()) + "." + pin.GetNameRef().GetText());
+           Quoted(std::string(owner.GetNameRef().View()) + "." + pin.GetNameRef().GetText());
 }
 
 inline std::string NetName(Vesk_Hdl::Signal const &signal) {
-    return (signal.IsPort() ? "port " : "net ") + Quote(signal.GetNameRef().View());
+    return (signal.IsPort() ? "port " : "net ") + Quoted(signal.GetNameRef().View());
 }
 
 } // namespace Checks

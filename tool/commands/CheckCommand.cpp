@@ -1,5 +1,6 @@
 #include "tool/commands/CheckCommand.h"
 
+#include <algorithm>
 #include <cstring>
 #include <iostream>
 #include <memory>
@@ -7,13 +8,8 @@
 
 #include <CLI/CLI.hpp>
 
-#include "tool/check/Design.h"
-#include "tool/check/Rewriting.h"
-#include "tool/diagnostics/Blame.h"
+#include "tool/check/Checker.h"
 #include "tool/session/LineReader.h"
-#include "tool/session/Session.h"
-
-using namespace Vesk_Hdl;
 
 namespace {
 
@@ -30,161 +26,49 @@ struct CheckOptions {
     ReportOptions report;
 };
 
-/// The lines of all files on one design, and the checks at each line that writes.
-class CheckRun {
-public:
-    explicit CheckRun(CheckOptions const &checkOptions)
-        : options(checkOptions), reporter(std::cerr, checkOptions.report.GetStyle()),
-          session(checkOptions.modelName), findings(checkOptions.strict),
-          recorder(session.GetModel(), places, findings) {
-        for (Checks::Row const &row : Checks::All()) {
-            auto const isIn = [&row](std::vector<std::string> const &names) {
-                return std::find(names.begin(), names.end(), row.name) != names.end();
-            };
-            if (isIn(options.off) || (!options.only.empty() && !isIn(options.only)))
-                findings.SwitchOff(row.id);
-        }
-        requested = options.language == "vhdl"      ? Checks::VHDL
-                    : options.language == "verilog" ? Checks::VERILOG
-                    : options.language == "both"    ? Checks::BOTH
-                                                    : Checks::NO_LANGUAGE;
-    }
+/// The names of the checks that nobody wants told.
+bool IsOff(CheckOptions const &options, Checks::Row const &row) {
+    auto const isIn = [&row](std::vector<std::string> const &names) {
+        return std::find(names.begin(), names.end(), row.name) != names.end();
+    };
+    return isIn(options.off) || (!options.only.empty() && !isIn(options.only));
+}
 
-    int Run() {
-        for (std::string const &file : options.files)
-            RunFile(file);
-        if (changed) {
-            Checks::Languages const all = written != Checks::NO_LANGUAGE ? written : Checks::BOTH;
-            CheckDesign(requested != Checks::NO_LANGUAGE ? requested : all);
-        }
-        findings.Deliver(reporter, places);
-        if (reporter.GetErrorCount() + reporter.GetWarningCount() > 0)
-            reporter.ReportCount();
-        return failed || reporter.GetErrorCount() > 0 ? SOMETHING_REFUSED : ALL_WELL;
-    }
+int Check(CheckOptions const &options) {
+    Checks::Languages const requested = options.language == "vhdl"      ? Checks::VHDL
+                                        : options.language == "verilog" ? Checks::VERILOG
+                                        : options.language == "both"    ? Checks::BOTH
+                                                                        : Checks::NO_LANGUAGE;
+    Reporter reporter(std::cerr, options.report.GetStyle());
+    Checks::Checker checker(options.modelName, requested);
+    for (Checks::Row const &row : Checks::All())
+        if (IsOff(options, row))
+            checker.SwitchOff(row.id);
 
-private:
-    void RunFile(std::string const &file) {
+    auto const refuse = [&reporter](Diagnostic const &diagnostic) { reporter.Report(diagnostic); };
+    for (std::string const &file : options.files) {
         LineReader reader(file);
         Place place{file == STANDARD_STREAM ? "<stdin>" : file};
-        places.BeginFile(file, place.file);
+        checker.BeginFile(file, place.file);
         std::string line;
         while (reader.Next(line)) {
             ++place.line;
-            RunLine(line, place);
+            if (auto const diagnostic = checker.RunLine(line, place))
+                refuse(*diagnostic);
         }
-        if (reader.GetError() == 0)
-            return;
-        Refuse(About(place.file, std::string("cannot read: ") + std::strerror(reader.GetError())));
+        if (reader.GetError() != 0)
+            refuse(
+                About(place.file, std::string("cannot read: ") + std::strerror(reader.GetError())));
     }
-
-    void Refuse(Diagnostic const &diagnostic) {
-        failed = true;
-        reporter.Report(diagnostic);
+    for (Diagnostic &finding : checker.Finish()) {
+        if (options.strict)
+            finding.severity = Severity::ERROR;
+        reporter.Report(finding);
     }
-
-    void RunLine(std::string const &line, Place const &place) {
-        std::uint32_t const number = places.NextLine();
-        LineTokens const tokens(line);
-        int words = 0;
-        CommandHelp const *const command = KeywordOf(tokens.GetTokens(), words);
-        bool const isVhdl = command && std::strcmp(command->keyword, "WRITE VHDL") == 0;
-        bool const isVerilog = command && std::strcmp(command->keyword, "WRITE VERILOG") == 0;
-        if ((isVhdl || isVerilog) && line.find('\0') == std::string::npos) {
-            PassWrite(line, place, tokens, number, isVhdl ? Checks::VHDL : Checks::VERILOG);
-            return;
-        }
-        if (tokens.GetSize() > 0) {
-            changed = true;
-            RewriteDesign();
-        }
-        // What happens while lines run concerns whatever will be written.
-        findings.SetLanguages(requested != Checks::NO_LANGUAGE ? requested : Checks::BOTH);
-        recorder.Before(tokens, command, words, number);
-        std::optional<Diagnostic> const diagnostic = session.RunLine(line, place);
-        recorder.After(!diagnostic);
-        if (diagnostic)
-            Refuse(*diagnostic);
-    }
-
-    /// A line that writes: its arguments are read and what it would write is checked.
-    void PassWrite(std::string const &line, Place const &place, LineTokens const &tokens,
-                   std::uint32_t number, Checks::Languages language) {
-        std::unique_ptr<Command> const command(
-            factory.CreateCommand(&session.GetModel(), tokens.GetTokens()));
-        if (!command->ParseArguments(tokens.GetTokens())) {
-            std::string const text = std::string(command->GetKeyword()) + ": Invalid Arguments.";
-            Refuse(BlameRefusal(line, place, text, session.GetModel()));
-            return;
-        }
-        written |= language;
-        changed = false;
-        findings.SetLanguages(requested != Checks::NO_LANGUAGE ? requested : language);
-        CheckWriteLine(tokens, number);
-        CheckDesign(requested != Checks::NO_LANGUAGE ? requested : language);
-        lastWritten |= language;
-    }
-
-    /// What the lines that wrote did to the design, for the first line behind them: most often
-    /// there is none.
-    void RewriteDesign() {
-        for (Checks::Languages const language : {Checks::VHDL, Checks::VERILOG})
-            if ((lastWritten & language) != 0)
-                Checks::Rewrite(session.GetModel(), DesignNow(), places, language);
-        lastWritten = Checks::NO_LANGUAGE;
-    }
-
-    Checks::Design DesignNow() {
-        return Checks::Design(session.GetModel(), places, recorder, findings);
-    }
-
-    /// The number of tokens alone tells which one names the file.
-    void CheckWriteLine(LineTokens const &tokens, std::uint32_t number) {
-        constexpr int FIRST = 2;
-        int const size = tokens.GetSize();
-        int const file = size == FIRST + 2 || size == FIRST + 3 ? size - 1 : FIRST;
-        auto const add = [&](Checks::Id id, int token) {
-            findings.Add({id,
-                          {number, static_cast<std::uint16_t>(tokens.GetColumn(token)),
-                           static_cast<std::uint16_t>(tokens.GetLength(token))},
-                          Checks::Quote(tokens.At(token))});
-        };
-        if (tokens.At(file).substr(0, 1) == "-")
-            add(Checks::Id::WRITE_FILE_NAME, file);
-        for (int token = FIRST; token < size; ++token) {
-            auto const is = [&](char const *word) {
-                return Checks::SameFolded(tokens.At(token), word);
-            };
-            bool const known = is("-APPEND") || is("-OVERWRITE") || is("-NOHEADER");
-            if (token > file || (token < file && !known))
-                add(Checks::Id::WRITE_OPTION, token);
-        }
-    }
-
-    void CheckDesign(Checks::Languages languages) {
-        findings.SetLanguages(languages);
-        Checks::Design const design = DesignNow();
-        Checks::CheckNames(design);
-        Checks::CheckNets(design);
-        Checks::CheckPins(design);
-        Checks::CheckConnections(design);
-        Checks::CheckConstants(design);
-        Checks::CheckAttributes(design);
-    }
-
-    CheckOptions const &options;
-    Reporter reporter;
-    Session session;
-    CommandFactory factory;
-    Checks::Places places;
-    Checks::Findings findings;
-    Checks::Recorder recorder;
-    Checks::Languages requested = Checks::NO_LANGUAGE;
-    Checks::Languages written = Checks::NO_LANGUAGE;
-    Checks::Languages lastWritten = Checks::NO_LANGUAGE; ///< and not yet rewritten for it
-    bool changed = false;                                ///< since the last line that wrote
-    bool failed = false;
-};
+    if (reporter.GetErrorCount() + reporter.GetWarningCount() > 0)
+        reporter.ReportCount();
+    return reporter.GetErrorCount() > 0 ? SOMETHING_REFUSED : ALL_WELL;
+}
 
 int List(bool asMarkdown) {
     if (asMarkdown)
@@ -200,9 +84,8 @@ int List(bool asMarkdown) {
             std::cout << "| `" << row.name << "` | " << language << " | ... " << row.sentence
                       << " | " << row.hint << " |\n";
         else
-            std::cout << row.name << " (" << language << ", "
-                      << (row.severity == Severity::ERROR ? "error" : "warning") << ")\n  ... "
-                      << row.sentence << "\n  hint: " << row.hint << '\n';
+            std::cout << row.name << " (" << language << ")\n  ... " << row.sentence
+                      << "\n  hint: " << row.hint << '\n';
     }
     return ALL_WELL;
 }
@@ -239,8 +122,6 @@ void AddCheckCommand(CLI::App &app, Action &action) {
     check.callback([options, &action] {
         if (!options->list && options->files.empty())
             throw CLI::RequiredError("FILE");
-        action = [options] {
-            return options->list ? List(options->markdown) : CheckRun(*options).Run();
-        };
+        action = [options] { return options->list ? List(options->markdown) : Check(*options); };
     });
 }

@@ -7,19 +7,22 @@
 
 using namespace Vesk_Hdl;
 
+namespace {
+
+char Lower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; }
+
+} // namespace
+
 bool SameIgnoringCase(std::string_view left, std::string_view right) {
     return left.size() == right.size() &&
-           std::equal(left.begin(), left.end(), right.begin(), [](char a, char b) {
-               auto const lower = [](char c) { return c >= 'A' && c <= 'Z' ? c - 'A' + 'a' : c; };
-               return lower(a) == lower(b);
-           });
+           std::equal(left.begin(), left.end(), right.begin(),
+                      [](char a, char b) { return Lower(a) == Lower(b); });
 }
 
-std::string Lowercase(std::string text) {
-    for (char &c : text)
-        if (c >= 'A' && c <= 'Z')
-            c = static_cast<char>(c - 'A' + 'a');
-    return text;
+std::string Lowercase(std::string_view text) {
+    std::string lower(text);
+    std::transform(lower.begin(), lower.end(), lower.begin(), Lower);
+    return lower;
 }
 
 /// "A, B or C"

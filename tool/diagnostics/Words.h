@@ -9,7 +9,7 @@
 // Words of people and of the command language.
 
 bool SameIgnoringCase(std::string_view left, std::string_view right);
-std::string Lowercase(std::string text);
+std::string Lowercase(std::string_view text);
 std::string Quoted(std::string_view text);
 /// The words between blanks.
 std::vector<std::string> WordsOf(std::string_view text);

@@ -140,6 +140,9 @@ def options():
     """Exit codes, and what the options leave of four findings and a refused line."""
     design = "ADD PORT wire in\nADD PORT signal in\nADD SIGNAL n\nADD SIGNAL n\nADD COMPONENT C\n"
     good = "SET NETLIST NAME t\nADD PORT a in\n"
+    # A write gives open pins nets, of which no line knows.
+    opened = (good + "ADD COMPONENT C\nADD PIN C A in\nADD PIN C B out\nADD INSTANCE C u\n"
+              "SET OPEN PIN false\nWRITE VHDL f.vhd\nCONNECT SIGNAL a u.A\nWRITE VHDL f.vhd\n")
     n, c, w, s = "3:unused-net", "5:unused-component", "1:reserved-word", "2:reserved-word"
     rows = [
         (design, 1, [w, s, n, c], []),
@@ -151,6 +154,7 @@ def options():
         (design + "WRITE VERILOG f.v\n", 1, [w, s, n, c], ["--language", "both"]),
         (design, 1, [w, s], ["--off", "unused-net,unused-component"]),
         (design, 1, [w, s, c], ["--only", "unused-component", "--only", "reserved-word"]),
+        (opened, 0, [], []),
         (good, 2, [], ["--off", "nonsense"]),
         (good, 2, [], ["--language", "C"]),
     ]
@@ -164,8 +168,15 @@ def options():
         refused = [one["line"] for one in said if "finding" not in one]
         if (done.returncode, found) != (code, wanted) or refused != [4] * (design in commands):
             faults.append(f"{arguments}: exit code {done.returncode}, {found}, refused {refused}")
-    if list(pathlib.Path().glob("f.v")):
+    if list(pathlib.Path().glob("f.v*")):
         faults.append("something was written")
+    with tempfile.TemporaryDirectory() as folder:
+        file = pathlib.Path(folder) / "f.cmd"
+        file.write_text(design)
+        from_file = subprocess.run([TOOL, "check", file], capture_output=True, text=True)
+        from_input = subprocess.run([TOOL, "check", "-"], input=design, capture_output=True, text=True)
+        if from_input.stderr != from_file.stderr.replace(str(file), "<stdin>"):
+            faults.append(f"from standard input: {from_input.stderr}")
     return faults
 
 

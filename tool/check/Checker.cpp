@@ -1,0 +1,97 @@
+#include "tool/check/Checker.h"
+
+#include <cstring>
+#include <memory>
+#include <utility>
+
+#include "tool/check/Rewriting.h"
+#include "tool/diagnostics/Blame.h"
+#include "tool/diagnostics/Words.h"
+
+using namespace Vesk_Hdl;
+
+namespace Checks {
+
+std::optional<Diagnostic> Checker::RunLine(std::string const &line, Place const &place) {
+    std::uint32_t const number = places.NextLine(line);
+    LineTokens const tokens(line);
+    int words = 0;
+    CommandHelp const *const command = KeywordOf(tokens.GetTokens(), words);
+    bool const isVhdl = command && std::strcmp(command->keyword, "WRITE VHDL") == 0;
+    bool const isVerilog = command && std::strcmp(command->keyword, "WRITE VERILOG") == 0;
+    if ((isVhdl || isVerilog) && line.find('\0') == std::string::npos)
+        return PassWrite(line, place, tokens, number, isVhdl ? VHDL : VERILOG);
+    if (tokens.GetSize() > 0) {
+        changed = true;
+        RewriteDesign();
+    }
+    // What happens while lines run concerns whatever will be written.
+    findings.SetLanguages(RequestedOr(BOTH));
+    recorder.Before(tokens, command, words, number);
+    std::optional<Diagnostic> diagnostic = session.RunLine(line, place);
+    recorder.After(!diagnostic);
+    return diagnostic;
+}
+
+std::vector<Diagnostic> Checker::Finish() {
+    if (changed)
+        CheckDesign(RequestedOr(written != NO_LANGUAGE ? written : BOTH));
+    return findings.Take(places);
+}
+
+/// A line that writes: its arguments are read and what it would write is checked.
+std::optional<Diagnostic> Checker::PassWrite(std::string const &line, Place const &place,
+                                             LineTokens const &tokens, std::uint32_t number,
+                                             Languages language) {
+    std::unique_ptr<Command> const command(
+        factory.CreateCommand(&session.GetModel(), tokens.GetTokens()));
+    if (!command->ParseArguments(tokens.GetTokens())) {
+        std::string const text = std::string(command->GetKeyword()) + ": Invalid Arguments.";
+        return BlameRefusal(line, place, text, session.GetModel());
+    }
+    written |= language;
+    changed = false;
+    findings.SetLanguages(RequestedOr(language));
+    CheckWriteLine(tokens, number);
+    CheckDesign(RequestedOr(language));
+    lastWrites.push_back(line);
+    return std::nullopt;
+}
+
+/// What the lines that wrote did to the design, for the first line behind them: most often there
+/// is none.
+void Checker::RewriteDesign() {
+    for (std::string const &line : std::exchange(lastWrites, {}))
+        Rewrite(session, DesignNow(), places, line);
+}
+
+/// The number of tokens alone tells which one names the file.
+void Checker::CheckWriteLine(LineTokens const &tokens, std::uint32_t number) {
+    constexpr int FIRST = 2;
+    int const size = tokens.GetSize();
+    int const file = size == FIRST + 2 || size == FIRST + 3 ? size - 1 : FIRST;
+    auto const add = [&](Id id, int token) {
+        findings.Add({id, SpotOf(tokens, token, number), Quoted(tokens.At(token))});
+    };
+    if (tokens.At(file).substr(0, 1) == "-")
+        add(Id::WRITE_FILE_NAME, file);
+    for (int token = FIRST; token < size; ++token) {
+        auto const is = [&](char const *word) { return SameIgnoringCase(tokens.At(token), word); };
+        bool const known = is("-APPEND") || is("-OVERWRITE") || is("-NOHEADER");
+        if (token > file || (token < file && !known))
+            add(Id::WRITE_OPTION, token);
+    }
+}
+
+void Checker::CheckDesign(Languages languages) {
+    findings.SetLanguages(languages);
+    Design const design = DesignNow();
+    CheckNames(design);
+    CheckNets(design);
+    CheckPins(design);
+    CheckConnections(design);
+    CheckConstants(design);
+    CheckAttributes(design);
+}
+
+} // namespace Checks

@@ -1,0 +1,56 @@
+#pragma once
+
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "tool/check/Design.h"
+#include "tool/session/Session.h"
+
+namespace Checks {
+
+/// The lines of command files on one design, and the checks at each line that would write.
+class Checker {
+public:
+    /// Without languages, those that the lines write.
+    Checker(std::string const &modelName, Languages requestedLanguages)
+        : session(modelName), recorder(session.GetModel(), places, findings),
+          requested(requestedLanguages) {}
+
+    void SwitchOff(Id id) { findings.SwitchOff(id); }
+    /// The lines to come are of this file; `shownName` is what the user called it.
+    void BeginFile(std::string const &path, std::string const &shownName) {
+        places.BeginFile(path, shownName);
+    }
+    /// Runs a line, but for one that writes: there, nothing is written. Tells what is wrong if it
+    /// is refused.
+    std::optional<Diagnostic> RunLine(std::string const &line, Place const &place);
+    /// Behind the last line: all that was found, in the order of the lines.
+    std::vector<Diagnostic> Finish();
+
+    Vesk_Hdl::Model &GetModel() { return session.GetModel(); }
+
+private:
+    std::optional<Diagnostic> PassWrite(std::string const &line, Place const &place,
+                                        LineTokens const &tokens, std::uint32_t number,
+                                        Languages language);
+    void RewriteDesign();
+    void CheckWriteLine(LineTokens const &tokens, std::uint32_t number);
+    void CheckDesign(Languages languages);
+    Design DesignNow() { return Design(session.GetModel(), places, recorder, findings); }
+    Languages RequestedOr(Languages others) const {
+        return requested != NO_LANGUAGE ? requested : others;
+    }
+
+    Session session;
+    Vesk_Hdl::CommandFactory factory;
+    Places places;
+    Findings findings;
+    Recorder recorder;
+    Languages requested;
+    Languages written = NO_LANGUAGE;
+    std::vector<std::string> lastWrites; ///< lines for which the design is not yet rewritten
+    bool changed = false;                ///< since the last line that wrote
+};
+
+} // namespace Checks

@@ -26,7 +26,7 @@ struct CheckOptions {
     ReportOptions report;
 };
 
-/// The names of the checks that nobody wants told.
+/// Whether the user wants nothing told of a check.
 bool IsOff(CheckOptions const &options, Checks::Row const &row) {
     auto const isIn = [&row](std::vector<std::string> const &names) {
         return std::find(names.begin(), names.end(), row.name) != names.end();

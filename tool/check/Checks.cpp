@@ -127,9 +127,8 @@ std::vector<Row> const ROWS = {
      "mixes ports so that an in port is driven or an out port is read",
      "connect the ports of one direction through inner nets"},
     {Id::BYPASSED_DUMMY, "bypassed-dummy", BOTH,
-     "drives a part of an out bus that is read elsewhere: the readers get a dummy signal that "
-     "nothing drives",
-     "drive an inner bus and assign the port from it"},
+     "stays on a net whose readers get a dummy signal, which nothing drives",
+     "drive an inner net and assign this one from it with CONNECT SIGNAL"},
     {Id::PIN_RETURNS, "pin-returns", BOTH,
      "was moved away from its first net and will come back to it",
      "connect each pin once, to its last net"},

@@ -116,7 +116,7 @@ private:
             Add(Id::IN_PORT_IN_COMPOUND, member, BOTH);
         if (polarity == Polarity::OUTPUT && reads)
             Add(Id::OUT_PORT_IN_COMPOUND, member, VHDL);
-        if (polarity == Polarity::OUTPUT && drives && own)
+        if (drives && own && own->portTakesDummy)
             Add(Id::BYPASSED_DUMMY, member, BOTH);
     }
 
@@ -154,6 +154,17 @@ void CheckReturns(Design const &design, Signal const &signal) {
     });
 }
 
+/// A constant stays where it is when the readers of its net go to a dummy signal.
+void CheckConstantBesideDummy(Design const &design, Signal const &signal) {
+    if (!signal.HasConstantValue() || !design.IsInside(signal))
+        return;
+    std::string const net = NetName(signal);
+    design.findings.Add({Id::BYPASSED_DUMMY,
+                         design.ConstantAt(signal),
+                         "constant of " + net,
+                         {{&signal, net + " is here"}}});
+}
+
 } // namespace
 
 void CheckConnections(Design const &design) {
@@ -164,10 +175,14 @@ void CheckConnections(Design const &design) {
             CompoundChecker(design, *compound).Run();
     });
     for (auto const &[signal, dummy] : design.dummies) {
-        CheckReturns(design, *signal);
+        auto const checkPart = [&](Signal const *part) {
+            CheckReturns(design, *part);
+            if (dummy.portTakesDummy)
+                CheckConstantBesideDummy(design, *part);
+        };
+        checkPart(signal);
         if (auto const *const bus = dynamic_cast<Bus const *>(signal))
-            ForEach(bus->GetBusSliceIterator(),
-                    [&](Signal const *part) { CheckReturns(design, *part); });
+            ForEach(bus->GetBusSliceIterator(), checkPart);
     }
 }
 

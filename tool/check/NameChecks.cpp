@@ -312,7 +312,9 @@ private:
         std::string const base = Cased(BaseOf(bus), nameCase);
         std::string const partBase =
             isInside ? Cased(BaseOf(part), nameCase) : std::string(BaseOf(part));
-        if (base == partBase || !design.IsWritten(part))
+        // The dummy of a part is inside and stands in its place.
+        bool const isReplaced = !isInside && design.DummyOf(&bus);
+        if (base == partBase || isReplaced || !design.IsWritten(part))
             return;
         Id const id = isInside || nameCase == VerilogOption::CASE_DEFAULT ? Id::BIT_IN_OTHER_CASE
                                                                           : Id::WIDENED_SLICE_CASE;

@@ -42,6 +42,11 @@ TEST(CommandFactory, TheLongestKeywordWins) {
     factory.AddCommandCreator("late", TellingCommand<1>::Make);
     EXPECT_EQ(1, CreatorOf(copy, "LATE"));
     EXPECT_EQ(nullptr, factory.CreateCommand(nullptr, "unknown"));
+    std::string endless = "word";
+    for (int i = 0; i < 100000; ++i)
+        endless += " word";
+    factory.AddCommandCreator(endless.c_str(), TellingCommand<1>::Make);
+    EXPECT_EQ(1, CreatorOf(factory, ("'" + endless + "'").c_str()));
 }
 
 /// A command that runs another line before it looks at its own.

@@ -91,7 +91,10 @@ TEST(AttributeHolder, CopiesAreDeep) {
     user->SetUserType(nullptr);
     EXPECT_EQ("A=x NONE NONE; B(T)=y NONE NONE", AttrsOf(target));
     target.AddAttr(new AttributeString("C", ""));
+    Iterator<Attribute *> walk = target.GetAttrIterator();
     target = source;
+    ASSERT_TRUE(walk.HasMore()); // the walk is over the holder's array, whatever stands in it
+    EXPECT_STREQ("A", walk.Current()->GetName());
     target = *&target;
     EXPECT_EQ("A=x NONE NONE; B()=y NONE NONE", AttrsOf(target));
     EXPECT_EQ(nullptr, target.GetAttr("C"));

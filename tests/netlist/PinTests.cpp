@@ -52,6 +52,14 @@ TEST(Component, PinsKeepOrderAndTheFirstOfTwoIsFound) {
     EXPECT_TRUE(renamed.GetPin("Z") && !renamed.GetPin("p1"));
 }
 
+TEST(Component, APinRenamedThroughItsBaseIsFoundByItsName) {
+    Component component("C");
+    for (int i = 0; i < 40; ++i)
+        component.AddPin(("p" + std::to_string(i)).c_str(), Polarity::OUTPUT, "");
+    static_cast<Object &>(*component.GetPin("p3")) = Component("Z");
+    EXPECT_TRUE(component.GetPin("Z") && !component.GetPin("p3"));
+}
+
 /// Random instances, sorted twice: their pins' names.
 std::string SortedPins() {
     std::mt19937 random(3);

@@ -2,6 +2,8 @@
 // kind of owner: what a family reads is told once, as a struct with a Parse, and its members are a
 // table of rows: class, owner, index of the first token behind the keyword, operations of Model.
 
+#include <string>
+
 #include "vesk_hdl/engine/Commands.h"
 #include "vesk_hdl/engine/JoinTokens.h"
 #include "vesk_hdl/engine/PinReference.h"
@@ -43,12 +45,13 @@ struct NamedOwner {
 /// A pin of a component or an instance, HOLDER.PIN.
 struct PinOwner {
     static constexpr int TOKENS = 1;
-    bool Parse(Text const &token) { return pin.Parse(token.View()); }
+    bool Parse(Text const &token) { return SplitPinReference(token.View(), holder, pin); }
     template <class Operation, class... Rest> void Call(Model &model, Operation op, Rest... rest) {
-        (model.*op)(pin.GetHolder(), pin.GetPin(), rest...);
+        (model.*op)(holder.c_str(), pin.c_str(), rest...);
     }
 
-    PinReference pin;
+    std::string holder;
+    std::string pin;
 };
 
 /// If the token begins with the prefix, in any case, the rest of it goes into `rest`.

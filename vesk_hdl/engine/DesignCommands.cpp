@@ -1,6 +1,8 @@
 // The commands that declare and connect a design. Each reads its tokens by index, keyword words
 // counted, and calls one operation of Model. Tokens behind the last one named are ignored.
 
+#include <string>
+
 #include "vesk_hdl/engine/Commands.h"
 #include "vesk_hdl/engine/PinReference.h"
 #include "vesk_hdl/model/HdlModel.h"
@@ -149,7 +151,8 @@ void AddPortCommand::Execute() {
 struct ConnectSignalArguments {
     Text signalName;
     Text targetSignal;
-    PinReference pin;
+    std::string instanceName;
+    std::string pinName;
     bool isPin = false;
 };
 VESK_HDL_COMMAND(ConnectSignalCommand, ConnectSignalArguments)
@@ -158,17 +161,19 @@ bool ConnectSignalCommand::ParseArguments(StringArray const &tokens) {
     if (tokens.GetSize() < 4)
         return false;
     arguments.signalName = tokens.At(2);
-    arguments.isPin = arguments.pin.Parse(tokens.At(3).View());
-    if (!arguments.isPin)
-        arguments.targetSignal = tokens.At(3);
+    Text const &target = tokens.At(3);
+    arguments.isPin = IsPinReference(target.View());
+    if (arguments.isPin)
+        return SplitPinReference(target.View(), arguments.instanceName, arguments.pinName);
+    arguments.targetSignal = target;
     return true;
 }
 
 void ConnectSignalCommand::Execute() {
     Model &model = RequireModel();
     if (arguments.isPin)
-        model.ConnectSignalToPin(arguments.signalName, arguments.pin.GetHolder(),
-                                 arguments.pin.GetPin());
+        model.ConnectSignalToPin(arguments.signalName, arguments.instanceName.c_str(),
+                                 arguments.pinName.c_str());
     else
         model.ConnectSignals(arguments.signalName, arguments.targetSignal);
 }
@@ -177,7 +182,8 @@ void ConnectSignalCommand::Execute() {
 
 struct AssignConstantArguments {
     Text signalName;
-    PinReference pin;
+    std::string instanceName;
+    std::string pinName;
     bool isPin = false;
     Text value;
 };
@@ -186,17 +192,19 @@ VESK_HDL_COMMAND(AssignConstantCommand, AssignConstantArguments)
 bool AssignConstantCommand::ParseArguments(StringArray const &tokens) {
     if (tokens.GetSize() < 4)
         return false;
-    arguments.isPin = arguments.pin.Parse(tokens.At(2).View());
-    if (!arguments.isPin)
-        arguments.signalName = tokens.At(2);
+    Text const &target = tokens.At(2);
     arguments.value = tokens.At(3);
+    arguments.isPin = IsPinReference(target.View());
+    if (arguments.isPin)
+        return SplitPinReference(target.View(), arguments.instanceName, arguments.pinName);
+    arguments.signalName = target;
     return true;
 }
 
 void AssignConstantCommand::Execute() {
     Model &model = RequireModel();
     if (arguments.isPin)
-        model.AssignConstantToPin(arguments.pin.GetHolder(), arguments.pin.GetPin(),
+        model.AssignConstantToPin(arguments.instanceName.c_str(), arguments.pinName.c_str(),
                                   arguments.value);
     else
         model.AssignConstantToSignal(arguments.signalName, arguments.value);

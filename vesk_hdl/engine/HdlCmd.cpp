@@ -1,6 +1,7 @@
 #include "vesk_hdl/engine/HdlCmd.h"
 
 #include <atomic>
+#include <cstdint>
 #include <string>
 #include <utility>
 #include <vector>
@@ -29,42 +30,65 @@ Model &Command::RequireModel() const {
 
 namespace {
 
-/// A word of keywords, and what may follow it: the keywords are the ways through a tree.
-struct Word {
-    std::string text;
-    CommandCreator creator = nullptr; ///< of the keyword that ends here
-    std::vector<Word> next;
+/// The keywords, which are ways through a tree of words. A place in it is a number.
+class KeywordTree {
+public:
+    static constexpr std::size_t ROOT = 0; ///< in front of all words
+    static constexpr std::size_t NOWHERE = SIZE_MAX;
 
-    Word *Find(std::string_view word) {
-        for (Word &each : next)
-            if (Basis::Ascii::EqualIgnoringCase(each.text, word))
-                return &each;
-        return nullptr;
+    /// The place behind all words of a token, of which one that was quoted may hold several.
+    std::size_t Follow(std::size_t place, std::string_view token) const {
+        while (place != NOWHERE) {
+            std::size_t const found = Find(place, token);
+            std::size_t const blank = found == NOWHERE ? token.find(' ') : token.npos;
+            if (blank == token.npos)
+                return found;
+            place = Find(place, token.substr(0, blank));
+            token.remove_prefix(blank + 1);
+        }
+        return NOWHERE;
     }
-    /// Behind all words of a token: one that was quoted may hold several.
-    Word *Follow(std::string_view token) {
-        Word *found = Find(token);
-        std::size_t const blank = found ? token.npos : token.find(' ');
-        if (blank == token.npos)
+    void Add(std::string_view keyword, CommandCreator creator) {
+        std::size_t place = ROOT;
+        std::size_t blank = keyword.find(' ');
+        for (; blank != keyword.npos; blank = keyword.find(' ')) {
+            place = Enter(place, keyword.substr(0, blank));
+            keyword.remove_prefix(blank + 1);
+        }
+        place = Enter(place, keyword);
+        words[place].creator = creator;
+    }
+    /// Of the keyword that ends there, or null.
+    CommandCreator GetCreator(std::size_t place) const { return words[place].creator; }
+
+private:
+    struct Word {
+        std::string text;
+        CommandCreator creator = nullptr;
+        std::vector<std::size_t> next = {}; ///< the places of words that may follow
+    };
+
+    std::size_t Find(std::size_t place, std::string_view word) const {
+        for (std::size_t const each : words[place].next)
+            if (Basis::Ascii::EqualIgnoringCase(words[each].text, word))
+                return each;
+        return NOWHERE;
+    }
+    std::size_t Enter(std::size_t place, std::string_view word) {
+        if (std::size_t const found = Find(place, word); found != NOWHERE)
             return found;
-        found = Find(token.substr(0, blank));
-        return found ? found->Follow(token.substr(blank + 1)) : nullptr;
+        words.push_back({std::string(word)});
+        words[place].next.push_back(words.size() - 1);
+        return words.size() - 1;
     }
-    /// The same, and makes what is missing.
-    Word &Enter(std::string_view token) {
-        std::size_t const blank = token.find(' ');
-        std::string_view const word = token.substr(0, blank);
-        Word *found = Find(word);
-        if (!found)
-            found = &next.emplace_back(Word{std::string(word), nullptr, {}});
-        return blank == token.npos ? *found : found->Enter(token.substr(blank + 1));
-    }
+
+    std::vector<Word> words{Word()};
 };
 
 } // namespace
 
 struct CommandFactory::Record {
-    Word keywords; ///< the root, which is no word
+    KeywordTree keywords;
     std::atomic<unsigned int> owners{1};
 };
 
@@ -97,17 +121,22 @@ void CommandFactory::AddCommandCreator(char const *keyword, CommandCreator creat
 }
 
 void CommandFactory::AddCommandCreator(StringArray const &words, CommandCreator creator) {
-    record->keywords.Enter(words.Concatenate(" ").View()).creator = creator;
+    record->keywords.Add(words.Concatenate(" ").View(), creator);
 }
 
 /// Every beginning of the line is looked up and the last hit wins. The walk ends where no keyword
 /// goes on as the line does, for nothing longer can match.
 CommandCreator CommandFactory::GetCommandCreator(StringArray const &tokens) const {
-    Word *at = &record->keywords;
+    KeywordTree const &keywords = record->keywords;
+    std::size_t place = KeywordTree::ROOT;
     CommandCreator found = nullptr;
-    for (int i = 0; i < tokens.GetSize() && (at = at->Follow(tokens.At(i).View())); ++i)
-        if (at->creator)
-            found = at->creator;
+    for (int i = 0; i < tokens.GetSize(); ++i) {
+        place = keywords.Follow(place, tokens.At(i).View());
+        if (place == KeywordTree::NOWHERE)
+            break;
+        if (CommandCreator const creator = keywords.GetCreator(place))
+            found = creator;
+    }
     return found;
 }
 
@@ -154,13 +183,25 @@ int CommandManager::GetDoneCommandCount() const { return static_cast<int>(record
 
 void CommandManager::Clear() { record->done.clear(); }
 
-bool PinReference::Parse(std::string_view token) {
-    std::size_t const begin = token.find_first_not_of('.');
-    std::size_t const point = begin == token.npos ? begin : token.find('.', begin);
-    if (point == token.npos || point + 1 == token.size())
+namespace {
+
+/// Where the first part of a pin reference ends, or npos if the text is none.
+std::size_t PointOf(std::string_view text) {
+    std::size_t const begin = text.find_first_not_of('.');
+    std::size_t const point = begin == text.npos ? begin : text.find('.', begin);
+    return point == text.npos || point + 1 == text.size() ? text.npos : point;
+}
+
+} // namespace
+
+bool IsPinReference(std::string_view text) { return PointOf(text) != text.npos; }
+
+bool SplitPinReference(std::string_view text, std::string &left, std::string &right) {
+    std::size_t const point = PointOf(text);
+    if (point == text.npos)
         return false;
-    holder = token.substr(0, point);
-    pin = token.substr(point + 1);
+    left = text.substr(0, point);
+    right = text.substr(point + 1);
     return true;
 }
 

@@ -5,20 +5,12 @@
 
 namespace Vesk_Hdl {
 
-/// A pin's name in a line, HOLDER.PIN: a first part that a point ends, and at least one more
+/// Whether a token names a pin, HOLDER.PIN: a first part that a point ends, and at least one more
 /// character. It is split at the first point behind the first other character. A bus form holds no
 /// point and so names a signal.
-class PinReference {
-public:
-    /// Whether the token names a pin. If not, nothing changes.
-    bool Parse(std::string_view token);
-
-    char const *GetHolder() const { return holder.c_str(); }
-    char const *GetPin() const { return pin.c_str(); }
-
-private:
-    std::string holder; ///< short names need no memory besides the command's own
-    std::string pin;
-};
+bool IsPinReference(std::string_view text);
+/// Splits it; if it is none, nothing changes. Short names, as most are, need no memory of their
+/// own.
+bool SplitPinReference(std::string_view text, std::string &left, std::string &right);
 
 } // namespace Vesk_Hdl

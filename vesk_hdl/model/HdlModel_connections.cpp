@@ -48,11 +48,13 @@ private:
         signalName = instanceName;
         signalName += '_';
         signalName += pin.GetBaseName();
-        signalName += "_CONST_SIGNAL";
+        signalName += '_';
+        signalName += suffix;
     }
 
     Text instanceName;
     Text signalName;
+    Text suffix{"CONST_SIGNAL"};
 };
 
 } // namespace

@@ -254,8 +254,12 @@ AttributeHolder::Record &AttributeHolder::Own() const {
 AttributeHolder &AttributeHolder::operator=(AttributeHolder const &other) {
     if (this == &other)
         return *this;
-    // Names that only the old set had are forgotten with it, so that none leads to a dead one.
-    record.reset();
+    if (record) {
+        // Names that only the old set had are forgotten with it, so that none leads to a dead one.
+        // The array stays: a client may still walk it.
+        record->attributeMap.Empty();
+        record->attributes.DeleteAll();
+    }
     if (other.record)
         ForEach(other.record->attributes,
                 [this](Attribute *attribute) { AddAttr(attribute->CloneAttribute()); });

@@ -1,5 +1,8 @@
 #pragma once
 
+#include <memory>
+#include <unordered_map>
+
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/text/StringTable.h"
 
@@ -16,6 +19,8 @@ public:
 
     /// The table shares the name's text. The newer object of a name is the one that is found.
     void Add(Basis::StringBase<char> const &name, T *object) {
+        if (formerNames)
+            formerNames->emplace(object, name);
         std::uint32_t const hash = StringTable::HashIgnoringCase(name.View());
         if (StringTable::Node *const node = table.Find(name.View(), hash)) {
             node->value = object;
@@ -25,23 +30,36 @@ public:
         table.Insert(name, hash, object);
     }
 
-    /// Takes away what the name finds. An object that was renamed since it was added is still found
-    /// by its former name: then it is looked for everywhere, lest somebody find what is gone.
+    /// Takes away what the name finds, and the object: if it was renamed since it was added, it is
+    /// still found by its former name, and nobody must find what is gone.
     void Remove(Basis::StringBase<char> const &name, T const *object) {
         StringTable::Node const *const found = table.Find(name.View());
         bool const isFiledSo = found && found->value == object;
         table.Remove(name.View());
-        if (isFiledSo)
+        if (isFiledSo && !formerNames)
             return;
-        for (StringTable::Node const *node = table.GetFirst(); node; node = table.GetNext(node))
-            if (node->value == object) {
-                Basis::StringBase<char> const former = node->key;
-                table.Remove(former.View());
-                return;
-            }
+        if (!formerNames)
+            FindFormerNames();
+        auto const [begin, end] = formerNames->equal_range(object);
+        for (auto former = begin; former != end; ++former) {
+            StringTable::Node const *const node = table.Find(former->second.View());
+            if (node && node->value == object)
+                table.Remove(former->second.View());
+        }
+        formerNames->erase(begin, end);
     }
 
 private:
+    using FormerNames = std::unordered_multimap<void const *, Basis::StringBase<char>>;
+
+    void FindFormerNames() {
+        auto found = std::make_unique<FormerNames>();
+        for (StringTable::Node const *node = table.GetFirst(); node; node = table.GetNext(node))
+            found->emplace(node->value, node->key);
+        formerNames = std::move(found);
+    }
+
+    std::unique_ptr<FormerNames> formerNames; ///< null until somebody removes a renamed object
     StringTable table{StringTable::CASE_IGNORED, 7, StringTable::ORDER_FREE};
 };
 

@@ -113,7 +113,8 @@ private:
     void Forget(Signal *signal);
 
     void GetWiredOrOutputSignals(StringSet &names);
-    void GetFeedBackSignals(StringSet &read, PtrArray<Signal *> &driven);
+    void GetFeedBackSignals(bool outPortToInPin, StringSet &names);
+    void FindFeedBack(StringSet &read, PtrArray<Signal *> &driven);
     void AddDummySignals(bool portTakesDummy, StringSet &names);
     // Lookups with a key that was made once. A bus is found by its base name.
     bool IsNameUsed(Names::Key const &key) const;

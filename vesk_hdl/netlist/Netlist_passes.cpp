@@ -84,13 +84,13 @@ void Netlist::CreateVhdlDummySignals() {
     // later ones.
     StringSet names;
     PtrArray<Signal *> driven;
-    GetFeedBackSignals(names, driven);
+    FindFeedBack(names, driven);
     if (!names.IsEmpty()) {
         AddDummySignals(true, names);
         names.Empty();
         driven.Empty(); // the netlist is another one now
         StringSet ignored;
-        GetFeedBackSignals(ignored, driven);
+        FindFeedBack(ignored, driven);
     }
     AddNames(driven, names);
     AddDummySignals(false, names);
@@ -101,16 +101,24 @@ void Netlist::CreateVhdlDummySignals() {
 
 void Netlist::CreateVerilogDummySignals() {
     StringSet names;
-    StringSet ignored;
-    PtrArray<Signal *> driven;
-    GetFeedBackSignals(ignored, driven);
-    AddNames(driven, names);
+    GetFeedBackSignals(false, names);
     AddDummySignals(false, names);
 }
 
-/// Collects the names of the out ports that an instance reads, and the in ports that one drives.
-/// It is Instance::GetOutPortConnectedToInPin and GetInPortConnectedToOutPin in one walk.
-void Netlist::GetFeedBackSignals(StringSet &read, PtrArray<Signal *> &driven) {
+/// Collects the names of the out ports that an instance reads, or of the in ports that one drives.
+void Netlist::GetFeedBackSignals(bool outPortToInPin, StringSet &names) {
+    PtrArray<Pin *> pins;
+    ForEach(record->instances, [&pins, outPortToInPin](Instance const *instance) {
+        if (outPortToInPin)
+            instance->GetOutPortConnectedToInPin(pins);
+        else
+            instance->GetInPortConnectedToOutPin(pins);
+    });
+    ForEach(pins, [&names](Pin const *pin) { pin->GetSignal()->GetBaseName(names); });
+}
+
+/// Both in one walk: the names of the out ports that are read, and the in ports that are driven.
+void Netlist::FindFeedBack(StringSet &read, PtrArray<Signal *> &driven) {
     auto const look = [&read, &driven](Pin const *pin) {
         Signal *const signal = pin->GetSignal();
         Polarity const port = signal ? signal->GetPortPolarity() : Polarity();

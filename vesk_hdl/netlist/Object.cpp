@@ -88,6 +88,7 @@ void Object::Release() {
 Object &Object::operator=(Object const &other) {
     if (record == other.record)
         return *this;
+    record->NoteChange();
     if (record->IsSamePin(*other.record)) {
         Share(other);
         return *this;
@@ -146,12 +147,16 @@ Object::ObjectType Object::GetStoredObjectType() const {
     return static_cast<ObjectType>(record->objectType);
 }
 
-void Object::SetObjectType(ObjectType type) { Own().objectType = static_cast<short>(type); }
+void Object::SetObjectType(ObjectType type) { Own().objectType = static_cast<signed char>(type); }
 
-void Object::SetNameText(StringBase<char> const &name) { Rename(name.View()); }
+void Object::SetNameText(StringBase<char> const &name) {
+    record->NoteChange();
+    Rename(name.View());
+}
 
 void Object::SetNormalizedName(char const *name) {
     std::string_view const text = Basis::ViewOf(name);
+    record->NoteChange();
     if (Names::IsNormal(text))
         Rename(text);
     else

@@ -7,6 +7,10 @@
 
 namespace Vesk_Hdl {
 
+/// Set once any pin got another name or polarity, which only a client does: from then on nobody
+/// trusts an index or an order of pins that was found before.
+inline std::atomic<bool> somePinHasChanged{false};
+
 /// What an object shares with its copies until one of them changes. A pin's polarity and default
 /// value stand here as well: the pins of a million instances are what their components' pins are,
 /// and so cost their signal alone.
@@ -16,7 +20,13 @@ namespace Vesk_Hdl {
 struct Object::Record {
     Record() = default;
     /// All but the name.
-    explicit Record(Record const &model) : objectType(model.objectType), polarity(model.polarity) {}
+    explicit Record(Record const &model) : polarity(model.polarity), objectType(model.objectType) {}
+
+    /// For a record that is about to change.
+    void NoteChange() const {
+        if (objectType == OBJECT_PIN)
+            somePinHasChanged = true;
+    }
 
     Basis::StringBase<char> const &GetComment() const;
     BitVectorValue const &GetDefaultValue() const;
@@ -27,9 +37,9 @@ struct Object::Record {
 
     Basis::StringBase<char> name;
     std::atomic<unsigned int> owners{1};
-    short objectType = 0;                     ///< an ObjectType
-    signed char polarity = Polarity::INVALID; ///< of a pin, a Polarity::Value
-    bool isRare = false;                      ///< whether it is a RareRecord
+    short polarity = Polarity::INVALID; ///< of a pin, a Polarity::Value
+    signed char objectType = 0;         ///< an ObjectType
+    bool isRare = false;                ///< whether it is a RareRecord
 };
 
 /// A record with what few objects have.

@@ -3,6 +3,7 @@
 #include <atomic>
 #include <cstdint>
 #include <optional>
+#include <unordered_map>
 #include <utility>
 #include <vector>
 
@@ -31,10 +32,6 @@ Pin *FindPin(PtrArray<Pin *> const &pins, std::string_view name) {
             return pins.GetAt(i);
     return nullptr;
 }
-
-/// Set once any pin got another name or polarity, which only a client does: from then on nobody
-/// trusts an index or an order that was found before.
-std::atomic<bool> somePinHasChanged{false};
 
 void SortByName(PtrArray<Pin *> &pins) {
     SortNaturally(pins, [](Pin const *pin) { return pin->GetPolarity(); });
@@ -94,7 +91,7 @@ void FindOnPorts(PtrArray<Pin *> const &pins, Polarity::Value pinPolarity,
 Pin::Pin(char const *name, Polarity const &polarity) : signal(nullptr) {
     SetNormalizedName(name);
     SetObjectType(OBJECT_PIN);
-    Object::Own().polarity = static_cast<signed char>(polarity.GetValue());
+    Object::Own().polarity = static_cast<short>(polarity.GetValue());
 }
 
 Pin::Pin(Pin const &other) : Object(other), AttributeHolder(other), signal(other.GetSignal()) {
@@ -106,15 +103,13 @@ Pin::~Pin() = default;
 
 Object::ObjectType Pin::GetObjectType() const { return OBJECT_PIN; }
 void Pin::AcceptObject(ObjectVisitor &visitor) { visitor.VisitPin(this); }
-void Pin::SetName(char const *name) {
-    somePinHasChanged = true;
-    Object::SetName(name);
-}
+void Pin::SetName(char const *name) { Object::SetName(name); }
 
 Pin &Pin::operator=(Pin const &other) {
     if (this == &other)
         return *this;
-    somePinHasChanged = somePinHasChanged || Object::record != other.Object::record;
+    if (Object::record != other.Object::record)
+        Object::record->NoteChange();
     AttributeHolder::operator=(other);
     Share(other);
     Connect(other.GetSignal());
@@ -141,8 +136,8 @@ void Pin::Disconnect() {
 
 Signal *Pin::GetSignal() const { return signal == Former() ? nullptr : signal; }
 void Pin::SetPolarity(Polarity const &polarity) {
-    somePinHasChanged = true;
-    Object::Own().polarity = static_cast<signed char>(polarity.GetValue());
+    Object::record->NoteChange();
+    Object::Own().polarity = static_cast<short>(polarity.GetValue());
 }
 Polarity Pin::GetPolarity() const { return static_cast<Polarity::Value>(Object::record->polarity); }
 StringBase<char> Pin::GetPolarityName() const { return GetPolarity().GetValueName(); }
@@ -214,6 +209,9 @@ struct Component::Record {
         for (PtrArray<Pin *> *const copy : {&now, &sorted})
             ForEach(pins, [copy](Pin *pin) { copy->Add(pin); });
         SortByName(sorted);
+        std::unordered_map<Pin const *, int> places; // in `now`
+        for (int i = 0; i < now.GetSize(); ++i)
+            places[now.GetAt(i)] = i;
         Order found;
         for (int i = 0; i < now.GetSize(); ++i) {
             Pin *const pin = sorted.GetAt(i);
@@ -221,9 +219,11 @@ struct Component::Record {
             if (last && last->GetPolarity() == pin->GetPolarity() &&
                 NaturalCompare(last->GetNameRef(), pin->GetNameRef()) == 0)
                 found.isUnique = false;
-            if (now.GetAt(i) != pin) {
-                found.swaps.emplace_back(i, now.GetIndex(pin));
-                now.Swap(i, found.swaps.back().second);
+            if (Pin const *const other = now.GetAt(i); other != pin) {
+                int const place = places[pin];
+                found.swaps.emplace_back(i, place);
+                now.Swap(i, place);
+                places[other] = place;
             }
         }
         return order.emplace(std::move(found));

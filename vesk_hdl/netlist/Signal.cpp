@@ -522,15 +522,29 @@ StringBase<char> CompoundBus::GetDummySignalName() const {
 }
 
 void CompoundBus::AddBusMember(Signal *signal) {
+    if (IsIn(signal))
+        return;
     record->members.Add(signal);
     if (signal)
         signal->NoteReference();
 }
 
 void CompoundBus::SetAt(int index, Signal *signal) {
+    if (IsIn(signal))
+        return;
     record->members.SetAt(index, signal);
     if (signal)
         signal->NoteReference();
+}
+
+bool CompoundBus::IsIn(Signal const *signal) const {
+    if (!signal || signal->GetSignalType() != SIGNAL_COMPOUND_BUS)
+        return false;
+    bool isIn = signal == this;
+    if (auto const *const compound = As<CompoundBus>(signal); compound && !isIn)
+        ForEach(compound->record->members,
+                [this, &isIn](Signal const *member) { isIn = isIn || IsIn(member); });
+    return isIn;
 }
 
 Signal *CompoundBus::GetAt(int index) const { return record->members.GetAt(index); }

@@ -265,7 +265,10 @@ public:
     bool IsNeededToDeclared() const override;
     Basis::StringBase<char> GetDummySignalName() const override;
 
+    /// Appends a member, which may be null. A compound that is this one or holds it is left out:
+    /// neither would have a width.
     void AddBusMember(Signal *signal);
+    /// The same at a place from 0 on.
     void SetAt(int index, Signal *signal);
     Signal *GetAt(int index) const;
     /// The number of members, not the width.
@@ -282,6 +285,8 @@ public:
                                      bool expandBuses);
 
 private:
+    bool IsIn(Signal const *signal) const;
+
     struct Record;
     std::unique_ptr<Record> record;
 };

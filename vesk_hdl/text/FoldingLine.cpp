@@ -81,13 +81,12 @@ void FoldingLine::End(Basis::Stream &file) {
     if (size >= capacity)
         Grow();
     text[size++] = '\n';
-    if (start == MARGIN && blanks <= MARGIN) {
-        start -= blanks;
-        file.Write(std::string_view(text.get() + start, size - start));
-    } else {
+    std::size_t begin = start;
+    if (start == MARGIN && blanks <= MARGIN)
+        begin -= blanks;
+    else
         WriteBlanks(file, blanks);
-        file.Write(std::string_view(text.get() + start, size - start));
-    }
+    file.Write(std::string_view(text.get() + begin, size - begin));
     size = start = pieceBegin = searched = withoutBlank = MARGIN;
     blanks = limit = 0;
     comment = false;

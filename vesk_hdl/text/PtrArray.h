@@ -87,7 +87,9 @@ public:
 /// removed or emptied out are the caller's.
 template <class T> class OwnPtrArray : public PtrArray<T> {
 public:
-    ~OwnPtrArray() override {
+    ~OwnPtrArray() override { DeleteAll(); }
+    /// The last one first.
+    void DeleteAll() {
         static_assert(std::has_virtual_destructor_v<std::remove_pointer_t<T>>);
         for (int i = this->GetSize() - 1; i >= 0; --i)
             delete this->GetAt(i);

@@ -8,7 +8,6 @@
 
 #include "vesk_hdl/engine/Commands.h"
 #include "vesk_hdl/engine/JoinTokens.h"
-#include "vesk_hdl/engine/PinReference.h"
 #include "vesk_hdl/model/HdlModel.h"
 #include "vesk_hdl/text/Raise.h"
 #include "vesk_hdl/text/basis/Ascii.h"
@@ -56,33 +55,37 @@ public:
             keyword.remove_prefix(blank + 1);
         }
         place = Enter(place, keyword);
-        words[place].creator = creator;
+        places[place].creator = creator;
     }
     /// Of the keyword that ends there, or null.
-    CommandCreator GetCreator(std::size_t place) const { return words[place].creator; }
+    CommandCreator GetCreator(std::size_t place) const { return places[place].creator; }
 
 private:
-    struct Word {
-        std::string text;
+    struct Step {
+        std::string word;
+        std::size_t place; ///< behind the word
+    };
+    struct Place {
         CommandCreator creator = nullptr;
-        std::vector<std::size_t> next = {}; ///< the places of words that may follow
+        std::vector<Step> next = {};
     };
 
     std::size_t Find(std::size_t place, std::string_view word) const {
-        for (std::size_t const each : words[place].next)
-            if (Basis::Ascii::EqualIgnoringCase(words[each].text, word))
-                return each;
+        for (Step const &step : places[place].next)
+            if (Basis::Ascii::EqualIgnoringCase(step.word, word))
+                return step.place;
         return NOWHERE;
     }
     std::size_t Enter(std::size_t place, std::string_view word) {
         if (std::size_t const found = Find(place, word); found != NOWHERE)
             return found;
-        words.push_back({std::string(word)});
-        words[place].next.push_back(words.size() - 1);
-        return words.size() - 1;
+        std::size_t const made = places.size();
+        places.emplace_back();
+        places[place].next.push_back({std::string(word), made});
+        return made;
     }
 
-    std::vector<Word> words{Word()};
+    std::vector<Place> places{Place()};
 };
 
 } // namespace
@@ -182,28 +185,6 @@ void CommandManager::AddDoneCommand(Command *command) {
 int CommandManager::GetDoneCommandCount() const { return static_cast<int>(record->done.size()); }
 
 void CommandManager::Clear() { record->done.clear(); }
-
-namespace {
-
-/// Where the first part of a pin reference ends, or npos if the text is none.
-std::size_t PointOf(std::string_view text) {
-    std::size_t const begin = text.find_first_not_of('.');
-    std::size_t const point = begin == text.npos ? begin : text.find('.', begin);
-    return point == text.npos || point + 1 == text.size() ? text.npos : point;
-}
-
-} // namespace
-
-bool IsPinReference(std::string_view text) { return PointOf(text) != text.npos; }
-
-bool SplitPinReference(std::string_view text, std::string &left, std::string &right) {
-    std::size_t const point = PointOf(text);
-    if (point == text.npos)
-        return false;
-    left = text.substr(0, point);
-    right = text.substr(point + 1);
-    return true;
-}
 
 StringBase<char> JoinTokens(StringArray const &tokens, int first) {
     StringBase<char> joined;

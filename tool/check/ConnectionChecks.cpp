@@ -175,9 +175,10 @@ void CheckConnections(Design const &design) {
             CompoundChecker(design, *compound).Run();
     });
     for (auto const &[signal, dummy] : design.dummies) {
-        auto const checkPart = [&](Signal const *part) {
+        bool const isLeft = dummy.portTakesDummy; // by its readers
+        auto const checkPart = [&design, isLeft](Signal const *part) {
             CheckReturns(design, *part);
-            if (dummy.portTakesDummy)
+            if (isLeft)
                 CheckConstantBesideDummy(design, *part);
         };
         checkPart(signal);

@@ -34,20 +34,21 @@ template <class Run> std::string Outcome(std::vector<std::string> lines, Run run
 
 /// The texts that one file of all these lines writes.
 std::string OutcomeOfFile(std::vector<std::string> const &lines) {
-    MemoryFile file;
-    int const descriptor = file.Open();
+    struct Descriptor {
+        int const number = MemoryFile().Open();
+        ~Descriptor() { ::close(number); }
+    } const file;
     std::string text;
     for (std::string const &line : lines)
         text += line + "\n";
     text += "WRITE VHDL -NOHEADER x\nWRITE VERILOG -NOHEADER x\n";
-    FUZZ_EXPECT(::write(descriptor, text.data(), text.size()) >= 0, "no file");
+    FUZZ_EXPECT(::write(file.number, text.data(), text.size()) >= 0, "no file");
     Engine engine;
     Capture capture;
-    std::string const name = "/proc/self/fd/" + std::to_string(descriptor);
+    std::string const name = "/proc/self/fd/" + std::to_string(file.number);
     engine.CreateAndAddModel("hdlNetlist", name.c_str());
     engine.GetModel("hdlNetlist")->SetWriteOpener(&capture);
     FUZZ_EXPECT(engine.ReadCommandFile("HDLNETLIST", name.c_str()), "not read");
-    ::close(descriptor);
     return capture.Take();
 }
 

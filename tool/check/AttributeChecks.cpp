@@ -3,6 +3,7 @@
 #include <unordered_map>
 
 #include "tool/check/Attributes.h"
+#include "tool/check/Digits.h"
 #include "tool/check/Fold.h"
 
 using namespace Vesk_Hdl;
@@ -48,6 +49,8 @@ public:
                 CheckDeclared(use);
             else if (use.kind == AttributeUse::INSTANCE)
                 CheckGeneric(use);
+            CheckType(use);
+            CheckLiteral(use);
             CheckValue(use);
         });
         CheckInheritedFolds();
@@ -83,9 +86,7 @@ private:
         if (declaration && useAttrType && VhdlTypeOf(*declaration) != VhdlTypeOf(*use.attribute))
             Add(Id::ATTRIBUTE_TYPE, use, VHDL,
                 VhdlTypeOf(*use.attribute) + " for " + VhdlTypeOf(*declaration));
-        bool const isLeftOut =
-            use.kind == AttributeUse::COMPONENT && design.options.vhdlOption.suppressComponent;
-        if (!declaration && !isLeftOut && design.options.vhdlOption.useLibraries.IsEmpty())
+        if (!declaration && !IsLeftOut(use) && design.options.vhdlOption.useLibraries.IsEmpty())
             Add(Id::UNDECLARED_ATTRIBUTE, use, VHDL);
     }
 
@@ -106,15 +107,47 @@ private:
                     generic->GetValueTypeName().GetText());
     }
 
+    /// A type of the user's has a name of its own, which VHDL alone writes.
+    void CheckType(AttributeUse const &use) {
+        bool const isTyped = use.generic && use.kind != AttributeUse::INSTANCE;
+        bool const isDeclared = !use.generic && useAttrType && use.attribute->IsSynDeclared();
+        if ((isTyped || isDeclared) && !IsLeftOut(use) && VhdlTypeOf(*use.attribute).empty())
+            Add(Id::ATTRIBUTE_WITHOUT_TYPE, use, VHDL);
+    }
+
+    /// Bits may have any text for a value.
+    void CheckLiteral(AttributeUse const &use) {
+        bool const inVhdl = (use.generic || useAttrType) && !IsLeftOut(use);
+        Languages const written =
+            (inVhdl ? VHDL : NO_LANGUAGE) | (use.generic ? VERILOG : NO_LANGUAGE);
+        std::string const value(use.attribute->GetValueString().View());
+        Languages bad = NO_LANGUAGE;
+        if (use.attribute->GetValueType() == Attribute::VALUE_BIT) {
+            bad = value == "0" || value == "1" ? NO_LANGUAGE : BOTH;
+        } else if (auto const *const bits =
+                       dynamic_cast<AttributeBitVector const *>(use.attribute)) {
+            BitVectorValue const vector = bits->GetBitVectorValue();
+            Digits const digits(vector);
+            bool const overflows =
+                vector.HasBaseAndLength() &&
+                digits.GetLeastWidth() > static_cast<std::size_t>(std::max(vector.GetLength(), 0));
+            bad = digits.RefusedIn("") | (overflows ? VERILOG : NO_LANGUAGE);
+        }
+        if ((bad & written) != NO_LANGUAGE)
+            Add(Id::ATTRIBUTE_VALUE, use, bad & written, Quoted(value));
+    }
+
+    bool IsLeftOut(AttributeUse const &use) const {
+        return use.kind == AttributeUse::COMPONENT && design.options.vhdlOption.suppressComponent;
+    }
+
     // How a value is written: as a string in both languages, in one of them, or in none.
 
     Languages QuotedIn(AttributeUse const &use) const {
         Attribute::ValueType const type = use.attribute->GetValueType();
         bool const asString = type == Attribute::VALUE_STRING;
         Languages quoted = NO_LANGUAGE;
-        bool const isLeftOut =
-            use.kind == AttributeUse::COMPONENT && design.options.vhdlOption.suppressComponent;
-        if ((asString || (!use.generic && !useAttrType)) && !isLeftOut)
+        if ((asString || (!use.generic && !useAttrType)) && !IsLeftOut(use))
             quoted |= VHDL;
         // A component's generic is a parameter of each instance; other attributes are comments.
         if (use.generic && (asString || type == Attribute::VALUE_USER))

@@ -3,6 +3,7 @@
 #include <unordered_map>
 
 #include "tool/check/Design.h"
+#include "tool/check/Digits.h"
 
 using namespace Vesk_Hdl;
 
@@ -14,8 +15,7 @@ namespace {
 class ConstantChecker {
 public:
     ConstantChecker(Design const &checked, Signal const &checkedNet)
-        : design(checked), net(checkedNet), value(checkedNet.GetConstantValue()),
-          text(value.GetValue()), digits(text.View()) {}
+        : design(checked), net(checkedNet), value(checkedNet.GetConstantValue()), digits(value) {}
 
     void Run() {
         Signal::SignalType const type = net.GetSignalType();
@@ -47,64 +47,45 @@ private:
 
     /// Of a bit the last digit is written, as 0 if it is 0 and otherwise as 1.
     void CheckBit() {
+        std::string const &text = digits.GetText();
         std::size_t const at =
-            value.GetLength() > 0 ? static_cast<std::size_t>(value.GetLength()) - 1 : digits.size();
-        char const digit = at < digits.size() ? digits[at] : '1';
-        if (value.GetLength() != 1 || digits.size() != 1)
+            value.GetLength() > 0 ? static_cast<std::size_t>(value.GetLength()) - 1 : text.size();
+        char const digit = at < text.size() ? text[at] : '1';
+        if (value.GetLength() != 1 || text.size() != 1)
             Add(Id::CONSTANT_WIDTH, BOTH, std::string("written as ") + (digit == '0' ? '0' : '1'));
         else if (digit != '0' && digit != '1')
             Add(Id::CONSTANT_DIGIT, BOTH, "written as 1");
     }
 
     void CheckBased() {
-        int const base = value.GetBase();
-        std::string_view const known = base == 2   ? "01"
-                                       : base == 8 ? "01234567"
-                                                   : "0123456789abcdefABCDEF";
-        std::size_t const bitsOfDigit = base == 2 ? 1 : base == 8 ? 3 : 4;
-        Languages const bad = (AreAll(known, "_") ? NO_LANGUAGE : VHDL) |
-                              (AreAll(known, "_xXzZ?") ? NO_LANGUAGE : VERILOG);
-        if (bad != NO_LANGUAGE)
-            Add(Id::CONSTANT_DIGIT, bad, std::string(digits));
-        auto const count = static_cast<std::size_t>(digits.size()) -
-                           static_cast<std::size_t>(std::count(digits.begin(), digits.end(), '_'));
+        if (Languages const bad = digits.RefusedIn(""))
+            Add(Id::CONSTANT_DIGIT, bad, digits.GetText());
         auto const width = static_cast<std::size_t>(std::max(net.GetWidth(), 0));
         bool const fitsVerilog =
             value.GetLength() > 0 && static_cast<std::size_t>(value.GetLength()) == width;
-        Languages const wrong = (count * bitsOfDigit == width ? NO_LANGUAGE : VHDL) |
+        Languages const wrong = (digits.GetWidth() == width ? NO_LANGUAGE : VHDL) |
                                 (fitsVerilog ? NO_LANGUAGE : VERILOG);
         if (wrong != NO_LANGUAGE)
             Add(Id::CONSTANT_WIDTH, wrong,
-                "digits: " + std::to_string(count * bitsOfDigit) + ", told: " +
+                "digits: " + std::to_string(digits.GetWidth()) + ", told: " +
                     std::to_string(value.GetLength()) + ", width: " + std::to_string(width));
     }
 
     void CheckBare() {
-        Languages const bad = (AreAll("01", "UXZWLH") ? NO_LANGUAGE : VHDL) |
-                              (AreAll("0123456789", "_") ? NO_LANGUAGE : VERILOG);
-        if (bad != NO_LANGUAGE)
-            Add(Id::CONSTANT_DIGIT, bad, std::string(digits));
-        if (static_cast<int>(digits.size()) != net.GetWidth())
+        if (Languages const bad = digits.RefusedIn("UXZWLH"))
+            Add(Id::CONSTANT_DIGIT, bad, digits.GetText());
+        std::size_t const count = digits.GetText().size();
+        if (static_cast<int>(count) != net.GetWidth())
             Add(Id::CONSTANT_WIDTH, VHDL,
-                "digits: " + std::to_string(digits.size()) +
-                    ", width: " + std::to_string(net.GetWidth()));
-        if (digits.size() > 1)
-            Add(Id::CONSTANT_WITHOUT_BASE, BOTH, std::string(digits));
-    }
-
-    bool AreAll(std::string_view known, std::string_view further) const {
-        return !digits.empty() && digits.front() != '_' &&
-               std::all_of(digits.begin(), digits.end(), [&](char c) {
-                   return known.find(c) != std::string_view::npos ||
-                          further.find(c) != std::string_view::npos;
-               });
+                "digits: " + std::to_string(count) + ", width: " + std::to_string(net.GetWidth()));
+        if (count > 1)
+            Add(Id::CONSTANT_WITHOUT_BASE, BOTH, digits.GetText());
     }
 
     Design const &design;
     Signal const &net;
     BitVectorValue const value;
-    Text const text;
-    std::string_view digits;
+    Digits const digits;
 };
 
 /// Two pins whose INSTANCE_PIN is the same name.

@@ -35,8 +35,11 @@ void Findings::Add(Finding finding) {
         return;
     std::string const key = std::to_string(static_cast<int>(finding.id)) + ' ' +
                             std::to_string(finding.spot.line) + ' ' + Lowercase(finding.subject);
-    if (told.insert(key).second)
+    auto const [known, isNew] = told.try_emplace(key, findings.size());
+    if (isNew)
         findings.push_back(std::move(finding));
+    else
+        findings[known->second].languages |= finding.languages;
 }
 
 std::vector<Diagnostic> Findings::Take(Places const &places) {

@@ -2,7 +2,7 @@
 
 #include <set>
 #include <string>
-#include <unordered_set>
+#include <unordered_map>
 #include <vector>
 
 #include "tool/check/Checks.h"
@@ -29,8 +29,8 @@ struct Finding {
     std::string detail = {};    ///< behind the sentence, in brackets
 };
 
-/// Takes findings, leaves out what nobody asked for or was told before, and gives the rest in the
-/// order of the lines.
+/// Takes findings, leaves out what nobody asked for, tells each once with all languages that it
+/// concerns, and gives them in the order of the lines.
 class Findings {
 public:
     void SwitchOff(Id id) { off.insert(id); }
@@ -47,7 +47,7 @@ private:
     std::set<Id> off;
     Languages languages = BOTH;
     std::vector<Finding> findings;
-    std::unordered_set<std::string> told;
+    std::unordered_map<std::string, std::size_t> told; ///< where they stand in the findings
 };
 
 } // namespace Checks

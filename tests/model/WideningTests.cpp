@@ -82,6 +82,9 @@ TEST(Widening, LeavesNoPointerToTheFormerBus) {
         for (std::string const &slice : row.slices)
             EXPECT_NE(wiring.find(slice), std::string::npos) << row.before << ": " << slice;
     }
+    Design design(Short("sig a_long_name(3:0)"));
+    Signal const *const narrow = design.model.GetSignal("a_long_name(3:0)");
+    EXPECT_TRUE(design.model.ConnectSignals("a_long_name(7:0)", narrow->GetNameRef()));
 }
 
 } // namespace

@@ -104,6 +104,12 @@ TEST(Signal, PolarityOfACompoundIsThatOfItsFirstMember) {
     EXPECT_FALSE(compound.IsPort());
 }
 
+TEST(Signal, ACommentMayBeItsName) {
+    ScalarSignal signal("a_name_that_takes_memory");
+    signal.AddComment(signal.GetNameRef());
+    EXPECT_STREQ("a_name_that_takes_memory\n", signal.GetComment());
+}
+
 TEST(Signal, NoCompoundIsInItself) {
     Bits bits;
     CompoundBus outer("A,a");

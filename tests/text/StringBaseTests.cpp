@@ -2,6 +2,7 @@
 
 #include <cstring>
 #include <regex>
+#include <vector>
 
 #include <gtest/gtest.h>
 
@@ -82,6 +83,7 @@ TEST(StringBase, ChangesNeverShowInACopy) {
          {Row{[](Text &t) { (t += 'x') += '\0'; }, "\"Ab-b\"x"},
           Row{[](Text &t) { t += t; }, "\"Ab-b\"\"Ab-b\""},
           Row{[](Text &t) { t.Append(t.GetText() + 1, 2); }, "\"Ab-b\"Ab"},
+          Row{[](Text &t) { t.Append(std::vector<char>(3, 'x').data(), 3); }, "\"Ab-b\"xxx"},
           Row{[](Text &t) { t.Append(&t[3], 0xFFFFFFFF).Append("xy", 0); }, "\"Ab-b\"-b\""},
           Row{[](Text &t) { t = t.GetText() + 3; }, "-b\""}, Row{[](Text &t) { t.Empty(); }, ""},
           Row{[](Text &t) { t.ReplaceChars('b', 'c'); }, "\"Ac-c\""},

@@ -197,13 +197,14 @@ bool Model::ConnectSignalToPin(char const *signalName, char const *instanceName,
 }
 
 bool Model::ConnectSignals(char const *left, char const *right) {
+    Text const sourceName(right); // it may be the name of the bus that gives way to the left one
     InHand inHand;
     inHand.Add(GetOrCreateSignal(left, inHand));
     if (!inHand.GetAt(0))
         RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(left));
-    Signal *const source = GetOrCreateSignal(right, inHand);
+    Signal *const source = GetOrCreateSignal(sourceName, inHand);
     if (!source)
-        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(right));
+        RAISE(Messages::SIGNAL_NOT_FOUND, sourceName.GetText());
     return Connect(inHand.GetAt(0), source);
 }
 

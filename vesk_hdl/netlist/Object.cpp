@@ -123,9 +123,9 @@ StringBase<char> Object::GetComment() const { return record->GetComment(); }
 bool Object::HasComment() const { return !record->GetComment().IsEmpty(); }
 
 void Object::AddComment(char const *text) {
-    StringBase<char> &comment = OwnRare().comment;
-    comment += text;
-    comment += '\n';
+    StringBase<char> line(text); // the text may be this object's name
+    line += '\n';
+    OwnRare().comment += line;
 }
 
 bool Object::IsNamed(char const *name) const { return Basis::stricmp(record->name, name) == 0; }

@@ -35,7 +35,7 @@ public:
     bool operator==(Object const &other) const;
 
     Basis::StringBase<char> GetName() const;
-    /// The name itself, valid until it changes or the object dies.
+    /// The name itself, valid until the object changes in any way or dies.
     Basis::StringBase<char> const &GetNameRef() const;
     /// All comment lines, each ended by "\n".
     Basis::StringBase<char> GetComment() const;

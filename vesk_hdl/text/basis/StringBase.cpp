@@ -119,8 +119,9 @@ StringBase<char> &StringBase<char>::operator+=(std::string_view text) {
 StringBase<char> &StringBase<char>::Append(StringBase const &text) { return *this += text; }
 
 StringBase<char> &StringBase<char>::Append(char const *text, unsigned int count) {
-    std::string_view const whole = ViewOf(text);
-    return *this += whole.substr(0, count == NOT_FOUND ? whole.size() : count);
+    if (!text || count == NOT_FOUND)
+        return *this += ViewOf(text);
+    return *this += std::string_view(text, ::strnlen(text, count));
 }
 
 void StringBase<char>::Empty() {

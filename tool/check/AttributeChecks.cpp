@@ -115,17 +115,14 @@ private:
             Add(Id::ATTRIBUTE_WITHOUT_TYPE, use, VHDL);
     }
 
-    /// Bits may have any text for a value.
+    /// A vector of bits may have any text for a value.
     void CheckLiteral(AttributeUse const &use) {
         bool const inVhdl = (use.generic || useAttrType) && !IsLeftOut(use);
         Languages const written =
             (inVhdl ? VHDL : NO_LANGUAGE) | (use.generic ? VERILOG : NO_LANGUAGE);
         std::string const value(use.attribute->GetValueString().View());
         Languages bad = NO_LANGUAGE;
-        if (use.attribute->GetValueType() == Attribute::VALUE_BIT) {
-            bad = value == "0" || value == "1" ? NO_LANGUAGE : BOTH;
-        } else if (auto const *const bits =
-                       dynamic_cast<AttributeBitVector const *>(use.attribute)) {
+        if (auto const *const bits = dynamic_cast<AttributeBitVector const *>(use.attribute)) {
             BitVectorValue const vector = bits->GetBitVectorValue();
             Digits const digits(vector);
             bool const overflows =

@@ -157,7 +157,7 @@ std::vector<Row> const ROWS = {
     {Id::ATTRIBUTE_WITHOUT_TYPE, "attribute-without-type", VHDL,
      "has a type of the user's that nobody has named", "name it with SET ... ATTRIBUTE USERTYPE"},
     {Id::ATTRIBUTE_VALUE, "attribute-value", BOTH, "has a value that is none of its type",
-     "write 0 or 1 for a bit; for bits WIDTH:BASE:DIGITS, the base b, o or h, or binary digits"},
+     "write WIDTH:BASE:DIGITS, the base b, o or h, or binary digits alone"},
     {Id::UNWRITTEN_ATTRIBUTE, "unwritten-attribute", BOTH,
      "has a -SYNATTR option where no attribute is written",
      "put the attribute on a whole net, an instance or a component"},

@@ -116,7 +116,7 @@ private:
             Add(Id::IN_PORT_IN_COMPOUND, member, BOTH);
         if (polarity == Polarity::OUTPUT && reads)
             Add(Id::OUT_PORT_IN_COMPOUND, member, VHDL);
-        if (drives && own && own->portTakesDummy)
+        if (drives && own && own->stage == Design::READ_STAGE)
             Add(Id::BYPASSED_DUMMY, member, BOTH);
     }
 
@@ -174,8 +174,11 @@ void CheckConnections(Design const &design) {
         if (auto const *const compound = dynamic_cast<CompoundBus const *>(signal))
             CompoundChecker(design, *compound).Run();
     });
-    for (auto const &[signal, dummy] : design.dummies) {
-        bool const isLeft = dummy.portTakesDummy; // by its readers
+    design.ForEachSignal([&design](Signal const *signal) {
+        Design::Dummy const *const dummy = design.DummyOf(signal);
+        if (!dummy)
+            return;
+        bool const isLeft = dummy->stage == Design::READ_STAGE; // by its readers
         auto const checkPart = [&design, isLeft](Signal const *part) {
             CheckReturns(design, *part);
             if (isLeft)
@@ -184,7 +187,7 @@ void CheckConnections(Design const &design) {
         checkPart(signal);
         if (auto const *const bus = dynamic_cast<Bus const *>(signal))
             ForEach(bus->GetBusSliceIterator(), checkPart);
-    }
+    });
 }
 
 } // namespace Checks

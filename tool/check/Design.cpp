@@ -4,12 +4,6 @@ using namespace Vesk_Hdl;
 
 namespace Checks {
 
-namespace {
-
-constexpr int IN_PORT_STAGE = 2;
-
-} // namespace
-
 Design::Design(Model &model, Places const &madePlaces, Recorder const &history,
                Findings &foundThings)
     : netlist(*model.GetNetlist()), options(*model.GetOptions()), places(madePlaces),
@@ -107,8 +101,7 @@ void Design::FindUses() {
     });
 }
 
-/// The three stages of the rewriting: out ports that are read, in ports that are driven, out ports
-/// with several drivers. A name that one stage took is out of the later ones.
+/// A name that one stage took is out of the later ones.
 void Design::FindDummies() {
     auto const feedBack = [this](int stage, Polarity::Value port, Polarity::Value use) {
         ForEachPin([&](Instance const &, Pin const &pin) {
@@ -118,16 +111,16 @@ void Design::FindDummies() {
                 DemandDummy(pin.GetSignal(), stage);
         });
     };
-    feedBack(1, Polarity::OUTPUT, Polarity::INPUT);
-    feedBack(IN_PORT_STAGE, Polarity::INPUT, Polarity::OUTPUT);
+    feedBack(READ_STAGE, Polarity::OUTPUT, Polarity::INPUT);
+    feedBack(DRIVEN_STAGE, Polarity::INPUT, Polarity::OUTPUT);
     ForEachSignal([this](Signal const *signal) {
         if (signal->GetPortPolarity() == Polarity::OUTPUT && signal->HasMultiDriver())
-            DemandDummy(signal, 3);
+            DemandDummy(signal, WIRED_STAGE);
     });
 }
 
 void Design::DemandDummy(Signal const *signal, int stage) {
-    Dummy const dummy = {stage != IN_PORT_STAGE, signal, stage, nullptr};
+    Dummy const dummy = {stage != DRIVEN_STAGE, signal, stage, nullptr};
     NeedDummy(signal, dummy);
     if (auto const *const compound = dynamic_cast<CompoundBus const *>(signal))
         for (int i = 0; i < compound->GetSize(); ++i)

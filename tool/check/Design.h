@@ -24,6 +24,10 @@ struct Use {
 /// for each write that is checked, in one walk over the design.
 class Design {
 public:
+    static constexpr int READ_STAGE = 1;   ///< of the rewriting: out ports that are read
+    static constexpr int DRIVEN_STAGE = 2; ///< in ports that are driven
+    static constexpr int WIRED_STAGE = 3;  ///< out ports with several drivers
+
     /// A port that the rewriting before a write gives a dummy signal, or a member of the same
     /// compound, which shares its lot.
     struct Dummy {
@@ -65,8 +69,8 @@ public:
 
     /// All but the nets that a write gave to open pins, of which no line says anything.
     template <class Act> void ForEachSignal(Act act) const {
-        Vesk_Hdl::ForEach(netlist.GetSignalIterator(), [&act](Vesk_Hdl::Signal *signal) {
-            if (!IsOfOpenPin(*signal))
+        Vesk_Hdl::ForEach(netlist.GetSignalIterator(), [this, &act](Vesk_Hdl::Signal *signal) {
+            if (!places.IsOpen(signal))
                 act(signal);
         });
     }

@@ -54,6 +54,7 @@ std::vector<Diagnostic> Findings::Take(Places const &places) {
         spots.push_back(finding.spot);
     }
     findings.clear();
+    told.clear();
     places.AddSources(diagnostics, spots);
     return diagnostics;
 }

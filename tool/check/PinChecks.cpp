@@ -71,8 +71,8 @@ void CheckLatePins(Design const &design, Instance const &instance) {
 void CheckInstancePin(Design const &design, Instance const &instance, Pin const &pin) {
     Signal const *const signal = pin.GetSignal();
     if (!signal) {
-        bool const staysOpen = design.options.vhdlOption.openPin ||
-                               pin.GetPinType() == Pin::PIN_BUS_INDEX || IsScalarWithBrackets(pin);
+        bool const staysOpen =
+            design.options.vhdlOption.openPin || pin.GetPinType() == Pin::PIN_BUS_INDEX;
         if (staysOpen && pin.GetPolarity() == Polarity::INPUT)
             design.findings.Add({Id::OPEN_INPUT, design.MadeAt(&instance), PinName(instance, pin)});
         return;

@@ -3,6 +3,7 @@
 #include <cstdint>
 #include <string>
 #include <string_view>
+#include <unordered_set>
 #include <vector>
 
 #include "tool/diagnostics/Diagnostic.h"
@@ -40,6 +41,12 @@ public:
     /// another: ask for the former one with the line at which it was alive.
     Spot Find(Event event, void const *object, std::uint32_t before = EVER) const;
 
+    /// A net that a write gave to an open pin has no place, and no check looks at it.
+    void PutOpen(void const *net) { openNets.insert(net); }
+    bool IsOpen(void const *net) const { return !openNets.empty() && openNets.count(net) > 0; }
+    /// When a line speaks of the net, it becomes one of that line's. Whether it was open.
+    bool TakeOpen(void const *net) { return openNets.erase(net) > 0; }
+
     Place GetPlace(Spot spot) const;
     /// Gives each diagnostic the text of its line, as far as files can be read again. They have to
     /// be in order of their places.
@@ -63,6 +70,7 @@ private:
     }
     File const &FileOf(std::uint32_t line) const;
 
+    std::unordered_set<void const *> openNets;
     std::vector<File> files;
     std::uint32_t lineCount = 0;
     mutable std::vector<Entry> entries; ///< those in front sorted by key, then by line

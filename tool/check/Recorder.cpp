@@ -46,11 +46,20 @@ void Recorder::Before(LineTokens const &lineTokens, CommandHelp const *command, 
     }
 }
 
+/// Whether the net was there before the line.
+bool Recorder::Knows(std::string const &name, int token) {
+    Bus const *const bus = netlist.GetParentBus(name.c_str());
+    if (bus && places.TakeOpen(bus))
+        places.Put(Places::MADE, bus, SpotOf(token));
+    Signal const *const signal = model.GetSignal(name.c_str());
+    return signal && !places.TakeOpen(signal);
+}
+
 /// A net as CONNECT and ASSIGN name it, who make it if there is none. The form of a name is that of
 /// the text as it was typed.
 void Recorder::Name(std::string const &name, int token) {
     Text const typed(name.c_str());
-    bool const existed = model.GetSignal(typed) != nullptr;
+    bool const existed = Knows(name, token);
     bool const compound = CompoundBus::IsCompoundBusName(typed);
     nets.push_back({name, token, existed, Origin::BRACKETS});
     if (existed)
@@ -65,7 +74,7 @@ void Recorder::Name(std::string const &name, int token) {
 }
 
 void Recorder::NameMember(std::string const &name, int token, Origin origin) {
-    nets.push_back({name, token, model.GetSignal(name.c_str()) != nullptr, origin});
+    nets.push_back({name, token, Knows(name, token), origin});
     if (!nets.back().existed)
         WatchBus(name, token);
 }
@@ -105,7 +114,7 @@ void Recorder::NamePin(int token) {
     if (Instance const *const instance = model.GetInstance(owner.c_str()))
         pin = instance->GetPin(pinName.c_str());
     formerNet = pin ? pin->GetSignal() : nullptr;
-    if (formerNet && IsOfOpenPin(*formerNet))
+    if (places.IsOpen(formerNet))
         formerNet = nullptr;
     formerNetName = formerNet ? formerNet->GetNameRef() : Text();
 }
@@ -152,6 +161,7 @@ void Recorder::RecordNets() {
             CompareSpelling(named, *signal);
             continue;
         }
+        places.TakeOpen(signal);
         places.Put(Places::MADE, signal, SpotOf(named.token));
         respelled.erase(signal);
         bool const bracketed = named.origin == Origin::BRACKETS &&

@@ -51,6 +51,7 @@ private:
     };
 
     Spot SpotOf(int token) const { return Checks::SpotOf(*tokens, token, lineNumber); }
+    bool Knows(std::string const &name, int token);
     void Name(std::string const &name, int token);
     void NameMember(std::string const &name, int token, Origin origin);
     void WatchBus(std::string const &name, int token);

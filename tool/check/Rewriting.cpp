@@ -1,6 +1,7 @@
 #include "tool/check/Rewriting.h"
 
 #include <fcntl.h>
+#include <unordered_set>
 #include <utility>
 
 using namespace Vesk_Hdl;
@@ -27,13 +28,21 @@ void Rewrite(Session &session, Design const &design, Places &places, std::string
         if (auto const *const bus = dynamic_cast<Bus const *>(signal))
             ForEach(bus->GetBusSliceIterator(), [&](Signal const *part) { note(*part); });
     }
+    std::unordered_set<Signal const *> before;
+    ForEach(design.netlist.GetSignalIterator(), [&](Signal const *net) { before.insert(net); });
     Nowhere nowhere;
     session.GetModel().SetWriteOpener(&nowhere);
     session.RunLine(line, {});
     session.GetModel().SetWriteOpener(nullptr);
+    ForEach(design.netlist.GetSignalIterator(), [&](Signal const *net) {
+        if (before.count(net) == 0)
+            places.PutOpen(net);
+    });
     for (auto const &[name, spot] : dummyNames)
-        if (Signal const *const made = design.netlist.GetSignal(name))
+        if (Signal const *const made = design.netlist.GetSignal(name)) {
+            places.TakeOpen(made);
             places.Put(Places::MADE, made, spot);
+        }
 }
 
 } // namespace Checks

@@ -24,13 +24,12 @@ inline std::string_view BaseOf(Vesk_Hdl::Object const &object) {
     return BaseOf(object.GetNameRef().View());
 }
 
-/// Whether the net was made by a write for a pin that was open.
-inline bool IsOfOpenPin(Vesk_Hdl::Signal const &net) {
-    return BaseOf(net).ends_with("_openSignal");
-}
 /// Whether the net was made for a pin that was given a constant.
 inline bool IsTieOfPin(Vesk_Hdl::Signal const &net) {
-    return BaseOf(net).ends_with("_CONST_SIGNAL");
+    constexpr std::string_view TAG = "_CONST_SIGNAL";
+    std::string_view const base = BaseOf(net);
+    return base.size() > TAG.size() &&
+           SameIgnoringCase(base.substr(base.size() - TAG.size()), TAG); // a write may change it
 }
 
 /// The bits of a bus, a slice or one bit, as its name tells them.

@@ -1,6 +1,5 @@
 #include "vesk_hdl/netlist/Pin.h"
 
-#include <atomic>
 #include <cstdint>
 #include <optional>
 #include <unordered_map>

@@ -155,6 +155,9 @@ def options():
         (design, 1, [w, s], ["--off", "unused-net,unused-component"]),
         (design, 1, [w, s, c], ["--only", "unused-component", "--only", "reserved-word"]),
         (opened, 0, [], []),
+        ("UPPERCASE siganl\n" + opened.replace("CONNECT", "WRITE VERILOG f.v\nCONNECT"), 0, [],
+         ["--off", "case-differs"]),
+        (good + "ADD SIGNAL n_openSignal\n", 0, ["3:unused-net"], []),
         (good, 2, [], ["--off", "nonsense"]),
         (good, 2, [], ["--language", "C"]),
     ]

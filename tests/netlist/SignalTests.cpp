@@ -110,19 +110,6 @@ TEST(Signal, ACommentMayBeItsName) {
     EXPECT_STREQ("a_name_that_takes_memory\n", signal.GetComment());
 }
 
-TEST(Signal, NoCompoundIsInItself) {
-    Bits bits;
-    CompoundBus outer("A,a");
-    CompoundBus inner("B,b");
-    inner.AddBusMember(&bits.scalar);
-    outer.AddBusMember(&inner);
-    outer.AddBusMember(&outer);
-    inner.AddBusMember(&outer);
-    inner.SetAt(0, &outer);
-    EXPECT_EQ(1, outer.GetWidth());
-    EXPECT_EQ(&bits.scalar, inner.GetAt(0));
-}
-
 TEST(Signal, DisconnectAndMove) {
     Design design(CellsAnd("a u1.A; a u2.A; a c; c u1.A; b u3.A; b a"));
     Signal &a = *design.model.GetSignal("a");

@@ -26,7 +26,7 @@ inline bool IsDeclaredPort(Signal const &signal) {
 /// parts: with a million signals it takes longer than most of the parts.
 struct SignalLists {
     explicit SignalLists(Netlist const &netlist) {
-        ForEach(netlist.GetSignalIterator(), [this](Signal *signal) {
+        ForEach(netlist.GetSignals(), [this](Signal *signal) {
             if (IsDeclaredPort(*signal))
                 ports.Add(signal);
             if (signal->HasAttrs() && signal->GetPortPolarity() == Polarity::INVALID &&

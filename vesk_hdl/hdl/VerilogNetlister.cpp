@@ -1,11 +1,13 @@
 #include "vesk_hdl/hdl/VerilogNetlister.h"
 
 #include <string>
+#include <vector>
 
 #include "vesk_hdl/hdl/HdlUtilities.h"
 #include "vesk_hdl/hdl/Shared.h"
 #include "vesk_hdl/hdl/Translate.h"
 #include "vesk_hdl/hdl/VerilogStatements.h"
+#include "vesk_hdl/netlist/CompoundWalk.h"
 #include "vesk_hdl/netlist/Netlist.h"
 #include "vesk_hdl/text/basis/Ascii.h"
 
@@ -55,19 +57,44 @@ public:
     void VisitBusSlice(BusSlice *slice) override { WriteBracketed(*slice, slice->GetName()); }
     void VisitBusIndex(BusIndex *index) override { WriteBracketed(*index, index->GetName()); }
     void VisitCompoundBus(CompoundBus *compound) override {
-        if (compound->GetSize() == 0)
-            return;
-        stream << "{";
-        char const *separator = "";
-        ForEach(compound->GetBusMemberIterator(), [&](Signal *member) {
-            stream << separator;
-            member->AcceptSignal(*this);
-            separator = ", ";
-        });
-        stream << "}";
+        Concatenation concatenation(stream, *this);
+        WalkCompound(*compound, concatenation);
     }
 
 private:
+    /// {first, second}; nothing for a compound without members.
+    class Concatenation {
+    public:
+        Concatenation(OutStream &out, SignalVisitor &toWrite) : stream(out), members(toWrite) {}
+
+        void Enter(CompoundBus const &compound) {
+            if (!separators.empty())
+                Separate();
+            separators.push_back("");
+            if (compound.GetSize() > 0)
+                stream << "{";
+        }
+        void Leave(CompoundBus const &compound) {
+            separators.pop_back();
+            if (compound.GetSize() > 0)
+                stream << "}";
+        }
+        void Visit(Signal &member) {
+            Separate();
+            member.AcceptSignal(members);
+        }
+
+    private:
+        void Separate() {
+            stream << separators.back();
+            separators.back() = ", ";
+        }
+
+        OutStream &stream;
+        SignalVisitor &members;
+        std::vector<char const *> separators; ///< of each compound that is open
+    };
+
     static bool IsOpen(Signal const &signal) {
         std::string_view const name = signal.GetNameRef().View();
         return name.empty() || Basis::Ascii::EqualIgnoringCase(name, "open");
@@ -121,24 +148,24 @@ void VerilogNetlister::WriteNetlist(Netlist *netlist, HdlOptions const &options)
     stream->Indent();
     WriteParameters(netlist);
     WritePortDeclarations(ports, options);
-    WriteSignalDeclarations(netlist->GetSignalIterator(), options);
+    WriteSignalDeclarations(Iterator<Signal *>(&netlist->GetSignals()), options);
     WriteSignalAssignments(Iterator<Signal *>(&signals.assigned));
-    WriteInstances(netlist->GetInstanceIterator(), options);
+    WriteInstances(Iterator<Instance *>(&netlist->GetInstances()), options);
     stream->Unindent();
     Put(*stream, "endmodule", EOL);
 }
 
 /// Only the names of signals, components and instances are touched.
 void VerilogNetlister::SetNameCase(Netlist *netlist, HdlOptions const &options) {
-    auto const setCase = [this](auto objects, VerilogOption::CaseType type) {
+    auto const setCase = [this](auto const &objects, VerilogOption::CaseType type) {
         if (type != VerilogOption::CASE_DEFAULT)
             ForEach(objects, [this, type](Object *object) {
                 SetNameCase(object, type == VerilogOption::CASE_UPPER);
             });
     };
-    setCase(netlist->GetSignalIterator(), options.verilogOption.signalCase);
-    setCase(netlist->GetComponentIterator(), options.verilogOption.componentCase);
-    setCase(netlist->GetInstanceIterator(), options.verilogOption.instanceCase);
+    setCase(netlist->GetSignals(), options.verilogOption.signalCase);
+    setCase(netlist->GetComponents(), options.verilogOption.componentCase);
+    setCase(netlist->GetInstances(), options.verilogOption.instanceCase);
 }
 
 void VerilogNetlister::SetNameCase(Object *object, bool upper) {

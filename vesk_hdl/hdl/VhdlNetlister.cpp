@@ -45,7 +45,7 @@ private:
 void FindTelling(Netlist const *netlist, PtrArray<Instance *> &telling) {
     std::unordered_set<Component const *> seen;
     Component const *last = nullptr;
-    ForEach(netlist->GetInstanceIterator(), [&](Instance *instance) {
+    ForEach(netlist->GetInstances(), [&](Instance *instance) {
         Component const *const component = instance->GetComponent();
         bool const isFirst = component != last && seen.insert(component).second;
         last = component;
@@ -153,7 +153,7 @@ void VhdlNetlister::WriteArchitecture(Netlist const *netlist, HdlOptions const *
     FindTelling(netlist, telling);
     SignalLists const signals(*netlist);
     WriteAttrDeclarations(signals.innerWithAttrs, telling, options);
-    Iterator<Signal *> all = netlist->GetSignalIterator();
+    Iterator<Signal *> all(&netlist->GetSignals());
     int const width = Netlist::GetLongestSignalName(all);
     ForEach(all, [&](Signal const *signal) { WriteSignalDeclaration(signal, options, width); });
     if (!options->vhdlOption.suppressComponent)
@@ -163,7 +163,7 @@ void VhdlNetlister::WriteArchitecture(Netlist const *netlist, HdlOptions const *
     Put(*stream, "begin", EOL);
     stream->Indent();
     WriteAssignments(signals.assigned);
-    ForEach(netlist->GetInstanceIterator(),
+    ForEach(netlist->GetInstances(),
             [&](Instance const *instance) { WriteInstance(instance, options); });
     stream->Unindent();
     Put(*stream, "end", " BEHAVIORAL;", EOL);
@@ -267,7 +267,7 @@ void VhdlNetlister::WriteConfiguration(Netlist const *netlist) {
     Text const &name = netlist->GetNameRef();
     // One walk gives each component its instances, in order.
     std::unordered_map<Component const *, PtrArray<Instance *>> instances;
-    ForEach(netlist->GetInstanceIterator(), [&instances](Instance *instance) {
+    ForEach(netlist->GetInstances(), [&instances](Instance *instance) {
         if (Component const *const component = instance->GetComponent())
             instances[component].Add(instance);
     });
@@ -277,7 +277,7 @@ void VhdlNetlister::WriteConfiguration(Netlist const *netlist) {
     stream->Indent();
     Put(*stream, "for", " ", "BEHAVIORAL", EOL);
     stream->Indent();
-    ForEach(netlist->GetComponentIterator(), [&](Component const *component) {
+    ForEach(netlist->GetComponents(), [&](Component const *component) {
         auto const found = instances.find(component);
         if (found != instances.end())
             WriteConfigurationItem(component, found->second);

@@ -4,11 +4,13 @@
 
 #include <algorithm>
 #include <limits>
+#include <vector>
 
 #include "vesk_hdl/hdl/Pieces.h"
 #include "vesk_hdl/hdl/Translate.h"
 #include "vesk_hdl/hdl/VhdlStatements.h"
 #include "vesk_hdl/model/HdlOptions.h"
+#include "vesk_hdl/netlist/CompoundWalk.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/Netlist.h"
 #include "vesk_hdl/text/basis/Ascii.h"
@@ -59,14 +61,8 @@ public:
 
     /// Each member takes its piece of the pin.
     void VisitCompoundBus(CompoundBus *compound) override {
-        Text const whole = formal;
-        long long position = 0;
-        ForEach(compound->GetBusMemberIterator(), [&](Signal *member) {
-            int const width = member->GetWidth();
-            SetFormal(Bus::GetBusSliceName(whole, static_cast<int>(position), width));
-            position = std::min<long long>(position + width, std::numeric_limits<int>::max());
-            member->AcceptSignal(*this);
-        });
+        Pieces pieces(*this);
+        WalkCompound(*compound, pieces);
     }
 
     /// A pin on no signal: a scalar or a bus without a name.
@@ -92,6 +88,41 @@ public:
     }
 
 private:
+    /// Cuts the pin into the pieces that the members of a compound take, one after the other.
+    class Pieces {
+    public:
+        explicit Pieces(WritePortAssignmentVisitor &toWrite) : associations(toWrite) {}
+
+        void Enter(CompoundBus const &compound) {
+            if (!levels.empty())
+                Cut(widths.Get(compound));
+            levels.push_back({associations.formal, 0});
+        }
+        void Leave(CompoundBus const &) { levels.pop_back(); }
+        void Visit(Signal &member) {
+            Cut(member.GetWidth());
+            member.AcceptSignal(associations);
+        }
+
+    private:
+        struct Level {
+            Text whole;
+            long long position; ///< of the next piece, in bits
+        };
+
+        void Cut(int width) {
+            Level &level = levels.back();
+            associations.SetFormal(
+                Bus::GetBusSliceName(level.whole, static_cast<int>(level.position), width));
+            level.position =
+                std::min<long long>(level.position + width, std::numeric_limits<int>::max());
+        }
+
+        WritePortAssignmentVisitor &associations;
+        CompoundWidths widths;
+        std::vector<Level> levels; ///< of the compounds that are open
+    };
+
     /// A range against the direction of its bus cannot be associated whole (IEEE 1076-1993, 6.5).
     void AssociateBits(Text const &name) {
         Text const whole = formal;

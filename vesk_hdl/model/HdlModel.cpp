@@ -2,7 +2,7 @@
 
 #include "vesk_hdl/model/Messages.h"
 #include "vesk_hdl/netlist/Names.h"
-#include "vesk_hdl/netlist/Netlist.h"
+#include "vesk_hdl/netlist/NetlistEdit.h"
 #include "vesk_hdl/text/Raise.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
 
@@ -14,7 +14,9 @@ using Basis::OrEmpty;
 using Basis::StringBase;
 
 /// Names are shared by components, instances and signals; those of pins and attributes are not.
-bool Model::IsNamedUsed(char const *name) { return GetNetlist()->IsNameUsed(Names::Key(name)); }
+bool Model::IsNamedUsed(char const *name) {
+    return NetlistEdit(*GetNetlist()).IsNameUsed(Names::Key(name));
+}
 
 bool Model::AddComponent(char const *name) {
     if (!name)
@@ -45,12 +47,12 @@ bool Model::AddInstance(char const *instanceName, char const *componentName) {
         RAISE(Messages::INVALID_NAME);
     Netlist &netlist = *GetNetlist();
     Names::Key const key(instanceName);
-    if (netlist.IsNameUsed(key))
+    if (NetlistEdit(netlist).IsNameUsed(key))
         RAISE(Messages::IDENTIFIER_DEFINED, instanceName);
     Component *const component = GetComponent(componentName);
     if (!component)
         RAISE(Messages::COMPONENT_NOT_FOUND, OrEmpty(componentName));
-    if (netlist.FindInstance(key)) // a guard: the identifier check has caught this
+    if (NetlistEdit(netlist).FindInstance(key)) // a guard: the identifier check has caught this
         RAISE(Messages::INSTANCE_EXISTS, instanceName);
     netlist.Add(new Instance(instanceName, component));
     SetModifiedFlag(true);
@@ -62,7 +64,7 @@ bool Model::AddSignal(char const *name) {
         RAISE(Messages::INVALID_NAME);
     Netlist &netlist = *GetNetlist();
     Names::Key const key(name);
-    if (netlist.IsNameUsed(key))
+    if (NetlistEdit(netlist).IsNameUsed(key))
         RAISE(Messages::IDENTIFIER_DEFINED, name);
     if (Names::IsBusName(key.View())) {
         if (netlist.GetParentBus(name))

@@ -209,15 +209,11 @@ public:
     void AddInstancePinComment(char const *instance, char const *pin, char const *text);
 
 private:
-    /// The signals that a running operation holds. Widening replaces a bus by another object; it
-    /// then puts the replacement into this list.
-    using InHand = PtrArray<Signal *>;
-
     bool IsNamedUsed(char const *name);
-    Signal *GetOrCreateSignal(char const *name, InHand &inHand);
+    Signal *GetOrCreateSignal(char const *name);
     Signal *CreateAndAddBusIndexSignal(char const *name);
-    Signal *CreateAndAddBusSliceSignal(char const *name, InHand &inHand);
-    Signal *CreateAndAddCompundSignal(char const *name, InHand &inHand);
+    Signal *CreateAndAddBusSliceSignal(char const *name);
+    Signal *CreateAndAddCompundSignal(char const *name);
     bool Connect(Signal *signal, Pin *pin);
     bool Connect(Signal *left, Signal *right);
     bool AssignConstant(Signal *signal, char const *value);

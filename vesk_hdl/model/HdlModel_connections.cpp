@@ -5,7 +5,7 @@
 
 #include "vesk_hdl/model/Messages.h"
 #include "vesk_hdl/netlist/Names.h"
-#include "vesk_hdl/netlist/Netlist.h"
+#include "vesk_hdl/netlist/NetlistEdit.h"
 #include "vesk_hdl/text/Raise.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
 
@@ -28,33 +28,23 @@ public:
         Text right;
         pin->GetIndex(left, right);
         SetName(*pin);
-        signalName += '(';
-        signalName += left;
-        signalName += ':';
-        signalName += right;
-        signalName += ')';
+        signalName = Names::BusName(signalName.View(), left.View(), right.View());
     }
     void VisitBusIndexPin(BusIndexPin *pin) override {
         SetName(*pin);
-        signalName += '(';
-        signalName += pin->GetIndex();
-        signalName += ')';
+        signalName = Names::BitName(signalName.View(), pin->GetIndex().View());
     }
 
     Text const &GetSignalName() const { return signalName; }
 
 private:
     void SetName(Pin const &pin) {
-        signalName = instanceName;
-        signalName += '_';
-        signalName += pin.GetBaseName();
-        signalName += '_';
-        signalName += suffix;
+        signalName = Names::PinSignalBase(instanceName.View(), pin.GetBaseName().View(),
+                                          Names::CONSTANT_TAG);
     }
 
     Text instanceName;
     Text signalName;
-    Text suffix{"CONST_SIGNAL"};
 };
 
 } // namespace
@@ -63,16 +53,16 @@ namespace Vesk_Hdl {
 
 /// Null for a bit of an unknown bus: a bit never makes its bus. The forms are tested on the name as
 /// it was typed, so that "a[3]" makes a scalar that is called a(3).
-Signal *Model::GetOrCreateSignal(char const *name, InHand &inHand) {
+Signal *Model::GetOrCreateSignal(char const *name) {
     if (Signal *const signal = GetSignal(name))
         return signal;
     Text const typed(name);
     if (BusIndex::IsBusIndexName(typed))
         return CreateAndAddBusIndexSignal(name);
     if (Bus::IsBusName(typed))
-        return CreateAndAddBusSliceSignal(name, inHand);
+        return CreateAndAddBusSliceSignal(name);
     if (CompoundBus::IsCompoundBusName(typed))
-        return CreateAndAddCompundSignal(name, inHand);
+        return CreateAndAddCompundSignal(name);
     AddSignal(OrEmpty(name));
     return GetSignal(name);
 }
@@ -89,7 +79,7 @@ Signal *Model::CreateAndAddBusIndexSignal(char const *name) {
 
 /// A slice that is narrower than its bus is one wherever its range lies. One as wide or wider takes
 /// the bus's place, and the bus becomes a slice of it.
-Signal *Model::CreateAndAddBusSliceSignal(char const *name, InHand &inHand) {
+Signal *Model::CreateAndAddBusSliceSignal(char const *name) {
     Netlist &netlist = *GetNetlist();
     Bus *const bus = netlist.GetParentBus(name);
     Signal *signal = nullptr;
@@ -100,42 +90,38 @@ Signal *Model::CreateAndAddBusSliceSignal(char const *name, InHand &inHand) {
         signal = new BusSlice(name, bus);
         netlist.Add(signal);
     } else {
-        signal = netlist.Widen(bus, name, inHand);
+        signal = NetlistEdit(netlist).Widen(bus, name);
     }
     SetModifiedFlag(true);
     return signal;
 }
 
-Signal *Model::CreateAndAddCompundSignal(char const *name, InHand &inHand) {
+Signal *Model::CreateAndAddCompundSignal(char const *name) {
     Text normal(name);
     Object::NormalizeName(normal);
     StringArray memberNames;
     CompoundBus::ParseCompoundBusName(normal, memberNames, false);
 
-    // The members go behind what the caller holds: a later member may widen the bus of an earlier.
-    int const first = inHand.GetSize();
+    // A later member may widen the bus of an earlier one: a slice then takes the bus's place, also in
+    // this array.
+    PtrArray<Signal *> members;
     for (int i = 0; i < memberNames.GetSize(); ++i) {
         Text const &member = memberNames.At(i);
         Signal *signal = GetSignal(member);
         if (!signal && BusIndex::IsBusIndexName(member))
             signal = CreateAndAddBusIndexSignal(member);
         else if (!signal && Bus::IsBusName(member))
-            signal = CreateAndAddBusSliceSignal(member, inHand);
+            signal = CreateAndAddBusSliceSignal(member);
         if (!signal) { // also a bit of an unknown bus, unlike outside a compound
             AddSignal(member);
             signal = GetSignal(member);
         }
-        inHand.Add(signal);
+        members.Add(signal);
     }
-    auto compound = std::make_unique<CompoundBus>(normal);
-    for (int i = first; i < inHand.GetSize(); ++i)
-        compound->AddBusMember(inHand.GetAt(i));
-    while (inHand.GetSize() > first)
-        inHand.RemoveTail();
-    Signal *const result = compound.get();
-    GetNetlist()->Add(compound.release());
+    auto *const compound = new CompoundBus(normal, members);
+    GetNetlist()->Add(compound);
     SetModifiedFlag(true);
-    return result;
+    return compound;
 }
 
 bool Model::Connect(Signal *signal, Pin *pin) {
@@ -149,7 +135,7 @@ bool Model::Connect(Signal *signal, Pin *pin) {
 bool Model::Connect(Signal *left, Signal *right) {
     if (!left || !right)
         return false;
-    GetNetlist()->Link(left, right);
+    left->Connect(right);
     SetModifiedFlag(true);
     return true;
 }
@@ -179,8 +165,7 @@ bool Model::AssignConstant(Pin *pin, char const *value, char const *instanceName
 
 bool Model::ConnectSignalToPin(char const *signalName, char const *instanceName,
                                char const *pinName) {
-    InHand inHand;
-    Signal *const signal = GetOrCreateSignal(signalName, inHand);
+    Signal *const signal = GetOrCreateSignal(signalName);
     if (!signal)
         RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(signalName));
     Instance const *const instance = GetInstance(instanceName);
@@ -198,14 +183,13 @@ bool Model::ConnectSignalToPin(char const *signalName, char const *instanceName,
 
 bool Model::ConnectSignals(char const *left, char const *right) {
     Text const sourceName(right); // it may be the name of the bus that gives way to the left one
-    InHand inHand;
-    inHand.Add(GetOrCreateSignal(left, inHand));
-    if (!inHand.GetAt(0))
+    Signal *const target = GetOrCreateSignal(left);
+    if (!target)
         RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(left));
-    Signal *const source = GetOrCreateSignal(sourceName, inHand);
+    Signal *const source = GetOrCreateSignal(sourceName);
     if (!source)
         RAISE(Messages::SIGNAL_NOT_FOUND, sourceName.GetText());
-    return Connect(inHand.GetAt(0), source);
+    return Connect(target, source);
 }
 
 bool Model::AssignConstantToPin(char const *instanceName, char const *pinName, char const *value) {
@@ -219,8 +203,7 @@ bool Model::AssignConstantToPin(char const *instanceName, char const *pinName, c
 }
 
 bool Model::AssignConstantToSignal(char const *signalName, char const *value) {
-    InHand inHand;
-    Signal *const signal = GetOrCreateSignal(signalName, inHand);
+    Signal *const signal = GetOrCreateSignal(signalName);
     if (!signal)
         RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(signalName));
     return AssignConstant(signal, value);

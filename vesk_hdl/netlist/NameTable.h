@@ -30,6 +30,13 @@ public:
         table.Insert(name, hash, object);
     }
 
+    /// The object is about to be destroyed, and nothing finds it any more: its former names are of
+    /// no use.
+    void Forget(T const *object) {
+        if (formerNames)
+            formerNames->erase(object);
+    }
+
     /// Takes away what the name finds, and the object: if it was renamed since it was added, it is
     /// still found by its former name, and nobody must find what is gone.
     void Remove(Basis::StringBase<char> const &name, T const *object) {

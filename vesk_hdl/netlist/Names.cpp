@@ -150,12 +150,41 @@ bool IsOneBitBus(std::string_view name) {
     return IsBusName(name) && ParseBounds(name, bounds) && bounds.Distance() == 0;
 }
 
+namespace {
+
+/// The decimal text of a number.
+struct Digits {
+    explicit Digits(int number) : end(std::to_chars(text, text + sizeof text, number).ptr) {}
+    std::string_view View() const { return {text, static_cast<std::size_t>(end - text)}; }
+
+    char text[16];
+    char *end;
+};
+
+} // namespace
+
 StringBase<char> BitName(std::string_view base, int index) {
-    char digits[16];
-    std::to_chars_result const end = std::to_chars(digits, digits + sizeof digits, index);
+    return BitName(base, Digits(index).View());
+}
+
+StringBase<char> BitName(std::string_view base, std::string_view index) {
     StringBase<char> name(base);
     name += '(';
-    name += std::string_view(digits, static_cast<std::size_t>(end.ptr - digits));
+    name += index;
+    name += ')';
+    return name;
+}
+
+StringBase<char> BusName(std::string_view base, int left, int right) {
+    return BusName(base, Digits(left).View(), Digits(right).View());
+}
+
+StringBase<char> BusName(std::string_view base, std::string_view left, std::string_view right) {
+    StringBase<char> name(base);
+    name += '(';
+    name += left;
+    name += ':';
+    name += right;
     name += ')';
     return name;
 }
@@ -188,6 +217,15 @@ std::string_view BaseName(std::string_view name) {
     std::size_t const open = name.find('(');
     bool const ranged = open != NPOS && name.find(')') != NPOS && name.find(',') == NPOS;
     return ranged ? name.substr(0, open) : name;
+}
+
+StringBase<char> PinSignalBase(std::string_view instance, std::string_view pinBase,
+                               std::string_view tag) {
+    StringBase<char> name(instance);
+    name += '_';
+    name += pinBase;
+    name += tag;
+    return name;
 }
 
 bool EndsInDummyTag(std::string_view name) { return EndsWithIgnoringCase(name, DUMMY_TAG); }

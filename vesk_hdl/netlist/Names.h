@@ -58,6 +58,11 @@ bool IsOneBitBus(std::string_view name);
 
 /// "BASE(INDEX)".
 Basis::StringBase<char> BitName(std::string_view base, int index);
+Basis::StringBase<char> BitName(std::string_view base, std::string_view index);
+/// "BASE(LEFT:RIGHT)".
+Basis::StringBase<char> BusName(std::string_view base, int left, int right);
+Basis::StringBase<char> BusName(std::string_view base, std::string_view left,
+                                std::string_view right);
 
 /// Whether rewriting leaves the text as it is: it holds no square, curly or angle bracket and no
 /// hyphen.
@@ -70,6 +75,13 @@ std::string_view BaseName(std::string_view name);
 /// Whether the name ends in the mark of dummy signals, in any case.
 bool EndsInDummyTag(std::string_view name);
 inline constexpr char const *DUMMY_TAG = "_DUMMY";
+
+/// What ends the base name of a signal that the library makes for a pin.
+inline constexpr char const *CONSTANT_TAG = "_CONST_SIGNAL";
+inline constexpr char const *OPEN_TAG = "_openSignal";
+/// The base name of that signal: INSTANCE_PIN and the tag.
+Basis::StringBase<char> PinSignalBase(std::string_view instance, std::string_view pinBase,
+                                      std::string_view tag);
 
 /// A name as objects bear it: the text itself if it is normal, else a rewritten copy. Null counts
 /// as empty. Valid as long as this object and the text.

@@ -16,7 +16,7 @@ namespace {
 int Length(StringBase<char> const &name) { return static_cast<int>(name.GetLength()); }
 
 /// Enters an object whole or, when memory runs out, not at all; then it is deleted.
-template <class T> void File(OwnPtrArray<T *> &array, NameTable<T> &map, T *object) {
+template <class T> void File(ObjectArray<T> &array, NameTable<T> &map, T *object) {
     std::unique_ptr<T> held(object);
     array.Add(object);
     try {
@@ -28,11 +28,8 @@ template <class T> void File(OwnPtrArray<T *> &array, NameTable<T> &map, T *obje
     held.release();
 }
 
-template <class T> void Unfile(OwnPtrArray<T *> &array, NameTable<T> &map, T *object) {
-    if (array.GetTail() == object)
-        array.RemoveTail();
-    else
-        array.Remove(object);
+template <class T> void Unfile(ObjectArray<T> &array, NameTable<T> &map, T *object) {
+    array.Remove(object);
     map.Remove(object->GetNameRef(), object);
 }
 
@@ -73,9 +70,6 @@ void Netlist::Add(Signal *signal) {
     try {
         if (auto const *const bus = As<Bus>(signal))
             record->busMap.Add(bus->GetBaseName(), signal);
-        else if (auto const *const compound = As<CompoundBus>(signal))
-            ForEach(compound->GetBusMemberIterator(),
-                    [this, signal](Signal *member) { KnowReferrer(member, signal); });
         record->signalMap.Add(signal->GetNameRef(), signal);
     } catch (...) {
         record->signals.RemoveTail();
@@ -87,7 +81,6 @@ void Netlist::Add(Signal *signal) {
 
 /// Everything that finds a signal but the array and the map of names.
 void Netlist::Forget(Signal *signal) {
-    record->referrers.Forget(signal);
     if (auto const *const bus = As<Bus>(signal)) {
         record->busMap.Remove(bus->GetBaseName(), signal);
     } else if (As<BusSlice>(signal) || As<BusIndex>(signal)) {
@@ -110,7 +103,6 @@ void Netlist::Remove(Signal *signal) {
     if (!signal)
         return;
     Unfile(record->signals, record->signalMap, signal);
-    record->referrers.Forget(signal);
     signal->DisconnectAll();
     if (auto const *const bus = As<Bus>(signal))
         record->busMap.Remove(bus->GetBaseName(), signal);
@@ -131,50 +123,38 @@ void Netlist::Remove(Component *component) {
     delete component;
 }
 
-bool Netlist::IsNameUsed(Names::Key const &key) const {
-    return FindComponent(key) || FindInstance(key) || FindSignal(key);
+Signal *Netlist::GetSignal(char const *name) const {
+    return record->signalMap.Get(Names::Key(name));
 }
-
-Signal *Netlist::FindSignal(Names::Key const &key) const { return record->signalMap.Get(key); }
-
-Instance *Netlist::FindInstance(Names::Key const &key) const {
-    return record->instanceMap.Get(key);
+Instance *Netlist::GetInstance(char const *name) const {
+    return record->instanceMap.Get(Names::Key(name));
 }
-
-Component *Netlist::FindComponent(Names::Key const &key) const {
-    return record->componentMap.Get(key);
+Component *Netlist::GetComponent(char const *name) const {
+    return record->componentMap.Get(Names::Key(name));
 }
-
-Bus *Netlist::FindBus(Names::Key const &key) const {
-    return static_cast<Bus *>(record->busMap.Get(key));
-}
-
-Signal *Netlist::GetSignal(char const *name) const { return FindSignal(Names::Key(name)); }
-Instance *Netlist::GetInstance(char const *name) const { return FindInstance(Names::Key(name)); }
-Component *Netlist::GetComponent(char const *name) const { return FindComponent(Names::Key(name)); }
 
 Bus *Netlist::GetParentBus(char const *name) const {
     Names::NormalName const whole(name);
-    return FindBus(Names::Key(Names::BaseName(whole.View())));
+    return static_cast<Bus *>(record->busMap.Get(Names::Key(Names::BaseName(whole.View()))));
 }
 
-Iterator<Signal *> Netlist::GetSignalIterator() const {
-    return Iterator<Signal *>(&record->signals);
-}
-
+Iterator<Signal *> Netlist::GetSignalIterator() const { return record->signals.GetIterator(); }
 Iterator<Instance *> Netlist::GetInstanceIterator() const {
-    return Iterator<Instance *>(&record->instances);
+    return record->instances.GetIterator();
+}
+Iterator<Component *> Netlist::GetComponentIterator() const {
+    return record->components.GetIterator();
 }
 
-Iterator<Component *> Netlist::GetComponentIterator() const {
-    return Iterator<Component *>(&record->components);
-}
+PtrArray<Signal *> const &Netlist::GetSignals() const { return record->signals.Get(); }
+PtrArray<Instance *> const &Netlist::GetInstances() const { return record->instances.Get(); }
+PtrArray<Component *> const &Netlist::GetComponents() const { return record->components.Get(); }
 
 void Netlist::GetInstances(Component const *component, PtrArray<Instance *> &found) const {
     found.Empty();
     if (!component)
         return;
-    ForEach(record->instances, [component, &found](Instance *instance) {
+    ForEach(GetInstances(), [component, &found](Instance *instance) {
         if (instance->GetComponent() == component)
             found.Add(instance);
     });
@@ -184,82 +164,13 @@ void Netlist::GetInstances(char const *componentName, PtrArray<Instance *> &foun
     GetInstances(GetComponent(componentName), found);
 }
 
-Bus *Netlist::Widen(Bus *bus, char const *name, PtrArray<Signal *> &inHand) {
-    auto wide = std::make_unique<Bus>(name);
-    wide->TakeCell(*bus);
-    auto slice = std::make_unique<BusSlice>(bus->GetNameRef(), wide.get());
-    BusSlice *const stand = slice.get();
-    record->widenedSlices.Add(stand);
-    slice.release();
-    MoveConnections(bus, stand);
-    ForEach(bus->GetBusSliceIterator(), [&wide](Signal *moved) { wide->AddBusSlice(moved); });
-    ReplaceReferences(bus, stand);
-    for (int i = 0; i < inHand.GetSize(); ++i)
-        if (inHand.GetAt(i) == bus)
-            inHand.SetAt(i, stand);
-    Remove(bus);
-    Bus *const result = wide.get();
-    Add(wide.release());
-    return result;
-}
-
-void Netlist::Link(Signal *left, Signal *right) {
-    int const before = right->GetUnknownReferences();
-    left->Connect(right);
-    if (right->GetUnknownReferences() != before)
-        KnowReferrer(right, left);
-}
-
-void Netlist::MoveConnections(Signal *from, Signal *to) {
-    record->referrers.Copy(from, to);
-    to->CloneConnection(from);
-}
-
-/// Notes who lists a signal, if it is one that can be widened.
-void Netlist::KnowReferrer(Signal *target, Signal *referrer) {
-    if (target->GetSignalType() == Signal::SIGNAL_BUS)
-        record->referrers.Note(target, referrer);
-    target->NoteKnownReference();
-}
-
-void Netlist::ReplaceReferencesIn(Signal *referrer, Signal *former, Signal *now) {
-    referrer->ReplaceAssigned(former, now);
-    if (auto *const compound = As<CompoundBus>(referrer))
-        for (int i = 0; i < compound->GetSize(); ++i)
-            if (compound->GetAt(i) == former)
-                compound->SetAt(i, now);
-}
-
-/// Whatever may point at a signal one way: links, members of compounds, pins that it does not list.
-/// Where a link or member was made behind the netlist's back, it looks at all signals there are.
-void Netlist::ReplaceReferences(Signal *former, Signal *now) {
-    Referrers::Set const known = record->referrers.TakeReferrers(former);
-    auto const replaceIn = [&](Signal *referrer) { ReplaceReferencesIn(referrer, former, now); };
-    if (former->GetUnknownReferences() == 0) {
-        for (Signal *const referrer : known)
-            replaceIn(referrer);
-    } else {
-        ForEach(record->signals, replaceIn);
-        ForEach(record->widenedSlices, replaceIn);
-    }
-    if (!former->IsTied())
-        return;
-    auto const reconnect = [former, now](Pin *pin) {
-        if (pin->GetSignal() == former)
-            pin->Connect(now);
-    };
-    ForEach(record->instances,
-            [&](Instance *instance) { ForEach(instance->GetPinIterator(), reconnect); });
-    ForEach(record->components,
-            [&](Component *component) { ForEach(component->GetPinIterator(), reconnect); });
-}
-
 void Netlist::SortNetlist() {
     auto const noPolarity = [](Object const *) { return Polarity(); };
-    SortNaturally(record->signals, [](Signal const *s) { return s->GetPortPolarity(); });
-    SortNaturally(record->components, noPolarity);
-    SortNaturally(record->instances, noPolarity);
-    ForEach(record->instances, [](Instance *instance) { instance->SortPinName(); });
+    SortNaturally(record->signals.GetForSort(),
+                  [](Signal const *signal) { return signal->GetPortPolarity(); });
+    SortNaturally(record->components.GetForSort(), noPolarity);
+    SortNaturally(record->instances.GetForSort(), noPolarity);
+    ForEach(GetInstances(), [](Instance *instance) { instance->SortPinName(); });
 }
 
 int Netlist::GetLongestPinName(Iterator<Pin *> &pins) {
@@ -290,12 +201,12 @@ int Netlist::GetLongestAttrName(Netlist const *netlist) {
     int longest = 0;
     if (!netlist)
         return longest;
-    ForEach(netlist->record->signals, [&longest](Signal const *signal) {
+    ForEach(netlist->GetSignals(), [&longest](Signal const *signal) {
         if (signal->GetPortPolarity() == Polarity::INVALID && signal->IsNeededToDeclared())
             GetLongestAttrName(signal, longest);
     });
     Component const *last = nullptr; // a look at the same one again tells nothing new
-    ForEach(netlist->record->instances, [&longest, &last](Instance const *instance) {
+    ForEach(netlist->GetInstances(), [&longest, &last](Instance const *instance) {
         Component const *const component = instance->GetComponent();
         if (component != last)
             GetLongestAttrName(component, longest);

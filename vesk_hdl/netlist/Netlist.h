@@ -7,10 +7,6 @@
 
 namespace Vesk_Hdl {
 
-namespace Names {
-class Key;
-}
-
 /// A whole design: the owner of its components, instances and signals; its attributes are those of
 /// the module.
 ///
@@ -22,7 +18,7 @@ public:
     static char const DEFAULT_NETLIST_NAME[]; ///< "HDL_NETLIST"
 
     /// Null makes a netlist called "hdlNetlist".
-    explicit Netlist(char const *name);
+    Netlist(char const *name);
     ~Netlist() override;
     ObjectType GetObjectType() const override;
     void AcceptObject(ObjectVisitor &visitor) override;
@@ -59,6 +55,11 @@ public:
     Iterator<Signal *> GetSignalIterator() const;
     Iterator<Instance *> GetInstanceIterator() const;
     Iterator<Component *> GetComponentIterator() const;
+    /// The same arrays for a walk at once: valid until the next Remove, or the next line that a
+    /// model runs. Removing objects from a netlist whose iterators nobody asked for is faster.
+    PtrArray<Signal *> const &GetSignals() const;
+    PtrArray<Instance *> const &GetInstances() const;
+    PtrArray<Component *> const &GetComponents() const;
     /// Empties `found` and fills it with the instances of a component, in order. A walk over all
     /// instances.
     void GetInstances(Component const *component, PtrArray<Instance *> &found) const;
@@ -97,33 +98,14 @@ public:
     void SetBoxTypeAttribute();
 
 private:
-    friend class Model;
+    friend class NetlistEdit;
     struct Record;
-
-    /// Replaces a bus by a wider one that is called `name`. What was on the old bus, and every
-    /// pointer to it in this netlist and in `inHand`, goes to a slice of the new bus that bears the
-    /// old one's name; the old slices become slices of the new bus. That slice is the netlist's,
-    /// but nobody finds it by name or by a walk. Polarity, comment, attributes and constant of the
-    /// old bus are lost. Returns the new bus.
-    Bus *Widen(Bus *bus, char const *name, PtrArray<Signal *> &inHand);
-    /// Signal::Connect and Signal::CloneConnection, and the netlist knows who lists a bus.
-    void Link(Signal *left, Signal *right);
-    void MoveConnections(Signal *from, Signal *to);
-    void KnowReferrer(Signal *target, Signal *referrer);
-    void Forget(Signal *signal);
 
     void GetWiredOrOutputSignals(StringSet &names);
     void GetFeedBackSignals(bool outPortToInPin, StringSet &names);
     void FindFeedBack(StringSet &read, PtrArray<Signal *> &driven);
     void AddDummySignals(bool portTakesDummy, StringSet &names);
-    // Lookups with a key that was made once. A bus is found by its base name.
-    bool IsNameUsed(Names::Key const &key) const;
-    Signal *FindSignal(Names::Key const &key) const;
-    Instance *FindInstance(Names::Key const &key) const;
-    Component *FindComponent(Names::Key const &key) const;
-    Bus *FindBus(Names::Key const &key) const;
-    void ReplaceReferences(Signal *former, Signal *now);
-    void ReplaceReferencesIn(Signal *referrer, Signal *former, Signal *now);
+    void Forget(Signal *signal);
 
     std::unique_ptr<Record> record;
 };

@@ -108,7 +108,7 @@ void Netlist::CreateVerilogDummySignals() {
 /// Collects the names of the out ports that an instance reads, or of the in ports that one drives.
 void Netlist::GetFeedBackSignals(bool outPortToInPin, StringSet &names) {
     PtrArray<Pin *> pins;
-    ForEach(record->instances, [&pins, outPortToInPin](Instance const *instance) {
+    ForEach(GetInstances(), [&pins, outPortToInPin](Instance const *instance) {
         if (outPortToInPin)
             instance->GetOutPortConnectedToInPin(pins);
         else
@@ -133,13 +133,13 @@ void Netlist::FindFeedBack(StringSet &read, PtrArray<Signal *> &driven) {
         else
             driven.Add(signal);
     };
-    ForEach(record->instances,
+    ForEach(GetInstances(),
             [&look](Instance const *instance) { ForEach(instance->GetPinIterator(), look); });
 }
 
 /// Collects the out ports with several drivers.
 void Netlist::GetWiredOrOutputSignals(StringSet &names) {
-    ForEach(record->signals, [&names](Signal const *signal) {
+    ForEach(GetSignals(), [&names](Signal const *signal) {
         if (signal->GetPortPolarity() == Polarity::OUTPUT && signal->HasMultiDriver())
             signal->GetBaseName(names);
     });
@@ -153,16 +153,16 @@ void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
         return;
     auto const addDummy = [this](Signal *dummy, Signal *old) {
         Add(dummy);
-        MoveConnections(old, dummy);
+        dummy->CloneConnection(old);
     };
-    auto const link = [this, portTakesDummy](Signal *port, Signal *dummy) {
+    auto const link = [portTakesDummy](Signal *port, Signal *dummy) {
         if (portTakesDummy)
-            Link(port, dummy);
+            port->Connect(dummy);
         else
-            Link(dummy, port);
+            dummy->Connect(port);
     };
 
-    ScalarMembers scalarMembers(record->signals);
+    ScalarMembers scalarMembers(GetSignals());
     PtrArray<CompoundBus *> compounds;
     StringSetIterator const end = names.GetEndPos();
     for (StringSetIterator it = names.GetBeginPos(); it != end; ++it) {
@@ -173,7 +173,7 @@ void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
             addDummy(dummy, old);
             link(old, dummy);
             scalarMembers.Replace(name, dummy);
-        } else if (Bus *const oldBus = FindBus(Names::Key(Object::GetBaseName(name).View()))) {
+        } else if (Bus *const oldBus = GetParentBus(name)) {
             Bus *const dummy = oldBus->CreateDummySignal();
             addDummy(dummy, oldBus);
             link(oldBus, dummy);
@@ -192,37 +192,28 @@ void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
         CompoundBus *const dummy = old->CreateDummySignal();
         addDummy(dummy, old);
         ForEach(old->GetBusMemberIterator(), [this, dummy](Signal const *member) {
-            if (Signal *const memberDummy = GetSignal(member->GetDummySignalName())) {
+            if (Signal *const memberDummy = GetSignal(member->GetDummySignalName()))
                 dummy->AddBusMember(memberDummy);
-                KnowReferrer(memberDummy, dummy);
-            }
         });
     });
 }
 
 void Netlist::ConnectOpenPinToDummy() {
     PtrArray<Pin *> open;
-    ForEach(record->instances, [&](Instance const *instance) {
+    ForEach(GetInstances(), [&](Instance const *instance) {
         open.Empty();
         instance->GetOpenPin(open, true);
         ForEach(open, [&](Pin *pin) {
-            StringBase<char> name = instance->GetName();
-            name += '_';
-            name += pin->GetBaseName();
-            name += "_openSignal";
+            StringBase<char> const base = Names::PinSignalBase(
+                instance->GetNameRef().View(), pin->GetBaseName().View(), Names::OPEN_TAG);
             Signal *signal = nullptr;
             if (pin->GetPinType() == Pin::PIN_SCALAR) {
-                signal = new ScalarSignal(name);
+                signal = new ScalarSignal(base);
             } else if (auto const *const busPin = dynamic_cast<BusPin const *>(pin)) {
                 StringBase<char> left;
                 StringBase<char> right;
                 busPin->GetIndex(left, right);
-                name += '(';
-                name += left;
-                name += ':';
-                name += right;
-                name += ')';
-                signal = new Bus(name);
+                signal = new Bus(Names::BusName(base.View(), left.View(), right.View()));
             } else {
                 return; // a pin that is one bit of a range stays open
             }
@@ -233,7 +224,7 @@ void Netlist::ConnectOpenPinToDummy() {
 }
 
 void Netlist::SetBoxTypeAttribute() {
-    ForEach(record->components, [](Component *component) {
+    ForEach(GetComponents(), [](Component *component) {
         Attribute const *const level = component->GetAttr("Level");
         if (!level || !Basis::Ascii::EqualIgnoringCase(level->GetValueString().View(), "ORVANE") ||
             component->GetAttr("BOX_TYPE"))

@@ -1,9 +1,10 @@
 #include "vesk_hdl/netlist/Object.h"
 
+#include <cassert>
 #include <utility>
 
 #include "vesk_hdl/netlist/Names.h"
-#include "vesk_hdl/netlist/ObjectRecord.h"
+#include "vesk_hdl/netlist/storage/ObjectRecord.h"
 #include "vesk_hdl/text/basis/Counting.h"
 #include "vesk_hdl/text/basis/Functions.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
@@ -24,16 +25,16 @@ StringBase<char> NormalText(char const *name) {
 
 /// That of all objects without a name. It is never counted or freed.
 Object::Record *Object::NoRecord() {
-    static Record none{};
+    static Record none;
     return &none;
 }
 
-/// A record with that name, all else as in `model`.
-template <class Made>
-Object::Record *Object::MakeRecord(std::string_view name, Record const &model) {
+/// A record with that name, all else as in a model or as the class begins.
+template <class Made, class... Model>
+Object::Record *Object::MakeRecord(std::string_view name, Model const &...model) {
     void *room = nullptr;
     StringBase<char> text = StringBase<char>::MakeWithRoom(name, sizeof(Made), room);
-    auto *const made = new (room) Made(model);
+    auto *const made = new (room) Made(model...);
     made->name = std::move(text);
     return made;
 }
@@ -44,8 +45,14 @@ void Object::Replace(Record *now) {
 }
 
 void Object::Rename(std::string_view name) {
-    Replace(record->isRare ? MakeRecord<RareRecord>(name, *record)
-                           : MakeRecord<Record>(name, *record));
+    switch (record->content) {
+    case Record::NAME:
+        return Replace(MakeRecord<Record>(name, *record));
+    case Record::COMMENT:
+        return Replace(MakeRecord<CommentRecord>(name, static_cast<CommentRecord &>(*record)));
+    case Record::PIN:
+        return Replace(MakeRecord<PinRecord>(name, static_cast<PinRecord &>(*record)));
+    }
 }
 
 /// The record for writing anything but the name: this object's alone.
@@ -55,12 +62,26 @@ Object::Record &Object::Own() {
     return *record;
 }
 
-Object::RareRecord &Object::OwnRare() {
-    if (record->isRare)
-        Own();
-    else
-        Replace(MakeRecord<RareRecord>(record->name.View(), *record));
-    return *static_cast<RareRecord *>(record);
+/// The comment for writing: this object's alone.
+StringBase<char> &Object::OwnComment() {
+    if (record->content == Record::NAME)
+        Replace(MakeRecord<CommentRecord>(record->name.View(), *record));
+    return Own().OwnComment();
+}
+
+void Object::BeginPin(char const *name, Polarity::Value polarity) {
+    Names::NormalName const normal(name);
+    Replace(MakeRecord<PinRecord>(normal.View(), polarity));
+}
+
+Object::PinRecord const &Object::GetPinRecord() const {
+    assert(record->content == Record::PIN && "another object's record has no polarity");
+    return static_cast<PinRecord const &>(*record);
+}
+
+Object::PinRecord &Object::OwnPinRecord() {
+    assert(record->content == Record::PIN && "another object's record has no polarity");
+    return static_cast<PinRecord &>(Own());
 }
 
 Object::Object() : record(NoRecord()) {}
@@ -77,34 +98,40 @@ void Object::Join() {
 void Object::Release() {
     if (record == NoRecord() || !Basis::Counting::Leave(record->owners))
         return;
-    StringBase<char> const block = std::move(record->name); // which the record stands in
-    if (record->isRare)
-        static_cast<RareRecord *>(record)->~RareRecord();
-    else
-        record->~Record();
+    StringBase<char> const block = std::move(record->name); // the record lies in it
+    switch (record->content) {
+    case Record::NAME:
+        return record->~Record();
+    case Record::COMMENT:
+        return static_cast<CommentRecord *>(record)->~CommentRecord();
+    case Record::PIN:
+        return static_cast<PinRecord *>(record)->~PinRecord();
+    }
 }
 
-/// What makes a pin a pin stays behind; where that is alike, all the rest can be shared.
+/// Assigns name, comment and kind, and nothing of what makes a pin a pin. Between two objects that
+/// are no pins that is the whole record.
 Object &Object::operator=(Object const &other) {
     if (record == other.record)
         return *this;
     record->NoteChange();
-    if (record->IsSamePin(*other.record)) {
+    if (record->content != Record::PIN && other.record->content != Record::PIN) {
         Share(other);
         return *this;
     }
+    StringBase<char> const comment = other.GetComment();
     bool const hasComment = HasComment() || other.HasComment();
     Rename(other.record->name.View());
     record->objectType = other.record->objectType;
     if (hasComment)
-        OwnRare().comment = other.record->GetComment();
+        OwnComment() = comment;
     return *this;
 }
 
-/// Takes over everything.
 void Object::Share(Object const &other) {
     if (record == other.record)
         return;
+    record->NoteChange();
     Release();
     record = other.record;
     Join();
@@ -123,9 +150,9 @@ StringBase<char> Object::GetComment() const { return record->GetComment(); }
 bool Object::HasComment() const { return !record->GetComment().IsEmpty(); }
 
 void Object::AddComment(char const *text) {
-    StringBase<char> line(text); // the text may be this object's name
+    StringBase<char> line(text); // a copy: the text may be this object's name
     line += '\n';
-    OwnRare().comment += line;
+    OwnComment() += line;
 }
 
 bool Object::IsNamed(char const *name) const { return Basis::stricmp(record->name, name) == 0; }

@@ -67,17 +67,26 @@ protected:
     /// What SetName of this class does, for constructors.
     void SetNormalizedName(char const *name);
 
-private:
-    friend class Pin;
     struct Record;
-    struct RareRecord;
+    struct CommentRecord;
+    struct PinRecord;
+    /// For a pin: begins with that polarity, in place of what the constructor made.
+    void BeginPin(char const *name, Polarity::Value polarity);
+    /// The data that a pin shares with its copies.
+    PinRecord const &GetPinRecord() const;
+    /// The same for writing: this pin's alone.
+    PinRecord &OwnPinRecord();
+    /// Takes over name, comment, kind and a pin's data from an object of the same class.
+    void Share(Object const &other);
+
+private:
     static Record *NoRecord();
-    template <class Made> static Record *MakeRecord(std::string_view name, Record const &model);
+    template <class Made, class... Model>
+    static Record *MakeRecord(std::string_view name, Model const &...model);
     Record &Own();
-    RareRecord &OwnRare();
     void Rename(std::string_view name);
     void Replace(Record *now);
-    void Share(Object const &other);
+    Basis::StringBase<char> &OwnComment();
     void Join();
     void Release();
 

@@ -5,13 +5,15 @@
 
 namespace Vesk_Hdl {
 
+class PinFamilyPtr;
+
 /// A pin of a component or of an instance: a polarity, a default value and at most one signal,
 /// which it does not own.
 class VESK_HDL_API Pin : public Object, public AttributeHolder {
 public:
     enum PinType : int { PIN_SCALAR = 1, PIN_BUS = 2, PIN_BUS_INDEX = 3 };
 
-    /// The signal is not told.
+    /// A signal that lists the pin goes on listing it.
     ~Pin() override;
     ObjectType GetObjectType() const override;
     void AcceptObject(ObjectVisitor &visitor) override;
@@ -49,6 +51,7 @@ protected:
     Pin(Pin const &other);
 
 private:
+    friend class Component;
     friend class Signal;
 
     /// What Connect does, for a signal that lists the pin.
@@ -56,6 +59,8 @@ private:
     /// False only if no signal ever listed the pin, which then need not be looked for.
     bool MayBeListed() const { return signal != nullptr; }
     static Signal *Former();
+    /// The component that owns the pin shares its family with it.
+    void Enter(PinFamilyPtr const &family);
 
     Signal *signal; ///< Former() once there was one; all else is shared with copies
 };
@@ -123,7 +128,7 @@ public:
 /// owns.
 class VESK_HDL_API Component : public Object, public AttributeHolder {
 public:
-    explicit Component(char const *name);
+    Component(char const *name);
     ~Component() override;
     ObjectType GetObjectType() const override;
     void AcceptObject(ObjectVisitor &visitor) override;

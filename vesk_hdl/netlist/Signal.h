@@ -7,6 +7,8 @@
 
 namespace Vesk_Hdl {
 
+struct ParentCell;
+
 /// A net of the netlist, and a port of its module when it has a port polarity.
 ///
 /// A signal lists its pins and, one way, the signals that are assigned to it; it owns neither. Its
@@ -76,19 +78,11 @@ protected:
     explicit Signal(char const *name);
 
 private:
-    friend class Netlist;
-    friend class Pin;
-    friend class CompoundBus;
+    friend class BusSlice;
+    friend class NetlistEdit;
     struct Record;
 
-    // Who points at this signal without being listed here. Links and memberships in compounds are
-    // counted until the netlist knows them; that some pin is tied one way is noted.
-    void NoteReference();
-    void NoteKnownReference();
-    void NoteTie();
-    int GetUnknownReferences() const;
-    bool IsTied() const;
-    void ReplaceAssigned(Signal *former, Signal *now);
+    Signal(Signal &&made) noexcept;
 
     std::unique_ptr<Record> record;
 };
@@ -96,7 +90,7 @@ private:
 /// One net.
 class VESK_HDL_API ScalarSignal : public Signal {
 public:
-    explicit ScalarSignal(char const *name);
+    ScalarSignal(char const *name);
     ~ScalarSignal() override;
     SignalType GetSignalType() const override;
     void SetPortPolarity(Polarity const &polarity) override;
@@ -119,7 +113,7 @@ private:
 /// A declared vector, BASE(LEFT:RIGHT).
 class VESK_HDL_API Bus : public Signal {
 public:
-    explicit Bus(char const *name);
+    Bus(char const *name);
     ~Bus() override;
     SignalType GetSignalType() const override;
     void SetPortPolarity(Polarity const &polarity) override;
@@ -166,12 +160,10 @@ public:
 private:
     friend class BusSlice;
     friend class BusIndex;
-    friend class Netlist;
+    friend class NetlistEdit;
     struct Record;
 
-    /// Where the slices of this bus look for their parent.
-    std::shared_ptr<Bus *> const &GetCell();
-    void TakeCell(Bus &narrow);
+    ParentCell *ShareCell();
 
     std::unique_ptr<Record> record;
 };
@@ -204,9 +196,12 @@ public:
     BusSlice *CreateDummySignal(Bus *parent) const;
 
 private:
-    struct Record;
+    friend class NetlistEdit;
+
+    BusSlice(BusSlice &&made) noexcept;
     Bus *GetParent() const;
-    std::unique_ptr<Record> record;
+
+    ParentCell *cell; ///< where the parent is found; null without one
 };
 
 /// One bit of a declared bus, D(3) of D(7:0).
@@ -241,16 +236,16 @@ public:
                                   Basis::StringBase<char> &base, int &index);
 
 private:
-    struct Record;
     Bus *GetParent() const;
-    std::unique_ptr<Record> record;
+
+    ParentCell *cell; ///< where the parent is found
 };
 
 /// A bundle of signals in the order of its name, A,D(3:0),E(2). It lists its members and owns
 /// nothing.
 class VESK_HDL_API CompoundBus : public Signal {
 public:
-    explicit CompoundBus(char const *name);
+    CompoundBus(char const *name);
     CompoundBus(char const *name, PtrArray<Signal *> const &members);
     ~CompoundBus() override;
     SignalType GetSignalType() const override;
@@ -265,8 +260,9 @@ public:
     bool IsNeededToDeclared() const override;
     Basis::StringBase<char> GetDummySignalName() const override;
 
-    /// Appends a member, which may be null. A compound that is this one or holds it is left out:
-    /// neither would have a width.
+    /// Appends a member, which may be null, this compound, or one that holds it. The member is not
+    /// looked at. Walks over the members (width, polarity, dummy name, the written text) go into
+    /// compounds among them, and leave out a compound that they are in the middle of.
     void AddBusMember(Signal *signal);
     /// The same at a place from 0 on.
     void SetAt(int index, Signal *signal);
@@ -285,8 +281,6 @@ public:
                                      bool expandBuses);
 
 private:
-    bool IsIn(Signal const *signal) const;
-
     struct Record;
     std::unique_ptr<Record> record;
 };

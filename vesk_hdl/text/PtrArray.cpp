@@ -1,9 +1,11 @@
 #include "vesk_hdl/text/PtrArray.h"
 
+#include <algorithm>
+#include <cassert>
 #include <cstdlib>
 #include <cstring>
-#include <limits>
 #include <new>
+#include <utility>
 
 #include "vesk_hdl/text/IntroSort.h"
 
@@ -11,36 +13,75 @@ namespace Vesk_Hdl {
 
 PtrArrayBase::PtrArrayBase() : block(nullptr) {}
 
-PtrArrayBase::~PtrArrayBase() {
-    if (!IsBorrowed())
-        std::free(block);
+PtrArrayBase::~PtrArrayBase() { FreeMemory(); }
+
+void PtrArrayBase::Borrow(void *memory, int count) {
+    assert(!block && "a block that is replaced here is never freed");
+    block = new (memory) Block{0, static_cast<unsigned int>(count) | BORROWED};
 }
 
-void PtrArrayBase::Borrow(void *memory, int count) { block = new (memory) Block{0, ~count}; }
-
-int PtrArrayBase::GetCapacity() const {
-    return !block ? 0 : IsBorrowed() ? ~block->capacity : block->capacity;
+std::size_t PtrArrayBase::GetGap() const {
+    return HasGap() ? reinterpret_cast<std::size_t const *>(block)[-1] : 0;
 }
 
-void PtrArrayBase::Reserve(int capacity) {
-    if (capacity <= 0)
-        throw std::bad_alloc(); // the size would pass what an int can count
+void PtrArrayBase::SetGap(std::size_t places) {
+    block->capacity &= ~HAS_GAP;
+    if (places == 0)
+        return;
+    block->capacity |= HAS_GAP;
+    reinterpret_cast<std::size_t *>(block)[-1] = places;
+}
+
+void *PtrArrayBase::GetMemory() const { return reinterpret_cast<void **>(block) - GetGap(); }
+
+void PtrArrayBase::FreeMemory() {
+    if (block && !IsBorrowed())
+        std::free(GetMemory());
+}
+
+/// Moves the head and the first elements by some places, down if that is negative. The capacity
+/// counts what the head leaves or takes.
+void PtrArrayBase::MoveHead(std::ptrdiff_t places, int elements) {
+    auto const gap = static_cast<std::ptrdiff_t>(GetGap()) + places;
+    assert(gap >= 0 && !IsBorrowed() && "the head would leave its memory");
+    void **const to = reinterpret_cast<void **>(block) + places;
+    std::memmove(to, block, BytesFor(elements));
+    block = reinterpret_cast<Block *>(to);
+    block->capacity = static_cast<unsigned int>(GetCapacity() - static_cast<int>(places));
+    SetGap(static_cast<std::size_t>(gap));
+}
+
+/// Moves into memory with that capacity after a gap of `gap` places. A large gap that is there is
+/// used up first.
+void PtrArrayBase::Reserve(int capacity, int gap) {
+    if (capacity <= 0 || capacity > MAX_CAPACITY || gap > MAX_CAPACITY)
+        throw std::bad_alloc(); // more than a block counts
     int const size = GetSize();
-    bool const wasBorrowed = IsBorrowed();
-    void *const memory = std::realloc(wasBorrowed ? nullptr : block, BytesFor(capacity));
+    std::size_t const free = GetGap();
+    if (gap == 0 && free > 0 && free >= static_cast<std::size_t>(size) &&
+        free + static_cast<std::size_t>(GetCapacity()) >= static_cast<std::size_t>(capacity)) {
+        MoveHead(-static_cast<std::ptrdiff_t>(free), size);
+        return;
+    }
+    std::size_t const bytes = static_cast<std::size_t>(gap) * sizeof(void *) + BytesFor(capacity);
+    bool const inPlace = !IsBorrowed() && free == 0 && gap == 0;
+    void *const memory = inPlace ? std::realloc(block, bytes) : std::malloc(bytes);
     if (!memory)
         throw std::bad_alloc();
-    if (wasBorrowed)
-        std::memcpy(memory, block, BytesFor(size));
-    block = static_cast<Block *>(memory);
-    block->size = size;
-    block->capacity = capacity;
+    auto *const moved = reinterpret_cast<Block *>(static_cast<void **>(memory) + gap);
+    if (!inPlace && block) {
+        std::memcpy(moved, block, BytesFor(size));
+        FreeMemory();
+    }
+    block = moved;
+    *block = {size, static_cast<unsigned int>(capacity)};
+    SetGap(static_cast<std::size_t>(gap));
 }
 
-/// 1, 2, 4, 8 and on; 0 when an int cannot count it.
+/// 1, 2, 4, 8 and on up to the most; 0 when there is no more.
 int PtrArrayBase::GrownCapacity() const {
-    int const growth = std::max(GetSize(), 1);
-    return GetSize() <= std::numeric_limits<int>::max() - growth ? GetSize() + growth : 0;
+    int const size = GetSize();
+    return size < MAX_CAPACITY ? std::min(size + std::max(size, 1), MAX_CAPACITY) : 0;
 }
 
 void PtrArrayBase::Empty() {
@@ -75,10 +116,19 @@ bool PtrArrayBase::Remove(void *item) {
     int const index = GetIndex(item);
     if (index < 0)
         return false;
-    auto const behind = static_cast<std::size_t>(GetSize() - index - 1);
-    std::memmove(Items() + index, Items() + index + 1, behind * sizeof(void *));
-    --block->size;
+    RemoveAt(index);
     return true;
+}
+
+void PtrArrayBase::RemoveAt(int index) {
+    assert(index >= 0 && index < GetSize() && "elements outside the array would move");
+    int const after = GetSize() - index - 1;
+    if (index < after && !IsBorrowed())
+        MoveHead(1, index);
+    else
+        std::memmove(Items() + index, Items() + index + 1,
+                     static_cast<std::size_t>(after) * sizeof(void *));
+    --block->size;
 }
 
 void PtrArrayBase::RemoveTail() {
@@ -86,11 +136,24 @@ void PtrArrayBase::RemoveTail() {
         --block->size;
 }
 
+void PtrArrayBase::Prepend(void *item) {
+    if (GetGap() == 0)
+        Reserve(std::max(GetCapacity(), 1), std::max(GetSize(), 1));
+    MoveHead(-1, 0);
+    Items()[0] = item;
+    ++block->size;
+}
+
+void PtrArrayBase::ExchangeElements(PtrArrayBase &other) {
+    assert(!IsBorrowed() && !other.IsBorrowed() && "borrowed memory stays with its owner");
+    std::swap(block, other.block);
+}
+
 void PtrArrayBase::SetAt(int index, void *item) {
     if (index < 0)
         return;
     if (index >= GetSize()) {
-        if (index == std::numeric_limits<int>::max())
+        if (index >= MAX_CAPACITY)
             throw std::bad_alloc();
         if (index >= GetCapacity())
             Reserve(std::max(index + 1, GrownCapacity()));

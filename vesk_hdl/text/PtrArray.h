@@ -37,8 +37,14 @@ protected:
     bool Contains(void *item) const { return GetIndex(item) >= 0; }
     /// Removes the first equal pointer and keeps the order of the others; false when absent.
     bool Remove(void *item);
+    /// Removes the element at an index that is in range. The shorter side moves up.
+    void RemoveAt(int index);
     /// Drops the last element. The array must not be empty.
     void RemoveTail();
+    /// Puts an element in front of all others.
+    void Prepend(void *item);
+    /// Exchanges the elements of two arrays, neither of which begins in borrowed memory.
+    void ExchangeElements(PtrArrayBase &other);
     /// Stores at `index`; an index past the end makes the array longer, with null in between. A
     /// negative index does nothing.
     void SetAt(int index, void *item);
@@ -54,17 +60,30 @@ protected:
     void Borrow(void *memory, int count);
 
 private:
-    /// Stands in front of the elements, in one block with them. There is none while nothing was
-    /// ever added: most arrays of a design stay empty.
+    /// The head of the elements, which follow it in the same memory. An array that nothing was ever
+    /// added to has none: most arrays of a design stay empty.
+    ///
+    /// An array may have a gap in front of its head: free places that removals at the front left,
+    /// or that additions at the front will take. So both cost as little there as at the end. The
+    /// last place of a gap holds the number of its places.
     struct Block {
         int size;
-        int capacity; ///< of borrowed memory its complement, below 0
+        unsigned int capacity; ///< places from the first element on, and the two marks
     };
+    static constexpr unsigned int BORROWED = 1U << 31;
+    static constexpr unsigned int HAS_GAP = 1U << 30;
+    static constexpr int MAX_CAPACITY = HAS_GAP - 1;
 
-    int GetCapacity() const;
-    bool IsBorrowed() const { return block && block->capacity < 0; }
+    int GetCapacity() const { return block ? static_cast<int>(block->capacity & MAX_CAPACITY) : 0; }
+    bool IsBorrowed() const { return block && (block->capacity & BORROWED) != 0; }
+    bool HasGap() const { return block && (block->capacity & HAS_GAP) != 0; }
+    std::size_t GetGap() const;
+    void SetGap(std::size_t places);
+    void *GetMemory() const;
+    void FreeMemory();
+    void MoveHead(std::ptrdiff_t places, int elements);
     int GrownCapacity() const;
-    void Reserve(int capacity);
+    void Reserve(int capacity, int gap = 0);
 
     Block *block;
 };
@@ -78,7 +97,10 @@ public:
     int GetIndex(T item) const { return PtrArrayBase::GetIndex(item); }
     bool Contains(T item) const { return PtrArrayBase::Contains(item); }
     bool Remove(T item) { return PtrArrayBase::Remove(item); }
+    void RemoveAt(int index) { PtrArrayBase::RemoveAt(index); }
     void RemoveTail() { PtrArrayBase::RemoveTail(); }
+    void Prepend(T item) { PtrArrayBase::Prepend(item); }
+    void ExchangeElements(PtrArray &other) { PtrArrayBase::ExchangeElements(other); }
     void SetAt(int index, T item) { PtrArrayBase::SetAt(index, item); }
     void Swap(int first, int second) { PtrArrayBase::Swap(first, second); }
 };
@@ -107,7 +129,7 @@ public:
 template <class T> class Iterator {
 public:
     /// A null array is one without elements.
-    explicit Iterator(PtrArray<T> const *walked = nullptr) : array(walked), position(0) {}
+    Iterator(PtrArray<T> const *walked = nullptr) : array(walked), position(0) {}
     Iterator(Iterator const &other) : array(other.array), position(0) {}
     virtual ~Iterator() = default;
     Iterator &operator=(Iterator const &other) {

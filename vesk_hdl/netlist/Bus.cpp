@@ -1,0 +1,114 @@
+#include "vesk_hdl/netlist/BusRecord.h"
+#include "vesk_hdl/netlist/BusText.h"
+#include "vesk_hdl/netlist/Names.h"
+#include "vesk_hdl/text/StringArray.h"
+
+namespace Vesk_Hdl {
+
+using Basis::StringBase;
+
+Bus::Bus(char const *name) : Signal(name), record(std::make_unique<Record>()) {}
+
+Bus::~Bus() {
+    if (record->cell)
+        record->cell->bus = nullptr;
+    ParentCell::Leave(record->cell);
+}
+
+Signal::SignalType Bus::GetSignalType() const { return SIGNAL_BUS; }
+void Bus::SetPortPolarity(Polarity const &polarity) { record->portPolarity = polarity; }
+
+void Bus::AcceptSignal(SignalVisitor &visitor) {
+    visitor.VisitBus(this);
+    visitor.VisitSignal(this);
+}
+
+Polarity Bus::GetPortPolarity() const { return record->portPolarity; }
+int Bus::GetWidth() const { return Names::BusWidth(GetNameRef().View()); }
+bool Bus::IsPort() const { return GetPortPolarity() != Polarity::INVALID; }
+bool Bus::IsNeededToDeclared() const { return true; }
+
+StringBase<char> Bus::GetDummySignalName() const {
+    StringBase<char> base = GetBaseName();
+    return Names::EndsInDummyTag(base.View()) ? base : GetDummyBusName(*this);
+}
+
+/// The cell for one more part.
+ParentCell *Bus::ShareCell() {
+    if (!record->cell)
+        record->cell = new ParentCell(this);
+    return ParentCell::Join(record->cell);
+}
+
+void Bus::AddBusSlice(Signal *slice) { record->busSlices.Add(slice); }
+void Bus::RemoveBusSlice(Signal *slice) { record->busSlices.Remove(slice); }
+void Bus::EmptyBusSlice() { record->busSlices.Empty(); }
+
+Iterator<Signal *> Bus::GetBusSliceIterator() const {
+    return Iterator<Signal *>(&record->busSlices);
+}
+
+void Bus::GetIndex(StringBase<char> &left, StringBase<char> &right) const {
+    GetBounds(*this, left, right);
+}
+void Bus::GetIndex(int, int) const {}
+bool Bus::IsDownTo() const { return RunsDown(*this); }
+StringBase<char> Bus::GetBaseName() const { return Object::GetBaseName(GetNameRef()); }
+Bus *Bus::CreateDummySignal() const { return new Bus(GetDummySignalName()); }
+
+bool Bus::IsBusName(StringBase<char> const &name) { return Names::IsBusName(name.View()); }
+
+bool Bus::ParseBusName(StringBase<char> const &name, StringBase<char> &base, StringBase<char> &left,
+                       StringBase<char> &right) {
+    StringBase<char> const whole(name); // an output may be the name itself
+    Names::BusParts parts;
+    if (!Names::SplitBusName(whole.View(), parts))
+        return false;
+    base = StringBase<char>(parts.base);
+    left = StringBase<char>(parts.left);
+    right = StringBase<char>(parts.right);
+    return true;
+}
+
+bool Bus::ParseBusName(StringBase<char> const &name, StringBase<char> &base, int &left,
+                       int &right) {
+    Names::BusParts parts;
+    if (!Names::SplitBusName(name.View(), parts))
+        return false;
+    left = Names::ToInt(parts.left);
+    right = Names::ToInt(parts.right);
+    base = StringBase<char>(parts.base);
+    return true;
+}
+
+bool Bus::ParseBusName(StringBase<char> const &name, StringArray &bits) {
+    Names::BusParts parts;
+    Names::Bounds bounds;
+    if (!Names::IsBusName(name.View()) || !Names::SplitBusName(name.View(), parts) ||
+        !Names::ParseBounds(name.View(), bounds))
+        return false;
+    for (unsigned int position = 0;; ++position) {
+        bits.Add(Names::BitName(parts.base, bounds.IndexAt(position)));
+        if (position == bounds.Distance())
+            return true;
+    }
+}
+
+StringBase<char> Bus::GetBusSliceName(StringBase<char> const &name, int start, int count) {
+    Names::BusParts parts;
+    Names::Bounds bounds;
+    if (!Names::IsBusName(name.View()) || !Names::SplitBusName(name.View(), parts) ||
+        !Names::ParseBounds(name.View(), bounds))
+        return {};
+    long long const bits = static_cast<long long>(bounds.Distance()) + 1;
+    long long const end = static_cast<long long>(start) + count;
+    if (start < 0 || start >= bits || end > bits)
+        return {};
+    auto const first = static_cast<unsigned int>(start);
+    if (count < 2)
+        return Names::BitName(parts.base, bounds.IndexAt(first));
+    return Names::BusName(parts.base, bounds.IndexAt(first),
+                          bounds.IndexAt(static_cast<unsigned int>(end - 1)));
+}
+
+} // namespace Vesk_Hdl

@@ -1,0 +1,119 @@
+#pragma once
+
+#include <atomic>
+#include <memory>
+#include <mutex>
+#include <unordered_map>
+
+#include "vesk_hdl/text/PtrArray.h"
+
+namespace Vesk_Hdl {
+
+/// The objects of one kind in a netlist, in their order, as their owner.
+///
+/// A design may widen a hundred thousand buses, and each removes one from anywhere in the order.
+/// So a removal leaves a hole (null), which costs nothing, and the holes are closed when somebody
+/// asks for the array. A client that ever got an iterator may still have it, and sees a removal at
+/// once: from then on the array is closed each time.
+template <class T> class ObjectArray {
+public:
+    void Add(T *object) {
+        objects.Add(object);
+        if (places) {
+            try {
+                places->insert_or_assign(object, objects.GetSize() - 1);
+            } catch (...) {
+                places.reset();
+            }
+        }
+    }
+    void RemoveTail() {
+        if (places)
+            places->erase(objects.GetTail());
+        objects.RemoveTail();
+    }
+
+    /// Takes an object out, without deleting it.
+    void Remove(T *object) {
+        if (objects.GetTail() == object)
+            return RemoveTail();
+        if (isWatched.load(std::memory_order_relaxed)) {
+            places.reset();
+            objects.Remove(object);
+            return;
+        }
+        int const place = Find(object);
+        if (place < 0)
+            return;
+        objects.SetAt(place, nullptr);
+        if (holes.fetch_add(1, std::memory_order_relaxed) + 1 > MIN_HOLES + objects.GetSize() / 2)
+            Close();
+    }
+
+    /// The array without holes, for a walk that ends before the next removal.
+    PtrArray<T *> const &Get() const {
+        Close();
+        return objects;
+    }
+    /// The same for changing the order.
+    PtrArray<T *> &GetForSort() {
+        Close();
+        places.reset();
+        return objects;
+    }
+    /// For a client, who may keep it.
+    Iterator<T *> GetIterator() const {
+        Close();
+        if (!isWatched.load(std::memory_order_relaxed))
+            isWatched.store(true, std::memory_order_relaxed);
+        return Iterator<T *>(&objects);
+    }
+
+private:
+    static constexpr int MIN_HOLES = 32;
+
+    int Find(T *object) {
+        try {
+            if (!places) {
+                places = std::make_unique<std::unordered_map<T *, int>>();
+                for (int i = 0; i < objects.GetSize(); ++i)
+                    if (T *const other = objects.GetAt(i))
+                        places->try_emplace(other, i);
+            }
+        } catch (...) { // without memory for an index there is still the array
+            places.reset();
+            return objects.GetIndex(object);
+        }
+        auto const found = places->find(object);
+        if (found == places->end())
+            return -1;
+        int const place = found->second;
+        places->erase(found);
+        return place;
+    }
+
+    /// Several threads may read a netlist at once: one of them closes the holes.
+    void Close() const {
+        if (holes.load(std::memory_order_acquire) == 0)
+            return;
+        static std::mutex mutex;
+        std::lock_guard<std::mutex> const lock(mutex);
+        if (holes.load(std::memory_order_relaxed) == 0)
+            return;
+        int kept = 0;
+        for (int i = 0; i < objects.GetSize(); ++i)
+            if (T *const object = objects.GetAt(i))
+                objects.SetAt(kept++, object);
+        while (objects.GetSize() > kept)
+            objects.RemoveTail();
+        places.reset();
+        holes.store(0, std::memory_order_release);
+    }
+
+    mutable OwnPtrArray<T *> objects;
+    mutable std::unique_ptr<std::unordered_map<T *, int>> places; ///< null until a removal asks
+    mutable std::atomic<int> holes{0};
+    mutable std::atomic<bool> isWatched{false};
+};
+
+} // namespace Vesk_Hdl

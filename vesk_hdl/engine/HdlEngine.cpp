@@ -1,6 +1,7 @@
 #include "vesk_hdl/engine/HdlEngine.h"
 
 #include "vesk_hdl/engine/Keywords.h"
+#include "vesk_hdl/engine/ModelIndex.h"
 #include "vesk_hdl/hdl/NetlistHeader.h"
 #include "vesk_hdl/model/HdlOptions.h"
 #include "vesk_hdl/netlist/Netlist.h"
@@ -93,6 +94,7 @@ WriteOpener *Model::GetWriteOpener() const { return record->writeOpener; }
 
 struct Engine::Record {
     CommandFactory factory; ///< outlives the models, which point at it
+    ModelIndex index;       ///< outlives them, too: they count their renames there
     OwnPtrArray<Model *> models;
     Model *currentModel = nullptr;
 };
@@ -100,15 +102,7 @@ struct Engine::Record {
 Engine::Engine() : record(std::make_unique<Record>()) {}
 Engine::~Engine() = default;
 
-Model *Engine::GetModel(char const *name) const {
-    StringBase<char> const wanted(name);
-    for (int i = 0; i < record->models.GetSize(); ++i) {
-        Model *const model = record->models.GetAt(i);
-        if (model->GetName().Compare(wanted, StringBase<char>::COMPARE_IGNORING_CASE) == 0)
-            return model;
-    }
-    return nullptr;
-}
+Model *Engine::GetModel(char const *name) const { return record->index.Find(record->models, name); }
 
 Model *Engine::GetCurrentModel() const { return record->currentModel; }
 
@@ -119,7 +113,7 @@ bool Engine::CreateAndAddModel(char const *name, char const *sourceFileName) {
     model->SetName(name ? name : "");
     model->SetSourceFileName(sourceFileName);
     record->models.Add(model.get());
-    model.release();
+    record->index.Add(*model.release());
     return true;
 }
 
@@ -138,6 +132,7 @@ bool Engine::RemoveModel(char const *name) {
     if (record->currentModel == model)
         record->currentModel = nullptr;
     record->models.Remove(model);
+    record->index.Remove(*model);
     delete model;
     return true;
 }

@@ -3,6 +3,8 @@
 #include <clocale>
 #include <cstdlib>
 #include <locale.h>
+#include <utility>
+#include <vector>
 
 #include "vesk_hdl/text/StringArray.h"
 #include "vesk_hdl/text/basis/Functions.h"
@@ -232,58 +234,103 @@ StringBase<char> AttributeUser::GetUserType() const { return record->userType; }
 
 AttributeVisitor::~AttributeVisitor() = default;
 
+/// The attributes, each with the name it was added under, by which it is found although a client
+/// may have renamed it since.
 struct AttributeHolder::Record {
+    static constexpr int MAX_SCAN = 8; ///< more attributes than that are found by a map
+
     OwnPtrArray<Attribute *> attributes;
-    IStringPtrMap<Attribute *> attributeMap;
+    std::vector<StringBase<char>> names;
+    std::unique_ptr<IStringPtrMap<Attribute *>> map;
+
+    void Add(std::unique_ptr<Attribute> attribute) {
+        names.push_back(attribute->GetNameRef());
+        try {
+            attributes.Add(attribute.get());
+        } catch (...) {
+            names.pop_back();
+            throw;
+        }
+        Attribute *const added = attribute.release();
+        if (map)
+            map->Add(added->GetNameRef(), added);
+        else if (attributes.GetSize() > MAX_SCAN)
+            MakeMap();
+    }
+
+    /// The newest of a name.
+    Attribute *Find(char const *name) const {
+        if (map)
+            return map->Get(name);
+        for (int i = attributes.GetSize() - 1; i >= 0; --i)
+            if (names[static_cast<std::size_t>(i)].Compare(
+                    name, StringBase<char>::COMPARE_IGNORING_CASE) == 0)
+                return attributes.GetAt(i);
+        return nullptr;
+    }
+
+    void DeleteAll() {
+        map.reset();
+        names.clear();
+        attributes.DeleteAll();
+    }
+
+private:
+    void MakeMap() {
+        auto made = std::make_unique<IStringPtrMap<Attribute *>>();
+        for (int i = 0; i < attributes.GetSize(); ++i)
+            made->Add(names[static_cast<std::size_t>(i)], attributes.GetAt(i));
+        map = std::move(made);
+    }
 };
 
-AttributeHolder::AttributeHolder() = default;
+AttributeHolder::AttributeHolder() : record(nullptr) {}
 
 AttributeHolder::AttributeHolder(AttributeHolder const &other) : AttributeHolder() {
     AttributeHolder::operator=(other);
 }
 
-AttributeHolder::~AttributeHolder() = default;
+AttributeHolder::~AttributeHolder() { delete record.load(std::memory_order_relaxed); }
 
+/// Threads that only read may ask at once: the first of them gives the holder its record.
 AttributeHolder::Record &AttributeHolder::Own() const {
-    if (!record)
-        record = std::make_unique<Record>();
-    return *record;
+    Record *own = record.load(std::memory_order_acquire);
+    if (own)
+        return *own;
+    auto made = std::make_unique<Record>();
+    if (record.compare_exchange_strong(own, made.get(), std::memory_order_acq_rel))
+        own = made.release();
+    return *own;
 }
 
 AttributeHolder &AttributeHolder::operator=(AttributeHolder const &other) {
     if (this == &other)
         return *this;
-    if (record) {
-        // Names that only the old set had are forgotten with it, so that none leads to a dead one.
-        // The array stays: a client may still walk it.
-        record->attributeMap.Empty();
-        record->attributes.DeleteAll();
-    }
-    if (other.record)
-        ForEach(other.record->attributes,
+    if (Record *const own = record.load(std::memory_order_relaxed))
+        own->DeleteAll(); // the array stays: a client may still walk it
+    if (Record const *const others = other.record.load(std::memory_order_acquire))
+        ForEach(others->attributes,
                 [this](Attribute *attribute) { AddAttr(attribute->CloneAttribute()); });
     return *this;
 }
 
 void AttributeHolder::AddAttr(Attribute *attribute) {
-    if (!attribute)
-        return;
     std::unique_ptr<Attribute> held(attribute);
-    Own().attributes.Add(attribute);
-    held.release();
-    record->attributeMap.Add(attribute->GetNameRef(), attribute);
+    if (attribute)
+        Own().Add(std::move(held));
 }
 
 Attribute *AttributeHolder::GetAttr(char const *name) const {
-    return record ? record->attributeMap.Get(name) : nullptr;
+    Record const *const own = record.load(std::memory_order_acquire);
+    return own ? own->Find(name) : nullptr;
 }
 
-Iterator<Attribute *> AttributeHolder::GetAttrIterator() const {
-    return Iterator<Attribute *>(&Own().attributes);
-}
+Iterator<Attribute *> AttributeHolder::GetAttrIterator() const { return &Own().attributes; }
 
-bool AttributeHolder::HasAttrs() const { return record && !record->attributes.IsEmpty(); }
+bool AttributeHolder::HasAttrs() const {
+    Record const *const own = record.load(std::memory_order_acquire);
+    return own && !own->attributes.IsEmpty();
+}
 
 AttributeFactory::AttributeFactory()
     : creators(std::make_unique<IStringPtrMap<AttributeCreator>>()) {

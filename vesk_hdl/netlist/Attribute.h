@@ -1,5 +1,6 @@
 #pragma once
 
+#include <atomic>
 #include <memory>
 
 #include "vesk_hdl/netlist/Object.h"
@@ -204,7 +205,7 @@ private:
     struct Record;
     Record &Own() const;
 
-    mutable std::unique_ptr<Record> record; ///< null while nothing was added
+    mutable std::atomic<Record *> record; ///< null while nothing was added or asked for
 };
 
 /// Makes attributes by type word. One object serves the whole process.

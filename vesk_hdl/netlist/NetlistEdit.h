@@ -25,6 +25,9 @@ public:
     /// name or by a walk. Polarity, comment, attributes and constant of the old bus are lost.
     Bus *Widen(Bus *bus, char const *name);
 
+    /// From now on each change of the netlist's name adds 1 to a counter, which outlives it.
+    void CountRenames(unsigned long &counter) { netlist.CountRenames(counter); }
+
 private:
     BusSlice *PutSliceInPlaceOf(Bus *bus, BusSlice &made);
     BusSlice *RepointToSlice(Bus *bus, std::unique_ptr<BusSlice> made);

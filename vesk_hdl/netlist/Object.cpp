@@ -31,10 +31,10 @@ Object::Record *Object::NoRecord() {
 
 /// A record with that name, all else as in a model or as the class begins.
 template <class Made, class... Model>
-Object::Record *Object::MakeRecord(std::string_view name, Model const &...model) {
+Object::Record *Object::MakeRecord(std::string_view name, Model &&...model) {
     void *room = nullptr;
     StringBase<char> text = StringBase<char>::MakeWithRoom(name, sizeof(Made), room);
-    auto *const made = new (room) Made(model...);
+    auto *const made = new (room) Made(std::forward<Model>(model)...);
     made->name = std::move(text);
     return made;
 }
@@ -47,11 +47,13 @@ void Object::Replace(Record *now) {
 void Object::Rename(std::string_view name) {
     switch (record->content) {
     case Record::NAME:
-        return Replace(MakeRecord<Record>(name, *record));
+        return Replace(MakeRecord<Record>(name, std::as_const(*record)));
     case Record::COMMENT:
-        return Replace(MakeRecord<CommentRecord>(name, static_cast<CommentRecord &>(*record)));
+        return Replace(MakeRecord<CommentRecord>(name, static_cast<CommentRecord const &>(*record)));
+    case Record::NETLIST:
+        return Replace(MakeRecord<NetlistRecord>(name, static_cast<NetlistRecord const &>(*record)));
     case Record::PIN:
-        return Replace(MakeRecord<PinRecord>(name, static_cast<PinRecord &>(*record)));
+        return Replace(MakeRecord<PinRecord>(name, static_cast<PinRecord const &>(*record)));
     }
 }
 
@@ -65,8 +67,12 @@ Object::Record &Object::Own() {
 /// The comment for writing: this object's alone.
 StringBase<char> &Object::OwnComment() {
     if (record->content == Record::NAME)
-        Replace(MakeRecord<CommentRecord>(record->name.View(), *record));
+        Replace(MakeRecord<CommentRecord>(record->name.View(), std::as_const(*record)));
     return Own().OwnComment();
+}
+
+void Object::CountRenames(unsigned long &counter) {
+    Replace(MakeRecord<NetlistRecord>(record->name.View(), std::as_const(*record), counter));
 }
 
 void Object::BeginPin(char const *name, Polarity::Value polarity) {
@@ -104,18 +110,20 @@ void Object::Release() {
         return record->~Record();
     case Record::COMMENT:
         return static_cast<CommentRecord *>(record)->~CommentRecord();
+    case Record::NETLIST:
+        return static_cast<NetlistRecord *>(record)->~NetlistRecord();
     case Record::PIN:
         return static_cast<PinRecord *>(record)->~PinRecord();
     }
 }
 
-/// Assigns name, comment and kind, and nothing of what makes a pin a pin. Between two objects that
-/// are no pins that is the whole record.
+/// Assigns name, comment and kind, and nothing of what makes a pin a pin. In most objects that is the
+/// whole record.
 Object &Object::operator=(Object const &other) {
     if (record == other.record)
         return *this;
     record->NoteChange();
-    if (record->content != Record::PIN && other.record->content != Record::PIN) {
+    if (record->content < Record::NETLIST && other.record->content < Record::NETLIST) {
         Share(other);
         return *this;
     }

@@ -69,7 +69,10 @@ protected:
 
     struct Record;
     struct CommentRecord;
+    struct NetlistRecord;
     struct PinRecord;
+    /// From now on each change of the name adds 1 to a counter, which outlives the object.
+    void CountRenames(unsigned long &counter);
     /// For a pin: begins with that polarity, in place of what the constructor made.
     void BeginPin(char const *name, Polarity::Value polarity);
     /// The data that a pin shares with its copies.
@@ -82,7 +85,7 @@ protected:
 private:
     static Record *NoRecord();
     template <class Made, class... Model>
-    static Record *MakeRecord(std::string_view name, Model const &...model);
+    static Record *MakeRecord(std::string_view name, Model &&...model);
     Record &Own();
     void Rename(std::string_view name);
     void Replace(Record *now);

@@ -17,7 +17,7 @@ namespace Vesk_Hdl {
 /// Few objects have more than a name and a kind; their records are of a derived class, which
 /// `content` names.
 struct Object::Record {
-    enum Content : char { NAME, COMMENT, PIN };
+    enum Content : char { NAME, COMMENT, NETLIST, PIN };
 
     explicit Record(Content recordContent = NAME) : content(recordContent) {}
     /// All but the name.
@@ -38,11 +38,23 @@ struct Object::Record {
 
 /// The record of an object that is no pin and has a comment.
 struct Object::CommentRecord : Object::Record {
-    /// Of an object that gets its first comment.
-    explicit CommentRecord(Record const &model) : Record(COMMENT) { objectType = model.objectType; }
+    /// Of an object that gets its first comment, or becomes more than an object with one.
+    explicit CommentRecord(Record const &model, Content recordContent = COMMENT)
+        : Record(recordContent), comment(model.GetComment()) {
+        objectType = model.objectType;
+    }
     CommentRecord(CommentRecord const &) = default;
 
     Basis::StringBase<char> comment;
+};
+
+/// The record of a netlist that is found by its name, which is a model's.
+struct Object::NetlistRecord : Object::CommentRecord {
+    NetlistRecord(Record const &model, unsigned long &counter)
+        : CommentRecord(model, NETLIST), renames(counter) {}
+    NetlistRecord(NetlistRecord const &) = default;
+
+    unsigned long &renames; ///< counts changes of names, and outlives the netlist
 };
 
 /// The record of a pin.
@@ -69,10 +81,10 @@ inline Basis::StringBase<char> &Object::Record::OwnComment() {
 }
 
 inline void Object::Record::NoteChange() const {
-    if (content != PIN)
-        return;
-    if (auto const &family = static_cast<PinRecord const *>(this)->family)
-        family->NoteChange();
+    if (content == NETLIST)
+        ++static_cast<NetlistRecord const *>(this)->renames;
+    else if (content == PIN && static_cast<PinRecord const *>(this)->family)
+        static_cast<PinRecord const *>(this)->family->NoteChange();
 }
 
 } // namespace Vesk_Hdl

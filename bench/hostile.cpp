@@ -17,7 +17,9 @@ namespace {
 
 namespace fs = std::filesystem;
 
-constexpr int STEPS = 4; ///< n, 2n, 4n and 8n
+constexpr int STEPS = 4;      ///< n, 2n, 4n and 8n
+constexpr int MORE_STEPS = 2; ///< for kinds that are over before they can be measured
+constexpr double ENOUGH_CPU = 0.15;
 /// What is less than this above the cost of an empty file is noise.
 constexpr double LEAST_CPU = 0.02;
 constexpr double LEAST_MEMORY = 1e6;
@@ -110,20 +112,18 @@ private:
     }
 
     void RunKind(HostileKind const &kind) {
-        std::vector<double> sizes;
-        for (int step = STEPS; step-- > 0;)
-            sizes.push_back(std::max(
-                1.0, std::floor(options.sizes * static_cast<double>(kind.size) / (1 << step))));
         fs::path const file = scratch.GetPath() / "hostile.cmd";
         std::vector<Curve> curves(options.modes.size());
-        for (double const size : sizes)
-            if (!std::all_of(curves.begin(), curves.end(),
-                             [](Curve const &c) { return c.isCut; })) {
-                Write(kind, size, file);
-                for (std::size_t mode = 0; mode < curves.size(); ++mode)
-                    AddPoint(curves[mode], options.modes[mode], size, file);
-            }
-        std::printf("%-42s %8.0f %7.0f", kind.name.c_str(), sizes.back(),
+        double size = std::max(1.0, std::floor(options.sizes * static_cast<double>(kind.size)));
+        for (int step = 1; step < STEPS; ++step)
+            size = std::max(1.0, std::floor(size / 2));
+        for (int step = 0; step < STEPS + MORE_STEPS && GoOn(curves, step); ++step) {
+            size *= step > 0 ? 2 : 1;
+            Write(kind, size, file);
+            for (std::size_t mode = 0; mode < curves.size(); ++mode)
+                AddPoint(curves[mode], options.modes[mode], size, file);
+        }
+        std::printf("%-42s %8.0f %7.0f", kind.name.c_str(), size,
                     static_cast<double>(fs::file_size(file)) / 1000);
         bool isFast = false;
         for (std::size_t mode = 0; mode < curves.size(); ++mode) {
@@ -134,6 +134,16 @@ private:
         PrintRatios(curves);
         std::printf("\n");
         std::fflush(stdout);
+    }
+
+    /// Whether another size is worth measuring.
+    static bool GoOn(std::vector<Curve> const &curves, int step) {
+        bool const isAnyLeft = std::any_of(curves.begin(), curves.end(),
+                                           [](Curve const &curve) { return !curve.isCut; });
+        return step < STEPS ? isAnyLeft
+                            : std::all_of(curves.begin(), curves.end(), [](Curve const &curve) {
+                                  return !curve.isCut && curve.costs.back().cpu < ENOUGH_CPU;
+                              });
     }
 
     static void Write(HostileKind const &kind, double size, fs::path const &file) {

@@ -18,8 +18,20 @@ double Seconds(timeval const &time) {
     return static_cast<double>(time.tv_sec) + 1e-6 * static_cast<double>(time.tv_usec);
 }
 
+void Limit(decltype(RLIMIT_CPU) resource, double most) {
+    auto const value = static_cast<rlim_t>(most);
+    rlimit const limit = {value, value};
+    if (::setrlimit(resource, &limit) != 0)
+        ::_exit(127);
+}
+
 /// In the child, which has nothing but to become the program.
-[[noreturn]] void Become(char *const *arguments, char const *folder, bool quiet) {
+[[noreturn]] void Become(char *const *arguments, char const *folder, bool quiet,
+                         Limits const *limits) {
+    if (limits) {
+        Limit(RLIMIT_CPU, limits->cpu);
+        Limit(RLIMIT_AS, limits->memory);
+    }
     int const nothing = ::open("/dev/null", O_RDWR);
     if (quiet && (::dup2(nothing, STDOUT_FILENO) < 0 || ::dup2(nothing, STDERR_FILENO) < 0))
         ::_exit(127);
@@ -36,7 +48,16 @@ void Cost::Lower(Cost const &other) {
     peak = std::min(peak, other.peak);
 }
 
-Cost RunProgram(std::vector<std::string> words, fs::path const &folder, bool quiet) {
+namespace {
+
+/// How a program ended, and at what cost.
+struct Run {
+    Cost cost;
+    int status;
+};
+
+Run Start(std::vector<std::string> words, fs::path const &folder, bool quiet,
+          Limits const *limits) {
     std::vector<char *> arguments;
     for (std::string &word : words)
         arguments.push_back(word.data());
@@ -45,16 +66,38 @@ Cost RunProgram(std::vector<std::string> words, fs::path const &folder, bool qui
     auto const begin = std::chrono::steady_clock::now();
     pid_t const process = ::fork();
     if (process == 0)
-        Become(arguments.data(), folder.c_str(), quiet);
+        Become(arguments.data(), folder.c_str(), quiet, limits);
     int status = 0;
     rusage usage = {};
     if (process < 0 || ::wait4(process, &status, 0, &usage) < 0)
         throw std::system_error(errno, std::generic_category(), words[0]);
     std::chrono::duration<double> const wall = std::chrono::steady_clock::now() - begin;
-    if (!WIFEXITED(status) || WEXITSTATUS(status) != 0)
-        throw std::runtime_error(words[0] + ": failed in " + folder.string());
-    return {wall.count(), Seconds(usage.ru_utime) + Seconds(usage.ru_stime),
-            1024.0 * static_cast<double>(usage.ru_maxrss)};
+    return {{wall.count(), Seconds(usage.ru_utime) + Seconds(usage.ru_stime),
+             1024.0 * static_cast<double>(usage.ru_maxrss)},
+            status};
+}
+
+} // namespace
+
+Cost RunProgram(std::vector<std::string> words, fs::path const &folder, bool quiet) {
+    std::string const name = words[0];
+    Run const run = Start(std::move(words), folder, quiet, nullptr);
+    if (!WIFEXITED(run.status) || WEXITSTATUS(run.status) != 0)
+        throw std::runtime_error(name + ": failed in " + folder.string());
+    return run.cost;
+}
+
+std::optional<Cost> TryProgram(std::vector<std::string> words, fs::path const &folder,
+                               Limits const &limits) {
+    std::string const name = words[0];
+    Run const run = Start(std::move(words), folder, true, &limits);
+    // Out of memory, the tool ends with 1 as well; a buffer that grows fails at a third of the
+    // limit at the earliest.
+    if (!WIFEXITED(run.status) || run.cost.peak > limits.memory / 4)
+        return std::nullopt;
+    if (WEXITSTATUS(run.status) > 1)
+        throw std::runtime_error(name + ": failed in " + folder.string());
+    return run.cost;
 }
 
 ScratchFolder::ScratchFolder() {

@@ -2,6 +2,7 @@
 
 #include <filesystem>
 #include <limits>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -18,6 +19,17 @@ struct Cost {
 /// name is looked for as a shell does. A program that fails raises std::runtime_error. What it
 /// prints is dropped if it is `quiet`.
 Cost RunProgram(std::vector<std::string> words, std::filesystem::path const &folder, bool quiet);
+
+/// What a program may use before it is stopped.
+struct Limits {
+    double cpu;    ///< in seconds, whole ones
+    double memory; ///< in bytes, of addresses
+};
+
+/// The same, quietly, for a program that may take too long. An exit code of 0 or 1 is a success;
+/// nothing comes back from a run that met a limit.
+std::optional<Cost> TryProgram(std::vector<std::string> words, std::filesystem::path const &folder,
+                               Limits const &limits);
 
 /// A folder that goes away with this object.
 class ScratchFolder {

@@ -3,6 +3,7 @@
 #include <array>
 #include <bit>
 #include <cstdint>
+#include <cstring>
 #include <typeinfo>
 
 #include <gtest/gtest.h>
@@ -112,6 +113,34 @@ TEST(Interface, ObjectComesBeforeAttributeHolder) {
     EXPECT_TRUE(Follows(ScalarSignal("s")) && Follows(ScalarPin("p", "in")) &&
                 Follows(Component("c")));
     EXPECT_TRUE(Follows(Instance("i", nullptr)) && Follows(Netlist("n")));
+}
+
+/// A number of type `Word` in the memory that starts at `base`.
+template <class Word> Word WordAt(void const *base, std::size_t bytes) {
+    Word word;
+    std::memcpy(&word, static_cast<char const *>(base) + bytes, sizeof word);
+    return word;
+}
+
+// What inline functions of the headers read: a compiled client holds these places.
+
+TEST(Interface, MemoryOfArraysAndStrings) {
+    int item = 0;
+    PtrArray<int *> array;
+    EXPECT_EQ(nullptr, WordAt<void *>(&array, sizeof(void *))); // no block before the first element
+    array.Add(nullptr);
+    array.Add(&item);
+    void const *const block = WordAt<void *>(&array, sizeof(void *));
+    EXPECT_EQ(2, WordAt<int>(block, 0)); // the size, the capacity, and the elements
+    EXPECT_EQ(&item, WordAt<int *>(block, 8 + sizeof(void *)));
+
+    String const text("abc");
+    String const copy(text);
+    void const *const rep = WordAt<void *>(&text, 0);
+    EXPECT_EQ(2U, WordAt<unsigned int>(rep, 0)); // owners, length, capacity, and the characters
+    EXPECT_EQ(3U, WordAt<unsigned int>(rep, 4));
+    EXPECT_EQ(text.GetText(), static_cast<char const *>(rep) + 12);
+    EXPECT_EQ(text.GetText(), copy.GetText());
 }
 
 template <auto... values> constexpr bool CountFrom(int first) {

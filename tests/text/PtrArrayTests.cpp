@@ -49,6 +49,51 @@ TEST(PtrArray, IndexesOutsideAreHarmless) {
     EXPECT_EQ(array.GetAt(0), nullptr);
 }
 
+TEST(PtrArray, GrowsAndShrinksAtBothEnds) {
+    std::vector<Item> pool(50);
+    std::mt19937 random(7);
+    PtrArray<Item *> array;
+    InlinePtrArray<Item *, 3> lent;
+    Items model;
+    // A phase mostly adds, or mostly removes, at one of the ends.
+    for (int step = 0; step < 20000; ++step) {
+        unsigned const phase = static_cast<unsigned>(step / 500) % 4;
+        Item *const item = &pool[random() % pool.size()];
+        auto const size = static_cast<int>(model.size());
+        switch (random() % 4 == 0 ? random() % 5 : phase) {
+        case 0:
+            array.Prepend(item);
+            lent.Prepend(item);
+            model.insert(model.begin(), item);
+            break;
+        case 1:
+        case 2:
+            if (size == 0)
+                break;
+            array.RemoveAt(phase == 1 ? 0 : step % size);
+            lent.RemoveAt(phase == 1 ? 0 : step % size);
+            model.erase(model.begin() + (phase == 1 ? 0 : step % size));
+            break;
+        case 3:
+            array.Add(item);
+            lent.Add(item);
+            model.push_back(item);
+            break;
+        default:
+            array.SetAt(size + 1, item);
+            lent.SetAt(size + 1, item);
+            model.push_back(nullptr);
+            model.push_back(item);
+        }
+        ASSERT_EQ(In(array), model) << step;
+        ASSERT_EQ(In(lent), model) << step;
+    }
+    PtrArray<Item *> other;
+    other.Add(&pool[0]);
+    array.ExchangeElements(other);
+    EXPECT_TRUE(In(other) == model && In(array) == Items{&pool[0]});
+}
+
 struct Mortal {
     Mortal(std::string &d, char n) : deaths(d), name(n) {}
     virtual ~Mortal() { deaths += name; }

@@ -2,6 +2,7 @@
 
 #include "vesk_hdl/hdl/Pieces.h"
 #include "vesk_hdl/netlist/Netlist.h"
+#include "vesk_hdl/text/ForEachAhead.h"
 #include "vesk_hdl/text/StringArray.h"
 
 // What the writers of both languages decide alike.
@@ -26,7 +27,7 @@ inline bool IsDeclaredPort(Signal const &signal) {
 /// parts: with a million signals it takes longer than most of the parts.
 struct SignalLists {
     explicit SignalLists(Netlist const &netlist) {
-        ForEach(netlist.GetSignals(), [this](Signal *signal) {
+        ForEachAhead(netlist.GetSignals(), [this](Signal *signal) {
             if (IsDeclaredPort(*signal))
                 ports.Add(signal);
             if (signal->HasAttrs() && signal->GetPortPolarity() == Polarity::INVALID &&

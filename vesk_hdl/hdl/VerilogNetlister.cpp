@@ -9,6 +9,7 @@
 #include "vesk_hdl/hdl/VerilogStatements.h"
 #include "vesk_hdl/netlist/CompoundWalk.h"
 #include "vesk_hdl/netlist/Netlist.h"
+#include "vesk_hdl/text/ForEachAhead.h"
 #include "vesk_hdl/text/basis/Ascii.h"
 
 using namespace Vesk_Hdl;
@@ -159,7 +160,7 @@ void VerilogNetlister::WriteNetlist(Netlist *netlist, HdlOptions const &options)
 void VerilogNetlister::SetNameCase(Netlist *netlist, HdlOptions const &options) {
     auto const setCase = [this](auto const &objects, VerilogOption::CaseType type) {
         if (type != VerilogOption::CASE_DEFAULT)
-            ForEach(objects, [this, type](Object *object) {
+            ForEachAhead(objects, [this, type](Object *object) {
                 SetNameCase(object, type == VerilogOption::CASE_UPPER);
             });
     };
@@ -203,7 +204,7 @@ void VerilogNetlister::WriteModulelAndPorts(Text const &name, Iterator<Signal *>
                                             HdlOptions const &options) {
     Put(*stream, "module", " ", name, "(");
     ListSeparator separator(*stream, options.portOnePerLine, name.GetLength() + 8);
-    ForEach(signals, [&](Signal const *signal) {
+    ForEachAhead(signals, [&](Signal const *signal) {
         if (!IsDeclaredPort(*signal))
             return;
         separator.Next();
@@ -255,7 +256,7 @@ void VerilogNetlister::EndWithAttrs(HdlOptions const &options, WriteAttrs writeA
 
 void VerilogNetlister::WritePortDeclarations(Iterator<Signal *> const &signals,
                                              HdlOptions const &options) {
-    ForEach(signals, [&](Signal const *signal) {
+    ForEachAhead(signals, [&](Signal const *signal) {
         if (WritePortDeclaration(signal))
             EndWithAttrs(options, [&] { WriteSynthesisAttr(signal, options); });
     });
@@ -272,7 +273,7 @@ bool VerilogNetlister::WritePortDeclaration(Signal const *signal) {
 
 void VerilogNetlister::WriteSignalDeclarations(Iterator<Signal *> const &signals,
                                                HdlOptions const &options) {
-    ForEach(signals, [&](Signal const *signal) {
+    ForEachAhead(signals, [&](Signal const *signal) {
         if (WriteSignalDeclaration(signal))
             EndWithAttrs(options, [&] { WriteSynthesisAttr(signal, options); });
     });
@@ -289,14 +290,14 @@ bool VerilogNetlister::WriteSignalDeclaration(Signal const *signal) {
 
 /// Constants first, then what is assigned from another signal.
 void VerilogNetlister::WriteSignalAssignments(Iterator<Signal *> const &signals) {
-    ForEach(signals, [this](Signal const *signal) {
+    ForEachAhead(signals, [this](Signal const *signal) {
         if (!signal->HasConstantValue())
             return;
         statements->WriteConstantSignalAssignment(signal->GetNameRef(), IsOneDigit(*signal),
                                                   signal->GetConstantValue());
         Put(*stream, ";", EOL);
     });
-    ForEach(signals, [this](Signal const *target) {
+    ForEachAhead(signals, [this](Signal const *target) {
         ForEach(target->GetSignalIterator(), [this, target](Signal const *source) {
             statements->WriteSignalAssignment(target->GetNameRef(), source->GetNameRef());
             Put(*stream, ";", EOL);
@@ -306,7 +307,7 @@ void VerilogNetlister::WriteSignalAssignments(Iterator<Signal *> const &signals)
 
 void VerilogNetlister::WriteInstances(Iterator<Instance *> const &instances,
                                       HdlOptions const &options) {
-    ForEach(instances, [&](Instance const *instance) {
+    ForEachAhead(instances, [&](Instance const *instance) {
         if (!WriteInstance(instance, options))
             return;
         EndWithAttrs(options, [&] { WriteSynthesisAttr(instance, options); });

@@ -9,6 +9,7 @@
 #include "vesk_hdl/hdl/VhdlStatements.h"
 #include "vesk_hdl/model/HdlOptions.h"
 #include "vesk_hdl/netlist/Netlist.h"
+#include "vesk_hdl/text/ForEachAhead.h"
 #include "vesk_hdl/text/basis/Functions.h"
 
 using namespace Vesk_Hdl;
@@ -45,7 +46,7 @@ private:
 void FindTelling(Netlist const *netlist, PtrArray<Instance *> &telling) {
     std::unordered_set<Component const *> seen;
     Component const *last = nullptr;
-    ForEach(netlist->GetInstances(), [&](Instance *instance) {
+    ForEachAhead(netlist->GetInstances(), [&](Instance *instance) {
         Component const *const component = instance->GetComponent();
         bool const isFirst = component != last && seen.insert(component).second;
         last = component;
@@ -131,12 +132,12 @@ void VhdlNetlister::WriteEntity(Netlist const *netlist, HdlOptions const *option
     Iterator<Signal *> ports(&signals.ports);
     int const width = Netlist::GetLongestPortName(ports);
     PortClause clause(*stream);
-    ForEach(ports, [&](Signal const *port) {
+    ForEachAhead(ports, [&](Signal const *port) {
         clause.NextItem();
         statements->WritePortStatement(port->GetNameRef(), port->GetPortPolarity(), width);
     });
     clause.End();
-    ForEach(ports, [&](Signal const *port) {
+    ForEachAhead(ports, [&](Signal const *port) {
         if (!port->HasAttrs())
             return;
         statements->WriteAttrDeclaration(port, declaredAttrs, useAttrType, 0);
@@ -155,7 +156,8 @@ void VhdlNetlister::WriteArchitecture(Netlist const *netlist, HdlOptions const *
     WriteAttrDeclarations(signals.innerWithAttrs, telling, options);
     Iterator<Signal *> all(&netlist->GetSignals());
     int const width = Netlist::GetLongestSignalName(all);
-    ForEach(all, [&](Signal const *signal) { WriteSignalDeclaration(signal, options, width); });
+    ForEachAhead(all,
+                 [&](Signal const *signal) { WriteSignalDeclaration(signal, options, width); });
     if (!options->vhdlOption.suppressComponent)
         WriteComponents(telling, options);
     WriteSynthesisAttrAssignment(signals.innerWithAttrs, telling, options);
@@ -163,8 +165,8 @@ void VhdlNetlister::WriteArchitecture(Netlist const *netlist, HdlOptions const *
     Put(*stream, "begin", EOL);
     stream->Indent();
     WriteAssignments(signals.assigned);
-    ForEach(netlist->GetInstances(),
-            [&](Instance const *instance) { WriteInstance(instance, options); });
+    ForEachAhead(netlist->GetInstances(),
+                 [&](Instance const *instance) { WriteInstance(instance, options); });
     stream->Unindent();
     Put(*stream, "end", " BEHAVIORAL;", EOL);
 }
@@ -175,8 +177,8 @@ void VhdlNetlister::WriteAttrDeclarations(PtrArray<Signal *> const &signals,
                                           Instances const &telling, HdlOptions const *options) {
     bool const useAttrType = options->vhdlOption.useAttrType;
     auto const forEachHolder = [&](auto act) {
-        ForEach(signals, act);
-        ForEach(telling, [&act](Instance const *instance) {
+        ForEachAhead(signals, act);
+        ForEachAhead(telling, [&act](Instance const *instance) {
             act(instance->GetComponent());
             act(instance);
         });
@@ -204,7 +206,7 @@ void VhdlNetlister::WriteSignalDeclaration(Signal const *signal, HdlOptions cons
 /// Each component once, at its first instance.
 void VhdlNetlister::WriteComponents(Instances const &telling, HdlOptions const *options) {
     StringSet names;
-    ForEach(telling, [&](Instance const *instance) {
+    ForEachAhead(telling, [&](Instance const *instance) {
         Component const *const component = instance->GetComponent();
         if (!component || names.IContains(component->GetNameRef().View()))
             return;
@@ -240,23 +242,23 @@ void VhdlNetlister::WriteComponent(Component const *component, HdlOptions const 
 void VhdlNetlister::WriteSynthesisAttrAssignment(PtrArray<Signal *> const &signals,
                                                  Instances const &telling,
                                                  HdlOptions const *options) {
-    ForEach(signals, [&](Signal const *signal) {
+    ForEachAhead(signals, [&](Signal const *signal) {
         statements->WriteAttrAssignment(signal, BaseNameOf(*signal), "signal",
                                         options->vhdlOption.useAttrType);
     });
-    ForEach(telling,
-            [&](Instance const *instance) { WriteInstanceAttrAssignment(instance, options); });
+    ForEachAhead(telling,
+                 [&](Instance const *instance) { WriteInstanceAttrAssignment(instance, options); });
 }
 
 /// Constants first, then what is assigned from another signal.
 void VhdlNetlister::WriteAssignments(PtrArray<Signal *> const &signals) {
-    ForEach(signals, [&](Signal const *signal) {
+    ForEachAhead(signals, [&](Signal const *signal) {
         if (!signal->HasConstantValue())
             return;
         statements->WriteConstantSignalAssignment(signal->GetNameRef(), IsOneDigit(*signal),
                                                   signal->GetConstantValue());
     });
-    ForEach(signals, [&](Signal const *target) {
+    ForEachAhead(signals, [&](Signal const *target) {
         ForEach(target->GetSignalIterator(), [&](Signal const *source) {
             statements->WriteSignalAssignment(target->GetNameRef(), source->GetNameRef());
         });
@@ -267,7 +269,7 @@ void VhdlNetlister::WriteConfiguration(Netlist const *netlist) {
     Text const &name = netlist->GetNameRef();
     // One walk gives each component its instances, in order.
     std::unordered_map<Component const *, PtrArray<Instance *>> instances;
-    ForEach(netlist->GetInstances(), [&instances](Instance *instance) {
+    ForEachAhead(netlist->GetInstances(), [&instances](Instance *instance) {
         if (Component const *const component = instance->GetComponent())
             instances[component].Add(instance);
     });
@@ -299,7 +301,7 @@ void VhdlNetlister::WriteConfigurationItem(Component const *component,
         return;
     Put(*stream, "for", " ");
     char const *separator = "";
-    ForEach(instances, [&](Instance const *instance) {
+    ForEachAhead(instances, [&](Instance const *instance) {
         Put(*stream, separator, instance->GetNameRef());
         separator = ", ";
     });

@@ -4,6 +4,7 @@
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/NaturalOrder.h"
 #include "vesk_hdl/netlist/NetlistRecord.h"
+#include "vesk_hdl/text/ForEachAhead.h"
 
 namespace Vesk_Hdl {
 
@@ -154,7 +155,7 @@ void Netlist::GetInstances(Component const *component, PtrArray<Instance *> &fou
     found.Empty();
     if (!component)
         return;
-    ForEach(GetInstances(), [component, &found](Instance *instance) {
+    ForEachAhead(GetInstances(), [component, &found](Instance *instance) {
         if (instance->GetComponent() == component)
             found.Add(instance);
     });
@@ -170,7 +171,7 @@ void Netlist::SortNetlist() {
                   [](Signal const *signal) { return signal->GetPortPolarity(); });
     SortNaturally(record->components.GetForSort(), noPolarity);
     SortNaturally(record->instances.GetForSort(), noPolarity);
-    ForEach(GetInstances(), [](Instance *instance) { instance->SortPinName(); });
+    ForEachAhead(GetInstances(), [](Instance *instance) { instance->SortPinName(); });
 }
 
 int Netlist::GetLongestPinName(Iterator<Pin *> &pins) {
@@ -201,12 +202,12 @@ int Netlist::GetLongestAttrName(Netlist const *netlist) {
     int longest = 0;
     if (!netlist)
         return longest;
-    ForEach(netlist->GetSignals(), [&longest](Signal const *signal) {
+    ForEachAhead(netlist->GetSignals(), [&longest](Signal const *signal) {
         if (signal->GetPortPolarity() == Polarity::INVALID && signal->IsNeededToDeclared())
             GetLongestAttrName(signal, longest);
     });
     Component const *last = nullptr; // a look at the same one again tells nothing new
-    ForEach(netlist->GetInstances(), [&longest, &last](Instance const *instance) {
+    ForEachAhead(netlist->GetInstances(), [&longest, &last](Instance const *instance) {
         Component const *const component = instance->GetComponent();
         if (component != last)
             GetLongestAttrName(component, longest);

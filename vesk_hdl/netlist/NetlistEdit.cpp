@@ -8,6 +8,7 @@
 #include "vesk_hdl/netlist/BusRecord.h"
 #include "vesk_hdl/netlist/NetlistRecord.h"
 #include "vesk_hdl/netlist/SignalRecord.h"
+#include "vesk_hdl/text/ForEachAhead.h"
 
 namespace Vesk_Hdl {
 
@@ -90,9 +91,9 @@ BusSlice *NetlistEdit::RepointToSlice(Bus *bus, std::unique_ptr<BusSlice> made) 
     };
     replace(record.widenedSlices);
     replace(slice->cell->bus->record->busSlices);
-    ForEach(record.signals.Get(), replaceIn);
+    ForEachAhead(record.signals.Get(), replaceIn);
     ForEach(record.widenedSlices, replaceIn);
-    ForEach(record.instances.Get(), [bus, slice](Instance const *instance) {
+    ForEachAhead(record.instances.Get(), [bus, slice](Instance const *instance) {
         ForEach(instance->GetPinIterator(), [bus, slice](Pin *pin) {
             if (pin->GetSignal() == bus)
                 pin->Connect(slice);

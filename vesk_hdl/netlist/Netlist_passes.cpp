@@ -11,6 +11,7 @@
 #include "vesk_hdl/netlist/As.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/NetlistRecord.h"
+#include "vesk_hdl/text/ForEachAhead.h"
 #include "vesk_hdl/text/basis/Ascii.h"
 
 namespace Vesk_Hdl {
@@ -24,7 +25,7 @@ namespace {
 class ScalarMembers {
 public:
     explicit ScalarMembers(PtrArray<Signal *> const &signals) {
-        ForEach(signals, [this](Signal *signal) {
+        ForEachAhead(signals, [this](Signal *signal) {
             auto *const compound = As<CompoundBus>(signal);
             for (int i = 0; compound && i < compound->GetSize(); ++i)
                 if (As<ScalarSignal>(compound->GetAt(i)))
@@ -64,7 +65,7 @@ private:
 };
 
 void AddNames(PtrArray<Signal *> const &signals, StringSet &names) {
-    ForEach(signals, [&names](Signal const *signal) { signal->GetBaseName(names); });
+    ForEachAhead(signals, [&names](Signal const *signal) { signal->GetBaseName(names); });
 }
 
 /// The dummy of a slice or index of a bus, on the bus's own dummy; null for any other class.
@@ -108,7 +109,7 @@ void Netlist::CreateVerilogDummySignals() {
 /// Collects the names of the out ports that an instance reads, or of the in ports that one drives.
 void Netlist::GetFeedBackSignals(bool outPortToInPin, StringSet &names) {
     PtrArray<Pin *> pins;
-    ForEach(GetInstances(), [&pins, outPortToInPin](Instance const *instance) {
+    ForEachAhead(GetInstances(), [&pins, outPortToInPin](Instance const *instance) {
         if (outPortToInPin)
             instance->GetOutPortConnectedToInPin(pins);
         else
@@ -133,13 +134,13 @@ void Netlist::FindFeedBack(StringSet &read, PtrArray<Signal *> &driven) {
         else
             driven.Add(signal);
     };
-    ForEach(GetInstances(),
-            [&look](Instance const *instance) { ForEach(instance->GetPinIterator(), look); });
+    ForEachAhead(GetInstances(),
+                 [&look](Instance const *instance) { ForEach(instance->GetPinIterator(), look); });
 }
 
 /// Collects the out ports with several drivers.
 void Netlist::GetWiredOrOutputSignals(StringSet &names) {
-    ForEach(GetSignals(), [&names](Signal const *signal) {
+    ForEachAhead(GetSignals(), [&names](Signal const *signal) {
         if (signal->GetPortPolarity() == Polarity::OUTPUT && signal->HasMultiDriver())
             signal->GetBaseName(names);
     });
@@ -200,7 +201,7 @@ void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
 
 void Netlist::ConnectOpenPinToDummy() {
     PtrArray<Pin *> open;
-    ForEach(GetInstances(), [&](Instance const *instance) {
+    ForEachAhead(GetInstances(), [&](Instance const *instance) {
         open.Empty();
         instance->GetOpenPin(open, true);
         ForEach(open, [&](Pin *pin) {

@@ -154,12 +154,9 @@ private:
 
 /// Calls `act` with each element that is not null, in order. The array may grow meanwhile.
 template <class T, class Act> void ForEach(PtrArray<T> const &array, Act act) {
-    constexpr int AHEAD = 12; // far enough for the memory to bring an object of a large design
-    for (int i = 0; i < array.GetSize(); ++i) {
-        __builtin_prefetch(array.GetAt(i + AHEAD));
+    for (int i = 0; i < array.GetSize(); ++i)
         if (T const item = array.GetAt(i))
             act(item);
-    }
 }
 template <class T, class Act> void ForEach(Iterator<T> walk, Act act) {
     if (PtrArray<T> const *const array = walk.GetArray())

@@ -134,7 +134,7 @@ TEST(Widening, LeavesNoPointerThatAClientMade) {
                   tied.Connect(at(n, "b(3:0)"));
                   static_cast<ScalarPin &>(*n.GetInstance("u1")->GetPin("A")) = tied;
               },
-              "(A)"}}) {
+              "(u1.A)"}}) {
         SCOPED_TRACE(row.name);
         Design design(CellsAnd("sig b(3:0); sig t; sig x; s b(3:0)"));
         row.make(design.netlist);

@@ -91,11 +91,12 @@ TEST(Widening, LeavesNoPointerToTheFormerBus) {
 TEST(Widening, LeavesNoPointerThatAClientMade) {
     struct Row {
         char const *name;
-        void (*make)(Netlist &); ///< from or by what s is linked to
+        void (*make)(Netlist &);
         char const *wiring;
     };
-    auto const signal = [](Netlist &netlist, char const *name) { return netlist.GetSignal(name); };
-    static auto const at = signal;
+    static auto const at = [](Netlist &netlist, char const *name) {
+        return netlist.GetSignal(name);
+    };
     for (Row const &row : std::vector<Row>{
              {"a link", [](Netlist &n) { at(n, "t")->Connect(at(n, "b(3:0)")); }, "t <- b(3:0)"},
              {"a moved link", [](Netlist &n) { at(n, "t")->CloneConnection(at(n, "s")); },

@@ -1,5 +1,7 @@
 #include "vesk_hdl/netlist/Pin.h"
 
+#include <limits>
+
 #include <gtest/gtest.h>
 
 #include "tests/support/Lines.h"

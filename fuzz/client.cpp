@@ -1,12 +1,12 @@
-// What a client does with the exported classes and no line of the language can: strings, arrays,
-// sets, maps and expressions against plain models, and a design that is built, changed, taken apart
-// and written by hand.
+// Strings, arrays, sets, maps and expressions, which clients use without a line of the language,
+// against plain models.
 
 #include <algorithm>
 #include <map>
 #include <regex>
 #include <vector>
 
+#include "fuzz/Choices.h"
 #include "fuzz/Fuzz.h"
 #include "vesk_hdl/Vesk_Hdl.h"
 
@@ -14,32 +14,6 @@ using namespace Vesk_Hdl;
 using Text = Basis::StringBase<char>;
 
 namespace {
-
-/// The input as a row of choices; at its end all of them are 0.
-class Choices {
-public:
-    Choices(std::uint8_t const *data, std::size_t size) : at(data), end(data + size) {}
-    bool IsEmpty() const { return at == end; }
-    unsigned int Below(unsigned int bound) { return IsEmpty() ? 0 : *at++ % bound; }
-    std::string Text() {
-        std::string text;
-        for (unsigned int left = Below(8); left > 0; --left)
-            text += "aAbBz1290_ ,()[:]-.*+?\"\\\n\t\xe9"[Below(27)];
-        return text;
-    }
-    /// A name that others choose, too.
-    std::string Name() {
-        static char const *const NAMES[] = {"a", "A1",   "b(3:0)", "b[2]", "b(1:0)",  "c<0:7>",
-                                            "",  "open", "d,b(0)", "in",   "a_DUMMY", "b(7:0)"};
-        unsigned int const which = Below(15);
-        return which < std::size(NAMES) ? NAMES[which] : Text();
-    }
-    Polarity::Value Polar() { return static_cast<Polarity::Value>(static_cast<int>(Below(4)) - 1); }
-
-private:
-    std::uint8_t const *at;
-    std::uint8_t const *end;
-};
 
 std::string Upper(std::string text) {
     for (char &c : text)
@@ -230,294 +204,19 @@ void Collections(Choices &choices) {
     }
 }
 
-/// Asks each object of a design for all that it tells.
-class Questions : public ObjectVisitor,
-                  public SignalVisitor,
-                  public PinVisitor,
-                  public AttributeVisitor {
-public:
-    explicit Questions(Netlist &netlist) {
-        netlist.AcceptObject(*this);
-        Holder(netlist);
-        ForEach(netlist.GetComponentIterator(), [this](Component *component) { Ask(*component); });
-        ForEach(netlist.GetInstanceIterator(), [this](Instance *instance) {
-            Ask(*instance);
-            told += instance->GetComponentName();
-        });
-        ForEach(netlist.GetSignalIterator(), [this](Signal *signal) {
-            signal->AcceptObject(*this);
-            signal->AcceptSignal(*this);
-            Holder(*signal);
-            told += signal->GetDummySignalName();
-            told += std::to_string(signal->GetWidth()).c_str();
-        });
-    }
-
-    unsigned int GetLength() const { return told.GetLength(); }
-
-private:
-    template <class Holding> void Ask(Holding &holding) {
-        holding.AcceptObject(*this);
-        Holder(holding);
-        ForEach(holding.GetPinIterator(), [this](Pin *pin) {
-            pin->AcceptObject(*this);
-            pin->AcceptPin(*this);
-            Holder(*pin);
-            told += pin->GetPolarityName();
-        });
-    }
-    void Holder(AttributeHolder const &holder) {
-        if (holder.HasAttrs())
-            ForEach(holder.GetAttrIterator(), [this](Attribute *attribute) {
-                attribute->AcceptObject(*this);
-                attribute->AcceptAttribute(*this);
-                for (Text const &each : {attribute->GetGeneric(), attribute->GetSynAttr(),
-                                         attribute->GetValueTypeName(), attribute->GetComment()})
-                    told += each;
-            });
-    }
-    void VisitNetlist(Netlist *netlist) override { told += netlist->GetSourceFileName(); }
-    void VisitBus(Bus *bus) override { Bounds(*bus); }
-    void VisitBusSlice(BusSlice *slice) override { Bounds(*slice); }
-    void VisitBusIndex(BusIndex *index) override { told += index->GetBaseName(); }
-    void VisitBusPin(BusPin *pin) override { Bounds(*pin); }
-    void VisitBusIndexPin(BusIndexPin *pin) override { told += pin->GetIndex(); }
-    void VisitAttributeString(AttributeString *attribute) override {
-        told += attribute->GetValue();
-    }
-    void VisitAttributeBit(AttributeBit *attribute) override { told += attribute->GetValue(); }
-    void VisitAttributeUser(AttributeUser *attribute) override { told += attribute->GetValue(); }
-
-    template <class Ranged> void Bounds(Ranged &object) {
-        Text left;
-        Text right;
-        object.GetIndex(left, right);
-        told += object.IsDownTo() ? left : right;
-        told += object.GetBaseName();
-    }
-
-    Text told;
-};
-
-/// A design that no Model keeps in order. What the interface leaves to the client is done first:
-/// what points at an object that is removed is taken away, or the object stays.
-class Builder {
-public:
-    explicit Builder(Choices &bytes) : choices(bytes), netlist("top") {}
-
-    void Run() {
-        while (!choices.IsEmpty() && ++steps < 200)
-            Step();
-        TextMemOutStream vhdl("");
-        TextMemOutStream verilog("text");
-        verilog.SetValue("");
-        HdlOptions options;
-        options.writeHeader = choices.Below(2) == 0;
-        options.vhdlOption.useAttrType = choices.Below(2) == 0;
-        options.vhdlOption.openPin = choices.Below(2) == 0;
-        HdlOptions copied(options);
-        copied = options;
-        VhdlStatements(vhdl).WriteTimeStamp("f");
-        VerilogStatements(verilog).WriteTimeStamp("f");
-        int const longest = Netlist::GetLongestAttrName(&netlist);
-        FUZZ_EXPECT(longest >= 0, "%d", longest);
-        if (choices.Below(2))
-            netlist.CreateVerilogDummySignals();
-        unsigned int const told = Questions(netlist).GetLength();
-        FUZZ_EXPECT(told == Questions(netlist).GetLength(), "asking changes the answer");
-        VhdlNetlister first(vhdl);
-        VhdlNetlister(first).WriteNetlist(&netlist, &copied);
-        VerilogNetlister(verilog).WriteNetlist(&netlist, copied);
-        FUZZ_EXPECT(vhdl.GetValue().GetIndexOfString("entity top is", Text::COMPARE_EXACT) !=
-                        Basis::NOT_FOUND,
-                    "no entity");
-        FUZZ_EXPECT(verilog.GetValue().GetIndexOfString("endmodule", Text::COMPARE_EXACT) !=
-                        Basis::NOT_FOUND,
-                    "no module");
-    }
-
-private:
-    template <class T> T *Any(Iterator<T *> walk) {
-        std::vector<T *> all;
-        ForEach(walk, [&all](T *each) { all.push_back(each); });
-        return all.empty() ? nullptr : all[choices.Below(static_cast<unsigned int>(all.size()))];
-    }
-    Pin *AnyPin() {
-        Instance const *const instance = Any(netlist.GetInstanceIterator());
-        return instance ? Any(instance->GetPinIterator()) : nullptr;
-    }
-
-    void AddSignal() {
-        std::string const name = choices.Name();
-        Bus *const parent = netlist.GetParentBus(name.c_str());
-        switch (choices.Below(5)) {
-        case 0:
-            return netlist.Add(new Bus(name.c_str()));
-        case 1:
-            return netlist.Add(new BusSlice(name.c_str(), parent));
-        case 2:
-            return netlist.Add(new BusIndex(name.c_str(), parent));
-        case 3: {
-            auto *const compound = new CompoundBus(name.c_str());
-            for (unsigned int left = choices.Below(4); left > 0; --left)
-                compound->AddBusMember(Any(netlist.GetSignalIterator()));
-            return netlist.Add(compound);
-        }
-        default:
-            return netlist.Add(new ScalarSignal(name.c_str()));
-        }
-    }
-
-    void Change(AttributeHolder *holder) {
-        static char const *const TYPES[] = {"String", "integer",   "Float", "BOOLEAN",
-                                            "Bit",    "BitVector", "User",  "none"};
-        if (!holder)
-            return;
-        std::unique_ptr<Attribute> attr(AttributeFactory::GetInstance().CreateAttribute(
-            TYPES[choices.Below(std::size(TYPES))], choices.Name().c_str(),
-            choices.Text().c_str()));
-        if (!attr)
-            return;
-        static char const *const WORDS[] = {"SYN", "nosyn", "ASSIGN", "ASSIGNNODEC", "NONE", "x"};
-        attr->SetGeneric(WORDS[choices.Below(std::size(WORDS))]);
-        attr->SetSynAttr(WORDS[choices.Below(std::size(WORDS))]);
-        if (choices.Below(2))
-            attr->SetValue(choices.Text().c_str());
-        std::unique_ptr<Attribute> const copy(attr->CloneAttribute());
-        if (attr->GetValueType() != Attribute::VALUE_FLOAT) // a copy is told without its decimals
-            FUZZ_EXPECT(*copy == *attr, "%s", copy->GetName().GetText());
-        holder->AddAttr(attr.release());
-    }
-
-    void Remove(Component *component) {
-        PtrArray<Instance *> placed;
-        netlist.GetInstances(component->GetName(), placed);
-        netlist.GetInstances(component, placed);
-        if (placed.IsEmpty())
-            netlist.Remove(component);
-    }
-
-    void Remove(Instance *instance) {
-        FUZZ_EXPECT(instance->HasAttrs() || HdlUtilities::GetAttrNames(instance).IsEmpty(),
-                    "names of no attributes");
-        ForEach(instance->GetPinIterator(), [this](Pin *pin) {
-            ForEach(netlist.GetSignalIterator(), [pin](Signal *on) { on->Disconnect(pin); });
-        });
-        netlist.Remove(instance);
-    }
-
-    void Remove(Signal *signal) {
-        bool isFree = true;
-        ForEach(netlist.GetSignalIterator(), [&](Signal *other) {
-            other->Disconnect(signal);
-            if (auto *const bus = dynamic_cast<Bus *>(other))
-                bus->RemoveBusSlice(signal);
-            if (auto const *const compound = dynamic_cast<CompoundBus *>(other))
-                ForEach(compound->GetBusMemberIterator(),
-                        [&](Signal const *member) { isFree = isFree && member != signal; });
-        });
-        ForEach(netlist.GetInstanceIterator(), [&](Instance *instance) {
-            ForEach(instance->GetPinIterator(), [&](Pin *pin) {
-                if (pin->GetSignal() == signal)
-                    signal->Disconnect(pin);
-            });
-        });
-        if (isFree)
-            netlist.Remove(signal);
-    }
-
-    void Step() {
-        Component *const component = Any(netlist.GetComponentIterator());
-        Instance *const instance = Any(netlist.GetInstanceIterator());
-        Signal *const signal = Any(netlist.GetSignalIterator());
-        Pin *const pin = AnyPin();
-        switch (choices.Below(17)) {
-        case 0:
-            return netlist.Add(new Component(choices.Name().c_str()));
-        case 1:
-            if (component)
-                component->AddPin(choices.Name().c_str(), choices.Polar(), choices.Text().c_str());
-            return;
-        case 2:
-            return netlist.Add(new Instance(choices.Name().c_str(), component));
-        case 3:
-            return AddSignal();
-        case 4:
-            if (signal)
-                signal->SetPortPolarity(choices.Polar());
-            return;
-        case 5:
-            if (signal)
-                signal->Connect(pin);
-            return;
-        case 6:
-            if (signal)
-                signal->Disconnect(pin);
-            return;
-        case 7:
-            if (signal)
-                signal->Connect(Any(netlist.GetSignalIterator()));
-            return;
-        case 8:
-            if (signal)
-                signal->AssignConstantValue(choices.Text().c_str());
-            return;
-        case 9:
-            if (pin)
-                pin->SetName(choices.Name().c_str());
-            return;
-        case 10:
-            if (Pin *const other = AnyPin(); pin && other &&
-                                             other->GetPinType() == Pin::PIN_SCALAR &&
-                                             pin->GetPinType() == Pin::PIN_SCALAR)
-                static_cast<ScalarPin &>(*pin) = static_cast<ScalarPin const &>(*other);
-            return;
-        case 11:
-            return Change(choices.Below(2)   ? static_cast<AttributeHolder *>(signal)
-                          : choices.Below(2) ? static_cast<AttributeHolder *>(component)
-                                             : static_cast<AttributeHolder *>(instance));
-        case 12:
-            for (Object *const object : {static_cast<Object *>(signal), static_cast<Object *>(pin),
-                                         static_cast<Object *>(instance)})
-                if (object && choices.Below(2))
-                    object->AddComment(choices.Text().c_str());
-            return;
-        case 13:
-            return component ? Remove(component) : void();
-        case 14:
-            return instance ? Remove(instance) : void();
-        case 15:
-            return signal ? Remove(signal) : void();
-        default:
-            if (Signal *const other = Any(netlist.GetSignalIterator())) {
-                other->AssignConstantValue(signal->GetConstantValue());
-                static_cast<AttributeHolder &>(*other) = *signal;
-                static_cast<Object &>(*other) = *signal;
-            }
-        }
-    }
-
-    Choices &choices;
-    Netlist netlist;
-    int steps = 0;
-};
-
 } // namespace
 
 int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
     Choices choices(data, size);
-    switch (choices.Below(5)) {
+    switch (choices.Below(3)) {
     case 0:
         Strings(choices);
         break;
     case 1:
         Expressions(choices);
         break;
-    case 2:
-        Collections(choices);
-        break;
     default:
-        Builder(choices).Run();
+        Collections(choices);
     }
     return 0;
 }

@@ -87,4 +87,65 @@ TEST(Widening, LeavesNoPointerToTheFormerBus) {
     EXPECT_TRUE(design.model.ConnectSignals("a_long_name(7:0)", narrow->GetNameRef()));
 }
 
+/// The same where the client made the pointer, and the library was not asked.
+TEST(Widening, LeavesNoPointerThatAClientMade) {
+    struct Row {
+        char const *name;
+        void (*make)(Netlist &);
+        char const *wiring;
+    };
+    static auto const at = [](Netlist &netlist, char const *name) {
+        return netlist.GetSignal(name);
+    };
+    for (Row const &row : std::vector<Row>{
+             {"a link", [](Netlist &n) { at(n, "t")->Connect(at(n, "b(3:0)")); }, "t <- b(3:0)"},
+             {"a moved link", [](Netlist &n) { at(n, "t")->CloneConnection(at(n, "s")); },
+              "t <- b(3:0)"},
+             {"a link moved twice",
+              [](Netlist &n) {
+                  at(n, "x")->CloneConnection(at(n, "s"));
+                  at(n, "t")->CloneConnection(at(n, "x"));
+              },
+              "t <- b(3:0)"},
+             {"a moved link beside one to a signal that is gone",
+              [](Netlist &n) {
+                  at(n, "s")->Connect(at(n, "x"));
+                  at(n, "t")->CloneConnection(at(n, "s"));
+                  Signal *const gone = at(n, "x");
+                  n.Remove(gone);
+                  at(n, "s")->CloneConnection(at(n, "t"));
+                  at(n, "t")->CloneConnection(at(n, "s"));
+                  at(n, "t")->Disconnect(gone);
+              },
+              "t <- b(3:0)"},
+             {"a member",
+              [](Netlist &n) {
+                  auto *const compound = new CompoundBus("k,b(3:0)");
+                  n.Add(compound);
+                  compound->AddBusMember(at(n, "t"));
+                  compound->AddBusMember(at(n, "b(3:0)"));
+              },
+              "k,b(3:0) {t b(3:0)}"},
+             {"a pin",
+              [](Netlist &n) { n.GetInstance("u1")->GetPin("A")->Connect(at(n, "b(3:0)")); },
+              "(u1.A)"},
+             {"a copied pin",
+              [](Netlist &n) {
+                  ScalarPin tied("A", Polarity::INPUT);
+                  tied.Connect(at(n, "b(3:0)"));
+                  static_cast<ScalarPin &>(*n.GetInstance("u1")->GetPin("A")) = tied;
+              },
+              "(u1.A)"}}) {
+        SCOPED_TRACE(row.name);
+        Design design(CellsAnd("sig b(3:0); sig t; sig x; s b(3:0)"));
+        row.make(design.netlist);
+        EXPECT_TRUE(design.model.AssignConstantToSignal("b(7:0)", "1"));
+        EXPECT_NE(Wiring(design.netlist).find(row.wiring), std::string::npos)
+            << Wiring(design.netlist);
+        TextMemOutStream text("");
+        VhdlNetlister(text).WriteNetlist(&design.netlist, design.model.GetOptions());
+        EXPECT_NE(text.GetValue().View().find("end CFG_"), std::string::npos);
+    }
+}
+
 } // namespace

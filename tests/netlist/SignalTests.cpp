@@ -110,6 +110,46 @@ TEST(Signal, ACommentMayBeItsName) {
     EXPECT_STREQ("a_name_that_takes_memory\n", signal.GetComment());
 }
 
+/// A walk leaves out a compound that it is in already.
+TEST(Signal, ACompoundMayBeInItself) {
+    Bits bits;
+    CompoundBus own("A,own"), outer("A,a"), inner("B,b");
+    for (Signal *const member : std::vector<Signal *>{&bits.scalar, &own})
+        own.AddBusMember(member);
+    for (Signal *const member : std::vector<Signal *>{&inner, &bits.lower})
+        outer.AddBusMember(member);
+    for (Signal *const member : std::vector<Signal *>{&outer, &bits.slice, &bits.scalar})
+        inner.AddBusMember(member);
+    inner.SetAt(0, &bits.scalar);
+    inner.SetAt(2, &outer);
+    using Row = std::tuple<CompoundBus *, int, int, char const *>;
+    for (auto const &[compound, size, width, dummy] :
+         {Row{&own, 2, 1, "A_DUMMY"}, Row{&outer, 2, 6, "A_DUMMY,D_DUMMY(3:0),a_DUMMY"},
+          Row{&inner, 3, 6, "A_DUMMY,D_DUMMY(3:0),a_DUMMY"}}) {
+        SCOPED_TRACE(compound->GetName());
+        EXPECT_EQ(size, compound->GetSize());
+        EXPECT_EQ(width, compound->GetWidth());
+        EXPECT_STREQ(dummy, compound->GetDummySignalName());
+        bits.scalar.SetPortPolarity(Polarity());
+        compound->SetPortPolarity(Polarity::OUTPUT);
+        EXPECT_EQ(Polarity::OUTPUT, bits.scalar.GetPortPolarity().GetValue());
+        EXPECT_EQ(Polarity::OUTPUT, compound->GetPortPolarity().GetValue());
+        EXPECT_FALSE(compound->IsPort());
+    }
+    own.SetAt(0, &own);
+    EXPECT_TRUE(own.GetWidth() == 0 && own.GetPortPolarity() == Polarity::INVALID);
+
+    Design design(CellsAnd("a,b u1.B(3:0)"));
+    auto *const written = static_cast<CompoundBus *>(design.model.GetSignal("a,b"));
+    written->AddBusMember(written);
+    TextMemOutStream vhdl(""), verilog("");
+    VhdlNetlister(vhdl).WriteNetlist(&design.netlist, design.model.GetOptions());
+    VerilogNetlister(verilog).WriteNetlist(&design.netlist, *design.model.GetOptions());
+    EXPECT_NE(vhdl.GetValue().View().find("B(2)=>b"), std::string::npos) << vhdl.GetValue();
+    EXPECT_NE(verilog.GetValue().View().find(".B({a, b})"), std::string::npos)
+        << verilog.GetValue();
+}
+
 TEST(Signal, DisconnectAndMove) {
     Design design(CellsAnd("a u1.A; a u2.A; a c; c u1.A; b u3.A; b a"));
     Signal &a = *design.model.GetSignal("a");

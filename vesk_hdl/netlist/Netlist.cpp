@@ -29,9 +29,11 @@ template <class T> void File(ObjectArray<T> &array, NameTable<T> &map, T *object
     held.release();
 }
 
-template <class T> void Unfile(ObjectArray<T> &array, NameTable<T> &map, T *object) {
-    array.Remove(object);
+/// False if the object is not in the array.
+template <class T> bool Unfile(ObjectArray<T> &array, NameTable<T> &map, T *object) {
+    bool const wasThere = array.Remove(object);
     map.Remove(object->GetNameRef(), object);
+    return wasThere;
 }
 
 /// The longest name of the signals that pass a test, a bus counted by its base name.
@@ -103,7 +105,8 @@ void Netlist::Add(Component *component) {
 void Netlist::Remove(Signal *signal) {
     if (!signal)
         return;
-    Unfile(record->signals, record->signalMap, signal);
+    if (!Unfile(record->signals, record->signalMap, signal))
+        record->widenedSlices.Remove(signal); // which a client found in its bus
     signal->DisconnectAll();
     if (auto const *const bus = As<Bus>(signal))
         record->busMap.Remove(bus->GetBaseName(), signal);

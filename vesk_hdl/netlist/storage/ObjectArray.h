@@ -33,21 +33,23 @@ public:
         objects.RemoveTail();
     }
 
-    /// Takes an object out, without deleting it.
-    void Remove(T *object) {
-        if (objects.GetTail() == object)
-            return RemoveTail();
+    /// Takes an object out, without deleting it; false if it is not here.
+    bool Remove(T *object) {
+        if (objects.GetTail() == object) {
+            RemoveTail();
+            return true;
+        }
         if (isWatched.load(std::memory_order_relaxed)) {
             places.reset();
-            objects.Remove(object);
-            return;
+            return objects.Remove(object);
         }
         int const place = Find(object);
         if (place < 0)
-            return;
+            return false;
         objects.SetAt(place, nullptr);
         if (holes.fetch_add(1, std::memory_order_relaxed) + 1 > MIN_HOLES + objects.GetSize() / 2)
             Close();
+        return true;
     }
 
     /// The array without holes, for a walk that ends before the next removal.

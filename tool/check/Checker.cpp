@@ -33,10 +33,10 @@ std::optional<Diagnostic> Checker::RunLine(std::string const &line, Place const 
     return diagnostic;
 }
 
-std::vector<Diagnostic> Checker::Finish() {
+void Checker::Finish(std::function<void(Diagnostic &)> const &show) {
     if (changed)
         CheckDesign(RequestedOr(written != NO_LANGUAGE ? written : BOTH));
-    return findings.Take(places);
+    findings.Show(places, show);
 }
 
 /// A line that writes: its arguments are read and what it would write is checked.

@@ -1,5 +1,6 @@
 // Attributes: whether what they need is declared, and whether their values make whole strings.
 
+#include <cmath>
 #include <unordered_map>
 
 #include "tool/check/Attributes.h"
@@ -37,13 +38,19 @@ public:
     explicit AttributeChecker(Design const &checked)
         : design(checked), useAttrType(checked.options.vhdlOption.useAttrType) {
         ForEachAttribute(design, [this](AttributeUse const &use) {
-            if (!use.generic && use.attribute->IsSynDeclared())
+            if (use.generic)
+                return;
+            if (use.attribute->IsSynDeclared())
                 (IsPort(use) ? declaredByPorts : declared)
                     .try_emplace(Lowercase(use.attribute->GetNameRef().View()), use.attribute);
+            else
+                hasUndeclaredOfPorts |= IsPort(use);
         });
     }
 
     void Run() {
+        if (hasUndeclaredOfPorts)
+            OrderPorts();
         ForEachAttribute(design, [this](AttributeUse const &use) {
             if (!use.generic)
                 CheckDeclared(use);
@@ -73,6 +80,42 @@ private:
                              std::move(detail)});
     }
 
+    /// The entity declares and assigns the attributes of one port after the other. The places of
+    /// the ports are only of use to attributes that other ports have to declare.
+    void OrderPorts() {
+        // A netlist sorts these copies like the ports themselves.
+        Netlist sorted("");
+        std::unordered_map<Signal const *, Object const *> portOfCopy;
+        design.ForEachSignal([&](Signal const *signal) {
+            if (!signal->IsPort() || !signal->HasAttrs())
+                return;
+            auto *const copy = new ScalarSignal(signal->GetNameRef());
+            copy->SetPortPolarity(signal->GetPortPolarity());
+            sorted.Add(copy);
+            portOfCopy[copy] = signal;
+        });
+        sorted.SortNetlist();
+        ForEach(sorted.GetSignalIterator(), [&](Signal const *copy) {
+            placeOfPort.try_emplace(portOfCopy[copy], placeOfPort.size());
+        });
+        ForEachAttribute(design, [&](AttributeUse const &use) {
+            if (use.generic || !IsPort(use) || !use.attribute->IsSynDeclared())
+                return;
+            std::size_t const place = placeOfPort[use.owner];
+            std::string const name = Lowercase(use.attribute->GetNameRef().View());
+            std::size_t &first = firstPlace.try_emplace(name, place).first->second;
+            first = std::min(first, place);
+        });
+    }
+
+    /// Whether the attribute of a port comes before its declaration by another one.
+    bool ComesTooEarly(AttributeUse const &use, std::string const &name) const {
+        if (!IsPort(use) || use.attribute->IsSynDeclared())
+            return false;
+        auto const first = firstPlace.find(name);
+        return first != firstPlace.end() && placeOfPort.at(use.owner) < first->second;
+    }
+
     /// The packages of the user may declare what nobody here does.
     void CheckDeclared(AttributeUse const &use) {
         std::string const name = Lowercase(use.attribute->GetNameRef().View());
@@ -86,12 +129,18 @@ private:
         if (declaration && useAttrType && VhdlTypeOf(*declaration) != VhdlTypeOf(*use.attribute))
             Add(Id::ATTRIBUTE_TYPE, use, VHDL,
                 VhdlTypeOf(*use.attribute) + " for " + VhdlTypeOf(*declaration));
-        if (!declaration && !IsLeftOut(use) && design.options.vhdlOption.useLibraries.IsEmpty())
-            Add(Id::UNDECLARED_ATTRIBUTE, use, VHDL);
+        bool const tooEarly = ComesTooEarly(use, name);
+        if ((!declaration || tooEarly) && !IsLeftOut(use) &&
+            design.options.vhdlOption.useLibraries.IsEmpty())
+            Add(Id::UNDECLARED_ATTRIBUTE, use, VHDL,
+                tooEarly ? "the port that declares it comes later in the entity" : "");
     }
 
     void CheckGeneric(AttributeUse const &use) {
         auto const *const instance = static_cast<Instance const *>(use.owner);
+        if (use.attribute->GetNameRef() == "INIT" && instance->GetComponent() &&
+            TakesInitOfMacro(design, *instance->GetComponent()))
+            return; // is not written
         Attribute const *const generic = instance->GetComponentAttr(use.attribute->GetNameRef());
         bool const isKnown = generic && (generic->IsGenericSyn() || generic->IsGenericNoSyn());
         if (!isKnown && !design.options.vhdlOption.suppressComponent)
@@ -115,23 +164,31 @@ private:
             Add(Id::ATTRIBUTE_WITHOUT_TYPE, use, VHDL);
     }
 
-    /// A vector of bits may have any text for a value.
+    /// The languages that refuse the value of a vector of bits, or take it for another one.
+    static Languages RefuseBits(BitVectorValue const &value) {
+        Digits const digits(value);
+        std::string const &text = digits.GetText();
+        bool const isOther =
+            value.HasBaseAndLength()
+                ? value.GetLength() < 1 ||
+                      digits.GetLeastWidth() > static_cast<std::size_t>(value.GetLength())
+                : std::min(text.find_first_not_of('0'), text.size()) + 1 < text.size();
+        return digits.RefusedIn("") | (isOther ? VERILOG : NO_LANGUAGE);
+    }
+
+    /// A vector of bits may have any text for a value, and a number may have none.
     void CheckLiteral(AttributeUse const &use) {
         bool const inVhdl = (use.generic || useAttrType) && !IsLeftOut(use);
         Languages const written =
             (inVhdl ? VHDL : NO_LANGUAGE) | (use.generic ? VERILOG : NO_LANGUAGE);
-        std::string const value(use.attribute->GetValueString().View());
         Languages bad = NO_LANGUAGE;
-        if (auto const *const bits = dynamic_cast<AttributeBitVector const *>(use.attribute)) {
-            BitVectorValue const vector = bits->GetBitVectorValue();
-            Digits const digits(vector);
-            bool const overflows =
-                vector.HasBaseAndLength() &&
-                digits.GetLeastWidth() > static_cast<std::size_t>(std::max(vector.GetLength(), 0));
-            bad = digits.RefusedIn("") | (overflows ? VERILOG : NO_LANGUAGE);
-        }
+        if (auto const *const bits = dynamic_cast<AttributeBitVector const *>(use.attribute))
+            bad = RefuseBits(bits->GetBitVectorValue());
+        else if (auto const *const number = dynamic_cast<AttributeFloat const *>(use.attribute))
+            bad = std::isfinite(number->GetValue()) ? NO_LANGUAGE : BOTH;
         if ((bad & written) != NO_LANGUAGE)
-            Add(Id::ATTRIBUTE_VALUE, use, bad & written, Quoted(value));
+            Add(Id::ATTRIBUTE_VALUE, use, bad & written,
+                Quoted(use.attribute->GetValueString().View()));
     }
 
     bool IsLeftOut(AttributeUse const &use) const {
@@ -185,9 +242,11 @@ private:
         return false;
     }
 
+    /// Readers differ in what a backslash makes of other characters than these two.
     static bool BreaksVerilog(std::string_view value) {
         for (std::size_t i = 0; i < value.size(); ++i)
-            if (value[i] == '"' || (value[i] == '\\' && ++i == value.size()))
+            if (value[i] == '"' || (value[i] == '\\' &&
+                                    (++i == value.size() || (value[i] != '\\' && value[i] != '"'))))
                 return true;
         return false;
     }
@@ -315,38 +374,13 @@ private:
     bool useAttrType;
     std::unordered_map<std::string, Attribute const *> declared; ///< by name, the first
     std::unordered_map<std::string, Attribute const *> declaredByPorts;
+    bool hasUndeclaredOfPorts = false;
+    std::unordered_map<Object const *, std::size_t> placeOfPort; ///< in the entity
+    std::unordered_map<std::string, std::size_t> firstPlace;     ///< that declares an attribute
 };
-
-/// In a macro the INIT of an instance is handed on, and one of option NOSYN is written as well.
-void CheckDefparams(Design const &design) {
-    std::string_view const name = design.netlist.GetNameRef().View();
-    auto const holds = [name](char const *mark) {
-        return name.find(mark) != std::string_view::npos;
-    };
-    auto const isInit = [](Attribute const &attribute) { return attribute.GetNameRef() == "INIT"; };
-    bool isMacro = false;
-    ForEachAttribute(design, [&](AttributeUse const &use) {
-        isMacro |= use.kind == AttributeUse::MODULE && isInit(*use.attribute) &&
-                   use.attribute->IsGenericSyn();
-    });
-    if (!isMacro || !(holds("MORVANE") || holds("HORVANE")))
-        return;
-    ForEachAttribute(design, [&](AttributeUse const &use) {
-        if (use.generic && use.kind == AttributeUse::INSTANCE && isInit(*use.attribute) &&
-            use.attribute->IsGenericNoSyn()) {
-            Spot const spot = design.MadeAt(use.attribute);
-            design.findings.Add(
-                {Id::DOUBLE_DEFPARAM, spot.line > 0 ? spot : design.MadeAt(use.owner),
-                 "attribute \"INIT\" of " + Quoted(use.owner->GetNameRef().View())});
-        }
-    });
-}
 
 } // namespace
 
-void CheckAttributes(Design const &design) {
-    AttributeChecker(design).Run();
-    CheckDefparams(design);
-}
+void CheckAttributes(Design const &design) { AttributeChecker(design).Run(); }
 
 } // namespace Checks

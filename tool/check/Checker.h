@@ -52,6 +52,7 @@ private:
     Languages written = NO_LANGUAGE;
     std::vector<std::string> lastWrites; ///< lines for which the design is not yet rewritten
     bool changed = false;                ///< since the last line that wrote
+    bool writesVhdl = false;             ///< one of those lines
 };
 
 } // namespace Checks

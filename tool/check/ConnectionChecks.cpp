@@ -103,6 +103,8 @@ private:
         Signal const *const declared = DeclaredOf(design, member);
         Design::Dummy const *const own = design.DummyOf(declared);
         if (dummy) {
+            if (polarity == Polarity::BIDIRECTIONAL)
+                Add(Id::INOUT_IN_COMPOUND, member, BOTH);
             // The members are treated like the first one, unless they had a dummy before.
             if (own && polarity == (own->portTakesDummy ? Polarity::INPUT : Polarity::OUTPUT))
                 Add(Id::IN_PORT_IN_COMPOUND, member, BOTH);

@@ -39,6 +39,16 @@ Spot Design::AssignedAt(Signal const &signal) const {
     return spot.line > 0 ? spot : NetAt(signal);
 }
 
+std::vector<Spot> Design::TextsAt(void const *owner, int count) const {
+    std::vector<Spot> spots(static_cast<std::size_t>(count));
+    std::uint32_t before = Places::EVER;
+    for (auto spot = spots.rbegin(); spot != spots.rend(); ++spot) {
+        *spot = places.Find(Places::TEXT, owner, before);
+        before = spot->line;
+    }
+    return spots;
+}
+
 bool Design::IsWritten(Signal const &part) const {
     bool onPin = false;
     ForEachPinOn(part, [&onPin](Pin const *) { onPin = true; });
@@ -93,10 +103,15 @@ void Design::FindUses() {
             addTo(signal, {Use::DRIVES, nullptr, source});
         });
     });
-    // A pin that is tied to a constant is not in the list of its signal.
+    // A pin that was tied to a constant has a signal that does not list it.
+    std::unordered_set<Pin const *> listed;
+    ForEachSignal([&listed](Signal const *signal) {
+        if (signal->HasConstantValue())
+            ForEachPinOn(*signal, [&listed](Pin const *pin) { listed.insert(pin); });
+    });
     ForEachPin([&](Instance const &, Pin const &pin) {
         Signal const *const signal = pin.GetSignal();
-        if (signal && signal->HasConstantValue() && IsTieOfPin(*signal))
+        if (signal && signal->HasConstantValue() && listed.count(&pin) == 0)
             addTo(signal, UseOf(&pin));
     });
 }

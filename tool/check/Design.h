@@ -56,6 +56,10 @@ public:
     bool IsInside(Vesk_Hdl::Signal const &signal) const {
         return netlist.GetSignal(signal.GetNameRef()) == &signal;
     }
+    /// Where an option got its text; where a list of options or a comment got each of its texts,
+    /// which are `count`.
+    Spot TextAt(void const *option) const { return places.Find(Places::TEXT, option); }
+    std::vector<Spot> TextsAt(void const *owner, int count) const;
     /// Whether a bit or slice stands anywhere in the text.
     bool IsWritten(Vesk_Hdl::Signal const &part) const;
     /// The bus of a bit or slice, null if there is none.
@@ -118,10 +122,15 @@ private:
 
 // The groups of checks, in the order of the table.
 void CheckNames(Design const &design);
+/// `vhdlIsWritten`: lines that write VHDL come between the last change and the text to check.
+void CheckMadeNets(Design const &design, bool vhdlIsWritten);
 void CheckNets(Design const &design);
 void CheckPins(Design const &design);
 void CheckConnections(Design const &design);
 void CheckConstants(Design const &design);
 void CheckAttributes(Design const &design);
+void CheckMacro(Design const &design);
+void CheckLibraries(Design const &design);
+void CheckTexts(Design const &design);
 
 } // namespace Checks

@@ -25,10 +25,10 @@ struct Spot {
 /// Where a token stands, or its line as a whole if that is too far to the right for a spot.
 Spot SpotOf(LineTokens const &tokens, int token, std::uint32_t line);
 
-/// Who was made, connected or given a constant where.
+/// Who was made, connected, or given a constant or a text where.
 class Places {
 public:
-    enum Event : std::uintptr_t { MADE = 0, CONNECTED = 1, CONSTANT = 2, ASSIGNED = 3 };
+    enum Event : std::uintptr_t { MADE = 0, CONNECTED = 1, CONSTANT = 2, ASSIGNED = 3, TEXT = 4 };
     static constexpr std::uint32_t EVER = UINT32_MAX;
 
     /// The lines to come are of this file; `shownName` is what the user called it.
@@ -47,6 +47,7 @@ public:
     void PutOpen(void const *net) { openNets.insert(net); }
     bool HasOpen() const { return !openNets.empty(); }
     bool IsOpen(void const *net) const { return !openNets.empty() && openNets.count(net) > 0; }
+    bool HasOpen() const { return !openNets.empty(); }
     /// When a line speaks of the net, it becomes one of that line's. Whether it was open.
     bool TakeOpen(void const *net) { return !openNets.empty() && openNets.erase(net) > 0; }
 

@@ -155,6 +155,7 @@ void Recorder::After(bool ran) {
     RecordAssignment();
     RecordDeclaration();
     RecordAttribute();
+    RecordText();
 }
 
 void Recorder::RecordNets() {
@@ -301,6 +302,34 @@ void Recorder::RecordAttribute() {
         return;
     if (Attribute const *const made = holder->GetAttr(Normal(tokens->At(attributeToken)).c_str()))
         places.Put(Places::MADE, made, SpotOf(attributeToken));
+}
+
+/// What the line gave a comment, or the option that it set or added to; null for other lines.
+void const *Recorder::OwnerOfText() const {
+    if (Contains(keyword, "COMMENT") || keyword == "ADD NOTES")
+        return dynamic_cast<Object const *>(HolderOf(firstArgument, keyword));
+    HdlOptions const &options = *model.GetOptions();
+    std::pair<char const *, void const *> const rows[] = {
+        {"ADD LIBRARY", &options.vhdlOption.libraries},
+        {"ADD USE LIBRARY", &options.vhdlOption.useLibraries},
+        {"ADD INCLUDE", &options.verilogOption.includes},
+        {"Set Application", &options.application},
+        {"Set Command", &options.commandStr},
+        {"Set Device", &options.device},
+        {"Set Purpose", &options.purpose},
+        {"Set Reference", &options.reference},
+    };
+    for (auto const &[command, option] : rows)
+        if (keyword == command)
+            return option;
+    return nullptr;
+}
+
+void Recorder::RecordText() {
+    if (void const *const owner = keyword == CONNECT ? nullptr : OwnerOfText())
+        places.Put(Places::TEXT, owner,
+                   SpotOf(firstArgument +
+                          (Contains(keyword, " COMMENT") && !Contains(keyword, "MODULE") ? 1 : 0)));
 }
 
 Origin Recorder::GetOrigin(Signal const *signal) const {

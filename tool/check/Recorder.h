@@ -68,6 +68,8 @@ private:
     void RecordAssignment();
     void RecordDeclaration();
     void RecordAttribute();
+    void RecordText();
+    void const *OwnerOfText() const;
 
     Vesk_Hdl::Model &model;
     Vesk_Hdl::Netlist &netlist;

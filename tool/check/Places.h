@@ -45,7 +45,6 @@ public:
 
     /// A net that a write gave to an open pin has no place, and no check looks at it.
     void PutOpen(void const *net) { openNets.insert(net); }
-    bool HasOpen() const { return !openNets.empty(); }
     bool IsOpen(void const *net) const { return !openNets.empty() && openNets.count(net) > 0; }
     bool HasOpen() const { return !openNets.empty(); }
     /// When a line speaks of the net, it becomes one of that line's. Whether it was open.

@@ -6,6 +6,7 @@
 #include "tool/check/Attributes.h"
 #include "tool/check/Digits.h"
 #include "tool/check/Fold.h"
+#include "tool/check/SeededHash.h"
 
 using namespace Vesk_Hdl;
 
@@ -251,12 +252,14 @@ private:
         return false;
     }
 
-    static Languages FoldsInVhdl(AttributeUse const &use, Text const &value) {
+    Languages FoldsInVhdl(AttributeUse const &use, Text const &value) {
         std::string_view const name = use.attribute->GetNameRef().View();
         if (!use.generic)
             return FoldsInAttribute(use, value.View());
         bool const isMap = use.kind == AttributeUse::INSTANCE;
-        Position const position(use);
+        if (clause.owner != use.owner)
+            clause = Clause(*use.owner); // the attributes of an owner come one after the other
+        Position const position(clause, use.attribute);
         Fold fold(use.kind == AttributeUse::COMPONENT ? 2 : 1);
         // A clause begins with its word, later items with blanks in place of it.
         if (position.isFirst)
@@ -275,26 +278,37 @@ private:
         return fold.IsBroken() ? VHDL : NO_LANGUAGE;
     }
 
+    /// The first and the last generic of each option in the clause of an owner.
+    struct Clause {
+        Object const *owner = nullptr;
+        Attribute const *first[2] = {}; ///< of option SYN, of option NOSYN
+        Attribute const *last[2] = {};
+
+        Clause() = default;
+        explicit Clause(Object const &clauseOwner) : owner(&clauseOwner) {
+            ForEach(dynamic_cast<AttributeHolder const &>(clauseOwner).GetAttrIterator(),
+                    [this](Attribute const *generic) {
+                        if (!generic->IsGenericSyn() && !generic->IsGenericNoSyn())
+                            return;
+                        int const option = generic->IsGenericSyn() ? 0 : 1;
+                        last[option] = generic;
+                        if (!first[option])
+                            first[option] = generic;
+                    });
+        }
+    };
+
     /// Where a generic stands in its clause, which lists those of option SYN first.
     struct Position {
-        bool isFirst = true;
-        bool isLastOfKind = true;
-        bool isMixed = false;
+        bool isFirst;
+        bool isLastOfKind;
+        bool isMixed;
 
-        explicit Position(AttributeUse const &use) {
-            bool const isSyn = use.attribute->IsGenericSyn();
-            bool before = true;
-            ForEach(dynamic_cast<AttributeHolder const &>(*use.owner).GetAttrIterator(),
-                    [&](Attribute const *other) {
-                        bool const otherIsSyn = other->IsGenericSyn();
-                        if (other == use.attribute) {
-                            before = false;
-                        } else if (otherIsSyn || other->IsGenericNoSyn()) {
-                            isMixed |= otherIsSyn != isSyn;
-                            isFirst &= otherIsSyn == isSyn ? !before : isSyn;
-                            isLastOfKind &= otherIsSyn != isSyn || before;
-                        }
-                    });
+        Position(Clause const &clause, Attribute const *generic) {
+            int const option = generic->IsGenericSyn() ? 0 : 1;
+            isMixed = clause.first[0] && clause.first[1];
+            isFirst = generic == clause.first[option] && (option == 0 || !clause.first[0]);
+            isLastOfKind = generic == clause.last[option];
         }
     };
 
@@ -330,22 +344,38 @@ private:
         return broken ? VERILOG : NO_LANGUAGE;
     }
 
+    /// The generics of a component that a Verilog line of an instance may break.
+    std::vector<AttributeUse> FindInheritable(Component const &component) {
+        std::vector<AttributeUse> found;
+        ForEach(component.GetAttrIterator(), [&](Attribute const *attribute) {
+            AttributeUse const use{attribute, AttributeUse::COMPONENT, &component, true};
+            if ((attribute->IsGenericSyn() || attribute->IsGenericNoSyn()) &&
+                (QuotedIn(use) & VERILOG) != NO_LANGUAGE &&
+                ValueInVerilog(*attribute).View().find(' ') != std::string_view::npos)
+                found.push_back(use);
+        });
+        return found;
+    }
+
     /// A component's generic stands in a Verilog line of each instance that has none of its own.
+    /// One that breaks is told once.
     void CheckInheritedFolds() {
-        design.ForEachInstance([this](Instance const *instance) {
+        std::unordered_map<Component const *, std::vector<AttributeUse>> inheritable;
+        design.ForEachInstance([&](Instance const *instance) {
             Component const *const component = instance->GetComponent();
             if (!component || !component->HasAttrs())
                 return;
-            ForEach(component->GetAttrIterator(), [&](Attribute const *attribute) {
-                AttributeUse const use{attribute, AttributeUse::COMPONENT, component, true};
-                Text const value = ValueInVerilog(*attribute);
-                if ((attribute->IsGenericSyn() || attribute->IsGenericNoSyn()) &&
-                    (QuotedIn(use) & VERILOG) != NO_LANGUAGE &&
-                    value.View().find(' ') != std::string_view::npos &&
-                    !instance->GetAttr(attribute->GetNameRef()) &&
-                    FoldsAsDefparam(*instance, use, value))
-                    Add(Id::FOLDED_VALUE, use, VERILOG,
-                        "at the instance " + Quoted(instance->GetNameRef().View()));
+            auto const [known, isNew] = inheritable.try_emplace(component);
+            std::vector<AttributeUse> &uses = known->second;
+            if (isNew)
+                uses = FindInheritable(*component);
+            std::erase_if(uses, [&](AttributeUse const &use) {
+                if (instance->GetAttr(use.attribute->GetNameRef()) ||
+                    !FoldsAsDefparam(*instance, use, ValueInVerilog(*use.attribute)))
+                    return false;
+                Add(Id::FOLDED_VALUE, use, VERILOG,
+                    "at the instance " + Quoted(instance->GetNameRef().View()));
+                return true;
             });
         });
     }
@@ -372,11 +402,13 @@ private:
 
     Design const &design;
     bool useAttrType;
-    std::unordered_map<std::string, Attribute const *> declared; ///< by name, the first
-    std::unordered_map<std::string, Attribute const *> declaredByPorts;
+    Clause clause; ///< of the generic that was looked at last
+    std::unordered_map<std::string, Attribute const *, SeededHash> declared; ///< by name, the first
+    std::unordered_map<std::string, Attribute const *, SeededHash> declaredByPorts;
     bool hasUndeclaredOfPorts = false;
     std::unordered_map<Object const *, std::size_t> placeOfPort; ///< in the entity
-    std::unordered_map<std::string, std::size_t> firstPlace;     ///< that declares an attribute
+    std::unordered_map<std::string, std::size_t, SeededHash>
+        firstPlace; ///< that declares an attribute
 };
 
 } // namespace

@@ -1,7 +1,7 @@
 #pragma once
 
+#include <span>
 #include <unordered_map>
-#include <unordered_set>
 #include <vector>
 
 #include "tool/check/Findings.h"
@@ -68,7 +68,7 @@ public:
     Dummy const *DummyOf(Vesk_Hdl::Signal const *signal) const;
     /// The uses of a signal that are not in its list of pins: through compounds, assignments and
     /// ties to constants.
-    std::vector<Use> const &FurtherUses(Vesk_Hdl::Signal const *signal) const;
+    std::span<Use const> FurtherUses(Vesk_Hdl::Signal const *signal) const;
     static Use UseOf(Vesk_Hdl::Pin const *pin);
 
     /// All but the nets that a write gave to open pins, of which no line says anything.
@@ -111,13 +111,22 @@ public:
     std::unordered_map<Vesk_Hdl::Signal const *, Dummy> dummies;
 
 private:
-    void FindUses();
-    void FindDummies();
+    /// What one walk over all pins finds.
+    struct PinUses {
+        std::vector<Vesk_Hdl::Signal const *> driven; ///< in ports that a pin drives
+        /// Pins that were tied to a constant: their signals do not list them.
+        std::vector<std::pair<Vesk_Hdl::Signal const *, Use>> ties;
+    };
+
+    PinUses WalkPins();
+    void FindDummies(PinUses const &pins);
+    void FindUses(PinUses const &pins);
     void DemandDummy(Vesk_Hdl::Signal const *signal, int stage);
     void NeedDummy(Vesk_Hdl::Signal const *signal, Dummy const &dummy);
 
-    std::unordered_map<Vesk_Hdl::Signal const *, std::vector<Use>> furtherUses;
-    mutable std::unordered_map<Vesk_Hdl::Pin const *, Vesk_Hdl::Instance const *> owners;
+    std::vector<Vesk_Hdl::Signal const *> usedSignals; ///< sorted, and beside it the uses
+    std::vector<Use> furtherUses;
+    mutable std::vector<std::pair<Vesk_Hdl::Pin const *, Vesk_Hdl::Instance const *>> owners;
 };
 
 // The groups of checks, in the order of the table.

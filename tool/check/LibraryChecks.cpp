@@ -4,6 +4,7 @@
 
 #include "tool/check/Attributes.h"
 #include "tool/check/Identifiers.h"
+#include "tool/check/SeededHash.h"
 
 using namespace Vesk_Hdl;
 
@@ -11,7 +12,7 @@ namespace Checks {
 
 namespace {
 
-using Names = std::unordered_set<std::string>;
+using Names = std::unordered_set<std::string, SeededHash>;
 
 Names const STANDARD_TYPES = {
     "boolean", "bit",        "character",      "severity_level",  "integer",

@@ -4,6 +4,7 @@
 #include <unordered_map>
 
 #include "tool/check/Attributes.h"
+#include "tool/check/SeededHash.h"
 
 using namespace Vesk_Hdl;
 
@@ -137,8 +138,8 @@ private:
     bool opens;        ///< a VHDL write opens pins
     bool opensForBoth; ///< it comes before the text that is checked
     bool attributesAreKnown = false;
-    std::unordered_map<std::string, Attribute const *> attributes;
-    std::unordered_map<std::string, OpenedPin> pins; ///< by their nets
+    std::unordered_map<std::string, Attribute const *, SeededHash> attributes;
+    std::unordered_map<std::string, OpenedPin, SeededHash> pins; ///< by their nets
 };
 
 } // namespace

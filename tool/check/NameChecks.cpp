@@ -1,9 +1,11 @@
 // Names: whether the languages take them, and whether two of them meet.
 
+#include <unordered_map>
 #include <unordered_set>
 
 #include "tool/check/Attributes.h"
 #include "tool/check/Identifiers.h"
+#include "tool/check/SeededHash.h"
 
 using namespace Vesk_Hdl;
 
@@ -244,9 +246,9 @@ private:
 
     Design const &design;
     bool isConfigured = false; ///< some component
-    std::unordered_set<std::string> pinTypes;
-    std::unordered_set<std::string> innerTypes; ///< of the architecture
-    std::unordered_set<std::string> outerTypes; ///< of the entity
+    std::unordered_set<std::string, SeededHash> pinTypes;
+    std::unordered_set<std::string, SeededHash> innerTypes; ///< of the architecture
+    std::unordered_set<std::string, SeededHash> outerTypes; ///< of the entity
 };
 
 /// Names that meet although the library took both.
@@ -296,6 +298,8 @@ private:
     void CheckCase(Signal const &part, Bus const &bus) {
         VerilogOption::CaseType const nameCase = design.options.verilogOption.signalCase;
         bool const isInside = design.IsInside(part);
+        if ((isInside || nameCase == VerilogOption::CASE_DEFAULT) && BaseOf(bus) == BaseOf(part))
+            return;
         std::string const base = Cased(BaseOf(bus), nameCase);
         std::string const partBase =
             isInside ? Cased(BaseOf(part), nameCase) : std::string(BaseOf(part));
@@ -320,15 +324,24 @@ private:
                  Clash(design.netlist, *component));
     }
 
+    /// The last pin of that base name; null if there is none. The attributes of a component come
+    /// one after the other.
+    Pin const *FindPin(Component const &component, std::string const &name) {
+        if (pinsOf != &component) {
+            pinsOf = &component;
+            pins.clear();
+            ForEach(component.GetPinIterator(),
+                    [this](Pin const *pin) { pins[Lowercase(BaseOf(*pin))] = pin; });
+        }
+        auto const found = pins.find(Lowercase(name));
+        return found == pins.end() ? nullptr : found->second;
+    }
+
     void CheckAttribute(AttributeUse const &use) {
         std::string const name(use.attribute->GetNameRef().View());
         Object const *other = nullptr;
         if (use.generic && use.kind == AttributeUse::COMPONENT) {
-            ForEach(static_cast<Component const *>(use.owner)->GetPinIterator(),
-                    [&](Pin const *pin) {
-                        if (SameIgnoringCase(BaseOf(*pin), name))
-                            other = pin;
-                    });
+            other = FindPin(*static_cast<Component const *>(use.owner), name);
         } else if (!use.generic || use.kind == AttributeUse::MODULE) {
             other = design.netlist.GetSignal(name.c_str());
             if (!other)
@@ -352,6 +365,8 @@ private:
     }
 
     Design const &design;
+    Component const *pinsOf = nullptr;
+    std::unordered_map<std::string, Pin const *, SeededHash> pins; ///< by their base names
 };
 
 } // namespace

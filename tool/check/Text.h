@@ -95,7 +95,7 @@ inline bool SplitPin(std::string_view token, std::string &owner, std::string &pi
 
 inline std::string PinName(Vesk_Hdl::Object const &owner, Vesk_Hdl::Pin const &pin) {
     return "pin " +
-           Quoted(std::string(owner.GetNameRef().View()) + "." + pin.GetNameRef().GetText());
+           Quoted(Shortened(owner.GetNameRef().View()) + "." + Shortened(pin.GetNameRef().View()));
 }
 
 inline std::string NetName(Vesk_Hdl::Signal const &signal) {

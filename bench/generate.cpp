@@ -4,6 +4,7 @@
 
 #include <CLI/CLI.hpp>
 
+#include "bench/hostile_kinds.h"
 #include "bench/kinds.h"
 
 int main(int argc, char **argv) {
@@ -26,16 +27,19 @@ int main(int argc, char **argv) {
             .append("; N counts ")
             .append(kind.counts)
             .append("\n");
+    footer += "and the hostile kinds, which are written without a last line that writes";
     app.footer(footer);
     CLI11_PARSE(app, argc, argv);
 
-    Kind const *const kind = FindKind(kindName);
-    if (!kind) {
-        std::cerr << kindName << ": no such kind\n" << footer;
+    std::ios::sync_with_stdio(false);
+    if (Kind const *const kind = FindKind(kindName)) {
+        WriteDesign(std::cout, *kind, n, vhdlFile, verilogFile);
+    } else if (HostileKind const *const hostile = FindHostileKind(kindName)) {
+        WriteHostile(std::cout, *hostile, n);
+    } else {
+        std::cerr << kindName << ": no such kind\n" << footer << '\n';
         return 2;
     }
-    std::ios::sync_with_stdio(false);
-    WriteDesign(std::cout, *kind, n, vhdlFile, verilogFile);
     std::cout.flush();
     return std::cout ? 0 : 1;
 }

@@ -752,6 +752,13 @@ std::vector<HostileKind> const &GetHostileKinds() {
     return kinds;
 }
 
+HostileKind const *FindHostileKind(std::string_view name) {
+    std::vector<HostileKind> const &kinds = GetHostileKinds();
+    auto const found = std::find_if(kinds.begin(), kinds.end(),
+                                    [name](HostileKind const &kind) { return kind.name == name; });
+    return found == kinds.end() ? nullptr : &*found;
+}
+
 void WriteHostile(std::ostream &lines, HostileKind const &kind, long n) {
     for (Part const &part : kind.parts) {
         long const times = part.times == Part::ONCE ? 1 : part.times == Part::EACH ? n : n / 100;

@@ -27,5 +27,7 @@ struct HostileKind {
 
 /// Those that were thought up and those that follow from the grammar of each command.
 std::vector<HostileKind> const &GetHostileKinds();
+/// Null if there is none of that name.
+HostileKind const *FindHostileKind(std::string_view name);
 
 void WriteHostile(std::ostream &lines, HostileKind const &kind, long n);

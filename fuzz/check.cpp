@@ -50,11 +50,11 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
                     expected.c_str());
         capture.Take();
     }
-    for (Diagnostic const &finding : checker.Finish()) {
+    checker.Finish([&](Diagnostic const &finding) {
         FUZZ_EXPECT(finding.place.line <= lines.size(), "%lu", finding.place.line);
         unsigned const column = finding.place.column;
         FUZZ_EXPECT(column == 0 || column <= lines[finding.place.line - 1].size(), "%u", column);
-    }
+    });
     std::string const expected = TextsOf(run.GetModel());
     std::string const found = TextsOf(checker.GetModel());
     FUZZ_EXPECT(expected == found, "\n%s\nis not\n%s", found.c_str(), expected.c_str());

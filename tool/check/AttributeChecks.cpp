@@ -1,10 +1,12 @@
 // Attributes: whether what they need is declared, and whether their values make whole strings.
 
+#include <cmath>
 #include <unordered_map>
 
 #include "tool/check/Attributes.h"
 #include "tool/check/Digits.h"
 #include "tool/check/Fold.h"
+#include "tool/check/SeededHash.h"
 
 using namespace Vesk_Hdl;
 
@@ -37,13 +39,19 @@ public:
     explicit AttributeChecker(Design const &checked)
         : design(checked), useAttrType(checked.options.vhdlOption.useAttrType) {
         ForEachAttribute(design, [this](AttributeUse const &use) {
-            if (!use.generic && use.attribute->IsSynDeclared())
+            if (use.generic)
+                return;
+            if (use.attribute->IsSynDeclared())
                 (IsPort(use) ? declaredByPorts : declared)
                     .try_emplace(Lowercase(use.attribute->GetNameRef().View()), use.attribute);
+            else
+                hasUndeclaredOfPorts |= IsPort(use);
         });
     }
 
     void Run() {
+        if (hasUndeclaredOfPorts)
+            OrderPorts();
         ForEachAttribute(design, [this](AttributeUse const &use) {
             if (!use.generic)
                 CheckDeclared(use);
@@ -73,6 +81,42 @@ private:
                              std::move(detail)});
     }
 
+    /// The entity declares and assigns the attributes of one port after the other. The places of
+    /// the ports are only of use to attributes that other ports have to declare.
+    void OrderPorts() {
+        // A netlist sorts these copies like the ports themselves.
+        Netlist sorted("");
+        std::unordered_map<Signal const *, Object const *> portOfCopy;
+        design.ForEachSignal([&](Signal const *signal) {
+            if (!signal->IsPort() || !signal->HasAttrs())
+                return;
+            auto *const copy = new ScalarSignal(signal->GetNameRef());
+            copy->SetPortPolarity(signal->GetPortPolarity());
+            sorted.Add(copy);
+            portOfCopy[copy] = signal;
+        });
+        sorted.SortNetlist();
+        ForEach(sorted.GetSignalIterator(), [&](Signal const *copy) {
+            placeOfPort.try_emplace(portOfCopy[copy], placeOfPort.size());
+        });
+        ForEachAttribute(design, [&](AttributeUse const &use) {
+            if (use.generic || !IsPort(use) || !use.attribute->IsSynDeclared())
+                return;
+            std::size_t const place = placeOfPort[use.owner];
+            std::string const name = Lowercase(use.attribute->GetNameRef().View());
+            std::size_t &first = firstPlace.try_emplace(name, place).first->second;
+            first = std::min(first, place);
+        });
+    }
+
+    /// Whether the attribute of a port comes before its declaration by another one.
+    bool ComesTooEarly(AttributeUse const &use, std::string const &name) const {
+        if (!IsPort(use) || use.attribute->IsSynDeclared())
+            return false;
+        auto const first = firstPlace.find(name);
+        return first != firstPlace.end() && placeOfPort.at(use.owner) < first->second;
+    }
+
     /// The packages of the user may declare what nobody here does.
     void CheckDeclared(AttributeUse const &use) {
         std::string const name = Lowercase(use.attribute->GetNameRef().View());
@@ -86,12 +130,18 @@ private:
         if (declaration && useAttrType && VhdlTypeOf(*declaration) != VhdlTypeOf(*use.attribute))
             Add(Id::ATTRIBUTE_TYPE, use, VHDL,
                 VhdlTypeOf(*use.attribute) + " for " + VhdlTypeOf(*declaration));
-        if (!declaration && !IsLeftOut(use) && design.options.vhdlOption.useLibraries.IsEmpty())
-            Add(Id::UNDECLARED_ATTRIBUTE, use, VHDL);
+        bool const tooEarly = ComesTooEarly(use, name);
+        if ((!declaration || tooEarly) && !IsLeftOut(use) &&
+            design.options.vhdlOption.useLibraries.IsEmpty())
+            Add(Id::UNDECLARED_ATTRIBUTE, use, VHDL,
+                tooEarly ? "the port that declares it comes later in the entity" : "");
     }
 
     void CheckGeneric(AttributeUse const &use) {
         auto const *const instance = static_cast<Instance const *>(use.owner);
+        if (use.attribute->GetNameRef() == "INIT" && instance->GetComponent() &&
+            TakesInitOfMacro(design, *instance->GetComponent()))
+            return; // is not written
         Attribute const *const generic = instance->GetComponentAttr(use.attribute->GetNameRef());
         bool const isKnown = generic && (generic->IsGenericSyn() || generic->IsGenericNoSyn());
         if (!isKnown && !design.options.vhdlOption.suppressComponent)
@@ -115,23 +165,31 @@ private:
             Add(Id::ATTRIBUTE_WITHOUT_TYPE, use, VHDL);
     }
 
-    /// A vector of bits may have any text for a value.
+    /// The languages that refuse the value of a vector of bits, or take it for another one.
+    static Languages RefuseBits(BitVectorValue const &value) {
+        Digits const digits(value);
+        std::string const &text = digits.GetText();
+        bool const isOther =
+            value.HasBaseAndLength()
+                ? value.GetLength() < 1 ||
+                      digits.GetLeastWidth() > static_cast<std::size_t>(value.GetLength())
+                : std::min(text.find_first_not_of('0'), text.size()) + 1 < text.size();
+        return digits.RefusedIn("") | (isOther ? VERILOG : NO_LANGUAGE);
+    }
+
+    /// A vector of bits may have any text for a value, and a number may have none.
     void CheckLiteral(AttributeUse const &use) {
         bool const inVhdl = (use.generic || useAttrType) && !IsLeftOut(use);
         Languages const written =
             (inVhdl ? VHDL : NO_LANGUAGE) | (use.generic ? VERILOG : NO_LANGUAGE);
-        std::string const value(use.attribute->GetValueString().View());
         Languages bad = NO_LANGUAGE;
-        if (auto const *const bits = dynamic_cast<AttributeBitVector const *>(use.attribute)) {
-            BitVectorValue const vector = bits->GetBitVectorValue();
-            Digits const digits(vector);
-            bool const overflows =
-                vector.HasBaseAndLength() &&
-                digits.GetLeastWidth() > static_cast<std::size_t>(std::max(vector.GetLength(), 0));
-            bad = digits.RefusedIn("") | (overflows ? VERILOG : NO_LANGUAGE);
-        }
+        if (auto const *const bits = dynamic_cast<AttributeBitVector const *>(use.attribute))
+            bad = RefuseBits(bits->GetBitVectorValue());
+        else if (auto const *const number = dynamic_cast<AttributeFloat const *>(use.attribute))
+            bad = std::isfinite(number->GetValue()) ? NO_LANGUAGE : BOTH;
         if ((bad & written) != NO_LANGUAGE)
-            Add(Id::ATTRIBUTE_VALUE, use, bad & written, Quoted(value));
+            Add(Id::ATTRIBUTE_VALUE, use, bad & written,
+                Quoted(use.attribute->GetValueString().View()));
     }
 
     bool IsLeftOut(AttributeUse const &use) const {
@@ -185,19 +243,23 @@ private:
         return false;
     }
 
+    /// Readers differ in what a backslash makes of other characters than these two.
     static bool BreaksVerilog(std::string_view value) {
         for (std::size_t i = 0; i < value.size(); ++i)
-            if (value[i] == '"' || (value[i] == '\\' && ++i == value.size()))
+            if (value[i] == '"' || (value[i] == '\\' &&
+                                    (++i == value.size() || (value[i] != '\\' && value[i] != '"'))))
                 return true;
         return false;
     }
 
-    static Languages FoldsInVhdl(AttributeUse const &use, Text const &value) {
+    Languages FoldsInVhdl(AttributeUse const &use, Text const &value) {
         std::string_view const name = use.attribute->GetNameRef().View();
         if (!use.generic)
             return FoldsInAttribute(use, value.View());
         bool const isMap = use.kind == AttributeUse::INSTANCE;
-        Position const position(use);
+        if (clause.owner != use.owner)
+            clause = Clause(*use.owner); // the attributes of an owner come one after the other
+        Position const position(clause, use.attribute);
         Fold fold(use.kind == AttributeUse::COMPONENT ? 2 : 1);
         // A clause begins with its word, later items with blanks in place of it.
         if (position.isFirst)
@@ -216,26 +278,37 @@ private:
         return fold.IsBroken() ? VHDL : NO_LANGUAGE;
     }
 
+    /// The first and the last generic of each option in the clause of an owner.
+    struct Clause {
+        Object const *owner = nullptr;
+        Attribute const *first[2] = {}; ///< of option SYN, of option NOSYN
+        Attribute const *last[2] = {};
+
+        Clause() = default;
+        explicit Clause(Object const &clauseOwner) : owner(&clauseOwner) {
+            ForEach(dynamic_cast<AttributeHolder const &>(clauseOwner).GetAttrIterator(),
+                    [this](Attribute const *generic) {
+                        if (!generic->IsGenericSyn() && !generic->IsGenericNoSyn())
+                            return;
+                        int const option = generic->IsGenericSyn() ? 0 : 1;
+                        last[option] = generic;
+                        if (!first[option])
+                            first[option] = generic;
+                    });
+        }
+    };
+
     /// Where a generic stands in its clause, which lists those of option SYN first.
     struct Position {
-        bool isFirst = true;
-        bool isLastOfKind = true;
-        bool isMixed = false;
+        bool isFirst;
+        bool isLastOfKind;
+        bool isMixed;
 
-        explicit Position(AttributeUse const &use) {
-            bool const isSyn = use.attribute->IsGenericSyn();
-            bool before = true;
-            ForEach(dynamic_cast<AttributeHolder const &>(*use.owner).GetAttrIterator(),
-                    [&](Attribute const *other) {
-                        bool const otherIsSyn = other->IsGenericSyn();
-                        if (other == use.attribute) {
-                            before = false;
-                        } else if (otherIsSyn || other->IsGenericNoSyn()) {
-                            isMixed |= otherIsSyn != isSyn;
-                            isFirst &= otherIsSyn == isSyn ? !before : isSyn;
-                            isLastOfKind &= otherIsSyn != isSyn || before;
-                        }
-                    });
+        Position(Clause const &clause, Attribute const *generic) {
+            int const option = generic->IsGenericSyn() ? 0 : 1;
+            isMixed = clause.first[0] && clause.first[1];
+            isFirst = generic == clause.first[option] && (option == 0 || !clause.first[0]);
+            isLastOfKind = generic == clause.last[option];
         }
     };
 
@@ -271,22 +344,38 @@ private:
         return broken ? VERILOG : NO_LANGUAGE;
     }
 
+    /// The generics of a component that a Verilog line of an instance may break.
+    std::vector<AttributeUse> FindInheritable(Component const &component) {
+        std::vector<AttributeUse> found;
+        ForEach(component.GetAttrIterator(), [&](Attribute const *attribute) {
+            AttributeUse const use{attribute, AttributeUse::COMPONENT, &component, true};
+            if ((attribute->IsGenericSyn() || attribute->IsGenericNoSyn()) &&
+                (QuotedIn(use) & VERILOG) != NO_LANGUAGE &&
+                ValueInVerilog(*attribute).View().find(' ') != std::string_view::npos)
+                found.push_back(use);
+        });
+        return found;
+    }
+
     /// A component's generic stands in a Verilog line of each instance that has none of its own.
+    /// One that breaks is told once.
     void CheckInheritedFolds() {
-        design.ForEachInstance([this](Instance const *instance) {
+        std::unordered_map<Component const *, std::vector<AttributeUse>> inheritable;
+        design.ForEachInstance([&](Instance const *instance) {
             Component const *const component = instance->GetComponent();
             if (!component || !component->HasAttrs())
                 return;
-            ForEach(component->GetAttrIterator(), [&](Attribute const *attribute) {
-                AttributeUse const use{attribute, AttributeUse::COMPONENT, component, true};
-                Text const value = ValueInVerilog(*attribute);
-                if ((attribute->IsGenericSyn() || attribute->IsGenericNoSyn()) &&
-                    (QuotedIn(use) & VERILOG) != NO_LANGUAGE &&
-                    value.View().find(' ') != std::string_view::npos &&
-                    !instance->GetAttr(attribute->GetNameRef()) &&
-                    FoldsAsDefparam(*instance, use, value))
-                    Add(Id::FOLDED_VALUE, use, VERILOG,
-                        "at the instance " + Quoted(instance->GetNameRef().View()));
+            auto const [known, isNew] = inheritable.try_emplace(component);
+            std::vector<AttributeUse> &uses = known->second;
+            if (isNew)
+                uses = FindInheritable(*component);
+            std::erase_if(uses, [&](AttributeUse const &use) {
+                if (instance->GetAttr(use.attribute->GetNameRef()) ||
+                    !FoldsAsDefparam(*instance, use, ValueInVerilog(*use.attribute)))
+                    return false;
+                Add(Id::FOLDED_VALUE, use, VERILOG,
+                    "at the instance " + Quoted(instance->GetNameRef().View()));
+                return true;
             });
         });
     }
@@ -313,40 +402,17 @@ private:
 
     Design const &design;
     bool useAttrType;
-    std::unordered_map<std::string, Attribute const *> declared; ///< by name, the first
-    std::unordered_map<std::string, Attribute const *> declaredByPorts;
+    Clause clause; ///< of the generic that was looked at last
+    std::unordered_map<std::string, Attribute const *, SeededHash> declared; ///< by name, the first
+    std::unordered_map<std::string, Attribute const *, SeededHash> declaredByPorts;
+    bool hasUndeclaredOfPorts = false;
+    std::unordered_map<Object const *, std::size_t> placeOfPort; ///< in the entity
+    std::unordered_map<std::string, std::size_t, SeededHash>
+        firstPlace; ///< that declares an attribute
 };
-
-/// In a macro the INIT of an instance is handed on, and one of option NOSYN is written as well.
-void CheckDefparams(Design const &design) {
-    std::string_view const name = design.netlist.GetNameRef().View();
-    auto const holds = [name](char const *mark) {
-        return name.find(mark) != std::string_view::npos;
-    };
-    auto const isInit = [](Attribute const &attribute) { return attribute.GetNameRef() == "INIT"; };
-    bool isMacro = false;
-    ForEachAttribute(design, [&](AttributeUse const &use) {
-        isMacro |= use.kind == AttributeUse::MODULE && isInit(*use.attribute) &&
-                   use.attribute->IsGenericSyn();
-    });
-    if (!isMacro || !(holds("MORVANE") || holds("HORVANE")))
-        return;
-    ForEachAttribute(design, [&](AttributeUse const &use) {
-        if (use.generic && use.kind == AttributeUse::INSTANCE && isInit(*use.attribute) &&
-            use.attribute->IsGenericNoSyn()) {
-            Spot const spot = design.MadeAt(use.attribute);
-            design.findings.Add(
-                {Id::DOUBLE_DEFPARAM, spot.line > 0 ? spot : design.MadeAt(use.owner),
-                 "attribute \"INIT\" of " + Quoted(use.owner->GetNameRef().View())});
-        }
-    });
-}
 
 } // namespace
 
-void CheckAttributes(Design const &design) {
-    AttributeChecker(design).Run();
-    CheckDefparams(design);
-}
+void CheckAttributes(Design const &design) { AttributeChecker(design).Run(); }
 
 } // namespace Checks

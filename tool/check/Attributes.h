@@ -20,8 +20,20 @@ struct AttributeUse {
 /// How VHDL calls the type of an attribute.
 std::string VhdlTypeOf(Vesk_Hdl::Attribute const &attribute);
 
+/// The attribute BOX_TYPE that a VHDL write gives to each cell of the vendor's library; null if the
+/// component is none or has one.
+Vesk_Hdl::Attribute const *ComingBoxTypeOf(Vesk_Hdl::Component const &component);
+
+/// Whether the VHDL configuration takes the component, which has instances, from the library work.
+bool IsConfigured(Design const &design, Vesk_Hdl::Component const &component);
+
+/// Whether VHDL hands the generic INIT of the design on to each instance of the component, in place
+/// of the instance's own.
+bool TakesInitOfMacro(Design const &design, Vesk_Hdl::Component const &component);
+
 /// Calls `act` with each use that is written: those of the module's generics, of components with
-/// instances, of instances, and of nets that are declared.
+/// instances, of instances, and of nets that are declared. Attributes that a write adds are among
+/// them.
 template <class Act> void ForEachAttribute(Design const &design, Act act) {
     using namespace Vesk_Hdl;
     auto const ofHolder = [&act](AttributeHolder const &holder, Object const &owner,
@@ -39,6 +51,8 @@ template <class Act> void ForEachAttribute(Design const &design, Act act) {
     ofHolder(design.netlist, design.netlist, AttributeUse::MODULE);
     design.ForEachUsedComponent([&](Component const *component) {
         ofHolder(*component, *component, AttributeUse::COMPONENT);
+        if (Attribute const *const boxType = ComingBoxTypeOf(*component))
+            act(AttributeUse{boxType, AttributeUse::COMPONENT, component, false});
     });
     design.ForEachInstance(
         [&](Instance const *instance) { ofHolder(*instance, *instance, AttributeUse::INSTANCE); });

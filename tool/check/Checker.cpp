@@ -33,10 +33,10 @@ std::optional<Diagnostic> Checker::RunLine(std::string const &line, Place const 
     return diagnostic;
 }
 
-std::vector<Diagnostic> Checker::Finish() {
+void Checker::Finish(std::function<void(Diagnostic &)> const &show) {
     if (changed)
         CheckDesign(RequestedOr(written != NO_LANGUAGE ? written : BOTH));
-    return findings.Take(places);
+    findings.Show(places, show);
 }
 
 /// A line that writes: its arguments are read and what it would write is checked.
@@ -55,6 +55,7 @@ std::optional<Diagnostic> Checker::PassWrite(std::string const &line, Place cons
     CheckWriteLine(tokens, number);
     CheckDesign(RequestedOr(language));
     lastWrites.push_back(line);
+    writesVhdl |= language == VHDL;
     return std::nullopt;
 }
 
@@ -63,9 +64,11 @@ std::optional<Diagnostic> Checker::PassWrite(std::string const &line, Place cons
 void Checker::RewriteDesign() {
     for (std::string const &line : std::exchange(lastWrites, {}))
         Rewrite(session, DesignNow(), places, line);
+    writesVhdl = false;
 }
 
-/// The number of tokens alone tells which one names the file.
+/// The number of tokens alone tells which one names the file. Each line says whether there is a
+/// header.
 void Checker::CheckWriteLine(LineTokens const &tokens, std::uint32_t number) {
     constexpr int FIRST = 2;
     int const size = tokens.GetSize();
@@ -75,7 +78,10 @@ void Checker::CheckWriteLine(LineTokens const &tokens, std::uint32_t number) {
     };
     if (tokens.At(file).substr(0, 1) == "-")
         add(Id::WRITE_FILE_NAME, file);
+    bool &writeHeader = session.GetModel().GetOptions()->writeHeader;
+    writeHeader = true;
     for (int token = FIRST; token < size; ++token) {
+        writeHeader &= token >= file || !SameIgnoringCase(tokens.At(token), "-NOHEADER");
         auto const is = [&](char const *word) { return SameIgnoringCase(tokens.At(token), word); };
         bool const known = is("-APPEND") || is("-OVERWRITE") || is("-NOHEADER");
         if (token > file || (token < file && !known))
@@ -87,11 +93,15 @@ void Checker::CheckDesign(Languages languages) {
     findings.SetLanguages(languages);
     Design const design = DesignNow();
     CheckNames(design);
+    CheckMadeNets(design, writesVhdl);
     CheckNets(design);
     CheckPins(design);
     CheckConnections(design);
     CheckConstants(design);
     CheckAttributes(design);
+    CheckMacro(design);
+    CheckLibraries(design);
+    CheckTexts(design);
 }
 
 } // namespace Checks

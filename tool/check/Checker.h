@@ -1,5 +1,6 @@
 #pragma once
 
+#include <functional>
 #include <optional>
 #include <string>
 #include <vector>
@@ -25,8 +26,8 @@ public:
     /// Runs a line, but for one that writes: there, nothing is written. Tells what is wrong if it
     /// is refused.
     std::optional<Diagnostic> RunLine(std::string const &line, Place const &place);
-    /// Behind the last line: all that was found, in the order of the lines.
-    std::vector<Diagnostic> Finish();
+    /// Behind the last line: calls `show` with each finding, in the order of the lines.
+    void Finish(std::function<void(Diagnostic &)> const &show);
 
     Vesk_Hdl::Model &GetModel() { return session.GetModel(); }
 
@@ -51,6 +52,7 @@ private:
     Languages written = NO_LANGUAGE;
     std::vector<std::string> lastWrites; ///< lines for which the design is not yet rewritten
     bool changed = false;                ///< since the last line that wrote
+    bool writesVhdl = false;             ///< one of those lines
 };
 
 } // namespace Checks

@@ -2,6 +2,8 @@
 // write each out port that is read inside, each in port that is driven inside and each out port
 // with several drivers gives its pins to a dummy signal.
 
+#include <set>
+
 #include "tool/check/Design.h"
 
 using namespace Vesk_Hdl;
@@ -23,7 +25,7 @@ Signal const *DeclaredOf(Design const &design, Signal const &signal) {
 class AssignmentChecker {
 public:
     AssignmentChecker(Design const &checked, Signal const &assigned, Signal const &from)
-        : design(checked), target(assigned), source(from), spot(checked.AssignedAt(assigned)) {}
+        : design(checked), target(assigned), source(from) {}
 
     void Run() {
         bool compound = false;
@@ -52,7 +54,8 @@ public:
 
 private:
     void Add(Id id, Signal const &side, Languages languages = BOTH, std::string detail = {}) {
-        design.findings.Add({id, spot, NetName(side), {}, languages, std::move(detail)});
+        design.findings.Add(
+            {id, design.AssignedAt(target), NetName(side), {}, languages, std::move(detail)});
     }
 
     /// VHDL also tells one bit from a vector of one bit.
@@ -77,7 +80,6 @@ private:
     Design const &design;
     Signal const &target;
     Signal const &source;
-    Spot spot;
 };
 
 /// A compound on pins.
@@ -103,6 +105,8 @@ private:
         Signal const *const declared = DeclaredOf(design, member);
         Design::Dummy const *const own = design.DummyOf(declared);
         if (dummy) {
+            if (polarity == Polarity::BIDIRECTIONAL)
+                Add(Id::INOUT_IN_COMPOUND, member, BOTH);
             // The members are treated like the first one, unless they had a dummy before.
             if (own && polarity == (own->portTakesDummy ? Polarity::INPUT : Polarity::OUTPUT))
                 Add(Id::IN_PORT_IN_COMPOUND, member, BOTH);
@@ -120,7 +124,10 @@ private:
             Add(Id::BYPASSED_DUMMY, member, BOTH);
     }
 
+    /// Once for each check: the first member that it finds stands for the others.
     void Add(Id id, Signal const &member, Languages languages) {
+        if (!found.insert(id).second)
+            return;
         design.findings.Add(
             {id,
              design.NetAt(compound),
@@ -133,6 +140,7 @@ private:
     Design const &design;
     CompoundBus const &compound;
     Design::Dummy const *dummy;
+    std::set<Id> found;
     bool drives = false;
     bool reads = false;
 };

@@ -1,7 +1,5 @@
 // Constants of nets and pins, as they are going to be written.
 
-#include <unordered_map>
-
 #include "tool/check/Design.h"
 #include "tool/check/Digits.h"
 
@@ -88,37 +86,34 @@ private:
     Digits const digits;
 };
 
-/// Two pins whose INSTANCE_PIN is the same name.
-void CheckSharedConstants(Design const &design) {
-    std::unordered_map<Signal const *, Pin const *> pinOfTie;
-    design.ForEachPin([&](Instance const &instance, Pin const &pin) {
-        Signal const *const signal = pin.GetSignal();
-        if (!signal || !signal->HasConstantValue())
-            return;
-        std::string tie = std::string(instance.GetNameRef().View()) + "_";
-        tie += BaseOf(pin);
-        tie += "_CONST_SIGNAL";
-        if (!SameIgnoringCase(BaseOf(*signal), tie))
-            return;
-        auto const [former, isNew] = pinOfTie.try_emplace(signal, &pin);
-        if (!isNew)
+/// Two pins whose INSTANCE_PIN is the same name are tied to one signal.
+void CheckSharedConstant(Design const &design, Signal const &signal) {
+    Pin const *former = nullptr;
+    for (Use const &use : design.FurtherUses(&signal)) {
+        if (!use.pin || use.pin->GetSignal() != &signal)
+            continue;
+        Instance const *const instance = former ? design.OwnerOf(use.pin) : nullptr;
+        if (instance)
             design.findings.Add({Id::SHARED_CONSTANT,
-                                 design.ConnectedAt(instance, pin),
-                                 PinName(instance, pin),
-                                 {{former->second, "the other pin is here", Places::CONNECTED}},
+                                 design.ConnectedAt(*instance, *use.pin),
+                                 PinName(*instance, *use.pin),
+                                 {{former, "the other pin is here", Places::CONNECTED}},
                                  BOTH,
-                                 Quoted(signal->GetNameRef().View())});
-    });
+                                 Quoted(signal.GetNameRef().View())});
+        else
+            former = use.pin;
+    }
 }
 
 } // namespace
 
 void CheckConstants(Design const &design) {
     design.ForEachSignal([&](Signal const *signal) {
-        if (signal->HasConstantValue())
-            ConstantChecker(design, *signal).Run();
+        if (!signal->HasConstantValue())
+            return;
+        ConstantChecker(design, *signal).Run();
+        CheckSharedConstant(design, *signal);
     });
-    CheckSharedConstants(design);
 }
 
 } // namespace Checks

@@ -1,5 +1,9 @@
 #include "tool/check/Design.h"
 
+#include <algorithm>
+#include <functional>
+#include <unordered_set>
+
 using namespace Vesk_Hdl;
 
 namespace Checks {
@@ -8,12 +12,16 @@ Design::Design(Model &model, Places const &madePlaces, Recorder const &history,
                Findings &foundThings)
     : netlist(*model.GetNetlist()), options(*model.GetOptions()), places(madePlaces),
       recorder(history), findings(foundThings) {
-    ForEachInstance([this](Instance const *instance) {
-        if (instance->GetComponent())
-            firstInstances.try_emplace(instance->GetComponent(), instance);
+    Component const *last = nullptr;
+    ForEachInstance([&](Instance const *instance) {
+        Component const *const component = instance->GetComponent();
+        if (component && component != last)
+            firstInstances.try_emplace(component, instance);
+        last = component;
     });
-    FindDummies();
-    FindUses();
+    PinUses const pins = WalkPins();
+    FindDummies(pins);
+    FindUses(pins);
 }
 
 Spot Design::ConnectedAt(Instance const &instance, Pin const &pin) const {
@@ -39,6 +47,16 @@ Spot Design::AssignedAt(Signal const &signal) const {
     return spot.line > 0 ? spot : NetAt(signal);
 }
 
+std::vector<Spot> Design::TextsAt(void const *owner, int count) const {
+    std::vector<Spot> spots(static_cast<std::size_t>(count));
+    std::uint32_t before = Places::EVER;
+    for (auto spot = spots.rbegin(); spot != spots.rend(); ++spot) {
+        *spot = places.Find(Places::TEXT, owner, before);
+        before = spot->line;
+    }
+    return spots;
+}
+
 bool Design::IsWritten(Signal const &part) const {
     bool onPin = false;
     ForEachPinOn(part, [&onPin](Pin const *) { onPin = true; });
@@ -49,10 +67,18 @@ Bus *Design::BusOf(Signal const &part) const { return netlist.GetParentBus(part.
 
 /// A walk over all pins at the first question, which only findings ask.
 Instance const *Design::OwnerOf(Pin const *pin) const {
-    if (owners.empty())
-        ForEachPin([this](Instance const &instance, Pin const &own) { owners[&own] = &instance; });
-    auto const found = owners.find(pin);
-    return found == owners.end() ? nullptr : found->second;
+    using Owner = std::pair<Pin const *, Instance const *>;
+    auto const isLess = [](Owner const &left, Owner const &right) {
+        return std::less<>()(left.first, right.first);
+    };
+    if (owners.empty()) {
+        ForEachPin([this](Instance const &instance, Pin const &own) {
+            owners.emplace_back(&own, &instance);
+        });
+        std::sort(owners.begin(), owners.end(), isLess);
+    }
+    auto const found = std::lower_bound(owners.begin(), owners.end(), Owner{pin, nullptr}, isLess);
+    return found == owners.end() || found->first != pin ? nullptr : found->second;
 }
 
 Design::Dummy const *Design::DummyOf(Signal const *signal) const {
@@ -60,10 +86,11 @@ Design::Dummy const *Design::DummyOf(Signal const *signal) const {
     return found == dummies.end() ? nullptr : &found->second;
 }
 
-std::vector<Use> const &Design::FurtherUses(Signal const *signal) const {
-    static std::vector<Use> const none;
-    auto const found = furtherUses.find(signal);
-    return found == furtherUses.end() ? none : found->second;
+std::span<Use const> Design::FurtherUses(Signal const *signal) const {
+    auto const [first, last] =
+        std::equal_range(usedSignals.begin(), usedSignals.end(), signal, std::less<>());
+    return {furtherUses.data() + (first - usedSignals.begin()),
+            static_cast<std::size_t>(last - first)};
 }
 
 Use Design::UseOf(Pin const *pin) {
@@ -74,13 +101,51 @@ Use Design::UseOf(Pin const *pin) {
             pin, nullptr};
 }
 
-void Design::FindUses() {
-    auto const addTo = [this](Signal const *signal, Use const &use) {
+/// Out ports that are read get their dummies here: the first stage of the rewriting.
+Design::PinUses Design::WalkPins() {
+    PinUses found;
+    std::unordered_set<Pin const *> listed;
+    ForEachSignal([&listed](Signal const *signal) {
+        if (signal->HasConstantValue())
+            ForEachPinOn(*signal, [&listed](Pin const *pin) { listed.insert(pin); });
+    });
+    ForEachPin([&](Instance const &, Pin const &pin) {
+        Signal const *const signal = pin.GetSignal();
+        if (!signal)
+            return;
+        Polarity const port = signal->GetPortPolarity();
+        Polarity const polarity = pin.GetPolarity();
+        auto const is = [&polarity](Polarity::Value use) {
+            return polarity == use || polarity == Polarity::BIDIRECTIONAL;
+        };
+        if (port == Polarity::OUTPUT && is(Polarity::INPUT))
+            DemandDummy(signal, READ_STAGE);
+        else if (port == Polarity::INPUT && is(Polarity::OUTPUT))
+            found.driven.push_back(signal);
+        if (signal->HasConstantValue() && listed.count(&pin) == 0)
+            found.ties.emplace_back(signal, UseOf(&pin));
+    });
+    return found;
+}
+
+/// A name that one stage took is out of the later ones.
+void Design::FindDummies(PinUses const &pins) {
+    for (Signal const *const signal : pins.driven)
+        DemandDummy(signal, DRIVEN_STAGE);
+    ForEachSignal([this](Signal const *signal) {
+        if (signal->GetPortPolarity() == Polarity::OUTPUT && signal->HasMultiDriver())
+            DemandDummy(signal, WIRED_STAGE);
+    });
+}
+
+void Design::FindUses(PinUses const &pins) {
+    std::vector<std::pair<Signal const *, Use>> found;
+    auto const addTo = [&found](Signal const *signal, Use const &use) {
         auto const *const compound = dynamic_cast<CompoundBus const *>(signal);
         if (!compound)
-            furtherUses[signal].push_back(use);
+            found.emplace_back(signal, use);
         for (int i = 0; compound && i < compound->GetSize(); ++i)
-            furtherUses[compound->GetAt(i)].push_back(use);
+            found.emplace_back(compound->GetAt(i), use);
     };
     ForEachSignal([&](Signal const *signal) {
         if (signal->GetSignalType() == Signal::SIGNAL_COMPOUND_BUS) {
@@ -93,30 +158,17 @@ void Design::FindUses() {
             addTo(signal, {Use::DRIVES, nullptr, source});
         });
     });
-    // A pin that is tied to a constant is not in the list of its signal.
-    ForEachPin([&](Instance const &, Pin const &pin) {
-        Signal const *const signal = pin.GetSignal();
-        if (signal && signal->HasConstantValue() && IsTieOfPin(*signal))
-            addTo(signal, UseOf(&pin));
+    for (auto const &[signal, use] : pins.ties)
+        addTo(signal, use);
+    std::stable_sort(found.begin(), found.end(), [](auto const &left, auto const &right) {
+        return std::less<>()(left.first, right.first);
     });
-}
-
-/// A name that one stage took is out of the later ones.
-void Design::FindDummies() {
-    auto const feedBack = [this](int stage, Polarity::Value port, Polarity::Value use) {
-        ForEachPin([&](Instance const &, Pin const &pin) {
-            Polarity const polarity = pin.GetPolarity();
-            if (pin.GetSignal() && (polarity == use || polarity == Polarity::BIDIRECTIONAL) &&
-                pin.GetSignal()->GetPortPolarity() == port)
-                DemandDummy(pin.GetSignal(), stage);
-        });
-    };
-    feedBack(READ_STAGE, Polarity::OUTPUT, Polarity::INPUT);
-    feedBack(DRIVEN_STAGE, Polarity::INPUT, Polarity::OUTPUT);
-    ForEachSignal([this](Signal const *signal) {
-        if (signal->GetPortPolarity() == Polarity::OUTPUT && signal->HasMultiDriver())
-            DemandDummy(signal, WIRED_STAGE);
-    });
+    usedSignals.reserve(found.size());
+    furtherUses.reserve(found.size());
+    for (auto const &[signal, use] : found) {
+        usedSignals.push_back(signal);
+        furtherUses.push_back(use);
+    }
 }
 
 void Design::DemandDummy(Signal const *signal, int stage) {

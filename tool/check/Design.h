@@ -1,7 +1,7 @@
 #pragma once
 
+#include <span>
 #include <unordered_map>
-#include <unordered_set>
 #include <vector>
 
 #include "tool/check/Findings.h"
@@ -56,6 +56,10 @@ public:
     bool IsInside(Vesk_Hdl::Signal const &signal) const {
         return netlist.GetSignal(signal.GetNameRef()) == &signal;
     }
+    /// Where an option got its text; where a list of options or a comment got each of its texts,
+    /// which are `count`.
+    Spot TextAt(void const *option) const { return places.Find(Places::TEXT, option); }
+    std::vector<Spot> TextsAt(void const *owner, int count) const;
     /// Whether a bit or slice stands anywhere in the text.
     bool IsWritten(Vesk_Hdl::Signal const &part) const;
     /// The bus of a bit or slice, null if there is none.
@@ -64,7 +68,7 @@ public:
     Dummy const *DummyOf(Vesk_Hdl::Signal const *signal) const;
     /// The uses of a signal that are not in its list of pins: through compounds, assignments and
     /// ties to constants.
-    std::vector<Use> const &FurtherUses(Vesk_Hdl::Signal const *signal) const;
+    std::span<Use const> FurtherUses(Vesk_Hdl::Signal const *signal) const;
     static Use UseOf(Vesk_Hdl::Pin const *pin);
 
     /// All but the nets that a write gave to open pins, of which no line says anything.
@@ -107,21 +111,35 @@ public:
     std::unordered_map<Vesk_Hdl::Signal const *, Dummy> dummies;
 
 private:
-    void FindUses();
-    void FindDummies();
+    /// What one walk over all pins finds.
+    struct PinUses {
+        std::vector<Vesk_Hdl::Signal const *> driven; ///< in ports that a pin drives
+        /// Pins that were tied to a constant: their signals do not list them.
+        std::vector<std::pair<Vesk_Hdl::Signal const *, Use>> ties;
+    };
+
+    PinUses WalkPins();
+    void FindDummies(PinUses const &pins);
+    void FindUses(PinUses const &pins);
     void DemandDummy(Vesk_Hdl::Signal const *signal, int stage);
     void NeedDummy(Vesk_Hdl::Signal const *signal, Dummy const &dummy);
 
-    std::unordered_map<Vesk_Hdl::Signal const *, std::vector<Use>> furtherUses;
-    mutable std::unordered_map<Vesk_Hdl::Pin const *, Vesk_Hdl::Instance const *> owners;
+    std::vector<Vesk_Hdl::Signal const *> usedSignals; ///< sorted, and beside it the uses
+    std::vector<Use> furtherUses;
+    mutable std::vector<std::pair<Vesk_Hdl::Pin const *, Vesk_Hdl::Instance const *>> owners;
 };
 
 // The groups of checks, in the order of the table.
 void CheckNames(Design const &design);
+/// `vhdlIsWritten`: lines that write VHDL come between the last change and the text to check.
+void CheckMadeNets(Design const &design, bool vhdlIsWritten);
 void CheckNets(Design const &design);
 void CheckPins(Design const &design);
 void CheckConnections(Design const &design);
 void CheckConstants(Design const &design);
 void CheckAttributes(Design const &design);
+void CheckMacro(Design const &design);
+void CheckLibraries(Design const &design);
+void CheckTexts(Design const &design);
 
 } // namespace Checks

@@ -21,7 +21,7 @@ public:
     /// which may have `further` values, and Verilog as a decimal number.
     Languages RefusedIn(std::string_view further) const {
         if (!hasBase)
-            return (AreAll("01", further) ? NO_LANGUAGE : VHDL) |
+            return (text.empty() || AreAll("01", further) ? NO_LANGUAGE : VHDL) |
                    (AreAll("0123456789", "_") ? NO_LANGUAGE : VERILOG);
         std::string_view const known = base == 2   ? "01"
                                        : base == 8 ? "01234567"

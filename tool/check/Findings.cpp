@@ -1,7 +1,10 @@
 #include "tool/check/Findings.h"
 
 #include <algorithm>
+#include <numeric>
 
+#include "tool/check/SeededHash.h"
+#include "tool/diagnostics/Reporter.h"
 #include "tool/diagnostics/Words.h"
 
 namespace Checks {
@@ -29,34 +32,51 @@ Diagnostic DiagnosticOf(Finding const &finding, Places const &places) {
 
 } // namespace
 
+std::size_t Findings::Hash::operator()(std::uint32_t number) const {
+    Finding const &finding = (*findings)[number];
+    std::size_t const line = finding.spot.line;
+    return SeededHash()(Lowercase(finding.subject)) + 64 * line +
+           static_cast<std::size_t>(finding.id);
+}
+
+bool Findings::Equal::operator()(std::uint32_t left, std::uint32_t right) const {
+    Finding const &a = (*findings)[left];
+    Finding const &b = (*findings)[right];
+    return a.id == b.id && a.spot.line == b.spot.line && SameIgnoringCase(a.subject, b.subject);
+}
+
 void Findings::Add(Finding finding) {
     finding.languages &= Get(finding.id).languages;
     if ((finding.languages & languages) == 0 || !Wants(finding.id))
         return;
-    std::string const key = std::to_string(static_cast<int>(finding.id)) + ' ' +
-                            std::to_string(finding.spot.line) + ' ' + Lowercase(finding.subject);
-    auto const [known, isNew] = told.try_emplace(key, findings.size());
+    findings.push_back(std::move(finding));
+    auto const [same, isNew] = known.insert(static_cast<std::uint32_t>(findings.size() - 1));
     if (isNew)
-        findings.push_back(std::move(finding));
-    else
-        findings[known->second].languages |= finding.languages;
+        return;
+    findings[*same].languages |= findings.back().languages;
+    findings.pop_back();
 }
 
-std::vector<Diagnostic> Findings::Take(Places const &places) {
-    std::stable_sort(findings.begin(), findings.end(), [](Finding const &a, Finding const &b) {
-        return a.spot.line != b.spot.line ? a.spot.line < b.spot.line
-                                          : a.spot.column < b.spot.column;
+void Findings::Show(Places const &places, std::function<void(Diagnostic &)> const &show) {
+    known.clear();
+    std::vector<std::uint32_t> order(findings.size());
+    std::iota(order.begin(), order.end(), 0);
+    std::sort(order.begin(), order.end(), [this](std::uint32_t left, std::uint32_t right) {
+        Spot const &a = findings[left].spot;
+        Spot const &b = findings[right].spot;
+        return a.line != b.line       ? a.line < b.line
+               : a.column != b.column ? a.column < b.column
+                                      : left < right;
     });
-    std::vector<Diagnostic> diagnostics;
-    std::vector<Spot> spots;
-    for (Finding const &finding : findings) {
-        diagnostics.push_back(DiagnosticOf(finding, places));
-        spots.push_back(finding.spot);
+    Places::SourceReader sources(places);
+    for (std::uint32_t const number : order) {
+        Finding const &finding = findings[number];
+        Diagnostic diagnostic = DiagnosticOf(finding, places);
+        if (std::string const *const line = sources.Get(finding.spot.line))
+            SetSource(diagnostic, *line);
+        show(diagnostic);
     }
     findings.clear();
-    told.clear();
-    places.AddSources(diagnostics, spots);
-    return diagnostics;
 }
 
 } // namespace Checks

@@ -1,8 +1,9 @@
 #pragma once
 
+#include <functional>
 #include <set>
 #include <string>
-#include <unordered_map>
+#include <unordered_set>
 #include <vector>
 
 #include "tool/check/Checks.h"
@@ -20,6 +21,8 @@ struct Related {
     std::uint32_t before = Places::EVER;
 };
 
+/// What a check found. It holds places, never lines, and names as `Quoted` shortens them: a line as
+/// long as the file may have as many findings as it has names.
 struct Finding {
     Id id;
     Spot spot;
@@ -40,14 +43,25 @@ public:
     /// Whether a check is worth its work.
     bool Wants(Id id) const { return (Get(id).languages & languages) != 0 && off.count(id) == 0; }
     void Add(Finding finding);
-    /// What came in. Files are read again for the lines, hence no findings, no reading.
-    std::vector<Diagnostic> Take(Places const &places);
+    /// Calls `show` with each of what came in and forgets it. The lines are read again meanwhile;
+    /// without findings nothing is read.
+    void Show(Places const &places, std::function<void(Diagnostic &)> const &show);
 
 private:
+    /// Findings by their number. Two are the same if check, line and, in any case, subject are.
+    struct Hash {
+        std::vector<Finding> const *findings;
+        std::size_t operator()(std::uint32_t number) const;
+    };
+    struct Equal {
+        std::vector<Finding> const *findings;
+        bool operator()(std::uint32_t left, std::uint32_t right) const;
+    };
+
     std::set<Id> off;
     Languages languages = BOTH;
     std::vector<Finding> findings;
-    std::unordered_map<std::string, std::size_t> told; ///< where they stand in the findings
+    std::unordered_set<std::uint32_t, Hash, Equal> known{0, Hash{&findings}, Equal{&findings}};
 };
 
 } // namespace Checks

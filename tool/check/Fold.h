@@ -16,6 +16,7 @@ public:
         constexpr std::size_t MOST = 80;
         constexpr std::size_t DEEPER = 6;
         if (!isComment && length + piece.size() > MOST) {
+            folded = true;
             std::size_t const cut = hasBlank ? lastBlank + 1 : length;
             broken |= hasBlank && lastBlankIsQuoted;
             length = indentation + DEEPER + (length - cut);
@@ -36,6 +37,8 @@ public:
         length += piece.size();
         return *this;
     }
+    bool IsFolded() const { return folded; }
+    /// Whether it is folded within the quoted text.
     bool IsBroken() const { return broken; }
 
 private:
@@ -46,6 +49,7 @@ private:
     bool hasBlank = false;
     bool lastBlankIsQuoted = false;
     bool isComment = false;
+    bool folded = false;
     bool broken = false;
 };
 

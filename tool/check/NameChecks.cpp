@@ -1,9 +1,11 @@
 // Names: whether the languages take them, and whether two of them meet.
 
+#include <unordered_map>
 #include <unordered_set>
 
 #include "tool/check/Attributes.h"
-#include "tool/check/Design.h"
+#include "tool/check/Identifiers.h"
+#include "tool/check/SeededHash.h"
 
 using namespace Vesk_Hdl;
 
@@ -20,35 +22,14 @@ struct WrittenName {
     void const *object;
     VerilogOption::CaseType nameCase = VerilogOption::CASE_DEFAULT;
     Languages languages = BOTH;
-    std::string_view shown = {}; ///< where it differs from the name
-    std::string owner = {};      ///< with a point, of a pin
+    std::string_view shown = {};  ///< where it differs from the name
+    std::string owner = {};       ///< with a point, of a pin
+    bool inConfiguration = false; ///< visible in a configuration that takes components from work
 
     std::string Subject() const {
         return what + " " + Quoted(owner + std::string(shown.empty() ? name : shown));
     }
 };
-
-bool IsLetter(char c) { return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z'); }
-bool IsDigit(char c) { return c >= '0' && c <= '9'; }
-
-bool IsVhdlIdentifier(std::string_view name) {
-    if (name.size() > 2 && name.front() == '\\' && name.back() == '\\')
-        return name.substr(1, name.size() - 2).find('\\') == std::string_view::npos;
-    if (name.empty() || !IsLetter(name.front()) || name.back() == '_' ||
-        name.find("__") != std::string_view::npos)
-        return false;
-    return std::all_of(name.begin(), name.end(),
-                       [](char c) { return IsLetter(c) || IsDigit(c) || c == '_'; });
-}
-
-bool IsVerilogIdentifier(std::string_view name) {
-    if (name.size() > 2 && name.front() == '\\')
-        return name.find(' ') == name.size() - 1;
-    if (name.empty() || IsDigit(name.front()) || name.front() == '$')
-        return false;
-    return std::all_of(name.begin(), name.end(),
-                       [](char c) { return IsLetter(c) || IsDigit(c) || c == '_' || c == '$'; });
-}
 
 std::unordered_set<std::string_view> const VHDL_2008_WORDS = {
     "assume",   "assume_guarantee", "context",  "cover",   "default",  "fairness",
@@ -81,41 +62,45 @@ std::unordered_set<std::string_view> const SYSTEM_VERILOG_WORDS = {
 /// No reserved word of any version is longer, and a text of that size is put together quickly.
 constexpr std::size_t LONGEST_WORD = 20;
 
-std::string Cased(std::string_view name, VerilogOption::CaseType nameCase) {
-    Text text(name);
-    if (nameCase == VerilogOption::CASE_UPPER)
-        text.MakeUpper();
-    else if (nameCase == VerilogOption::CASE_LOWER)
-        text.MakeLower();
-    return text.GetText();
-}
-
 Languages Of(bool vhdl, bool verilog) {
     return (vhdl ? VHDL : NO_LANGUAGE) | (verilog ? VERILOG : NO_LANGUAGE);
 }
 
 class NameChecker {
 public:
-    explicit NameChecker(Design const &checked) : design(checked) { FindUsedTypes(); }
+    explicit NameChecker(Design const &checked) : design(checked) {
+        FindUsedTypes();
+        design.ForEachUsedComponent([this](Component const *component) {
+            isConfigured |= IsConfigured(design, *component);
+        });
+    }
 
     void Run() {
         VerilogOption const &verilog = design.options.verilogOption;
         Check({design.netlist.GetNameRef().View(), "design", &design.netlist});
         design.ForEachUsedComponent([&](Component const *component) {
-            Check({component->GetNameRef().View(), "component", component, verilog.componentCase});
+            WrittenName name{component->GetNameRef().View(), "component", component,
+                             verilog.componentCase};
+            name.inConfiguration = isConfigured;
+            Check(name);
             ForEach(component->GetPinIterator(),
                     [&](Pin const *pin) { CheckPin(*component, *pin); });
         });
         design.ForEachInstance([&](Instance const *instance) {
-            Check({instance->GetNameRef().View(), "instance", instance, verilog.instanceCase});
+            WrittenName name{instance->GetNameRef().View(), "instance", instance,
+                             verilog.instanceCase};
+            name.inConfiguration = isConfigured;
+            Check(name);
         });
         design.ForEachSignal([&](Signal const *signal) {
             if (signal->IsNeededToDeclared())
                 CheckSignal(*signal);
         });
         ForEachAttribute(design, [this](AttributeUse const &use) {
-            Check({use.attribute->GetNameRef().View(), "attribute", use.attribute,
-                   VerilogOption::CASE_DEFAULT, use.generic ? BOTH : VHDL});
+            WrittenName name{use.attribute->GetNameRef().View(), "attribute", use.attribute,
+                             VerilogOption::CASE_DEFAULT, use.generic ? BOTH : VHDL};
+            name.inConfiguration = IsInConfiguration(use);
+            Check(name);
         });
     }
 
@@ -127,8 +112,8 @@ private:
                                  (use.kind == AttributeUse::SIGNAL &&
                                   static_cast<Signal const *>(use.owner)->IsPort());
             bool const isTyped = use.generic || design.options.vhdlOption.useAttrType;
-            (isOuter ? outerTypes : innerTypes)
-                .insert(isTyped ? VhdlTypeOf(*use.attribute) : "string");
+            std::string const type = isTyped ? VhdlTypeOf(*use.attribute) : "string";
+            (isOuter ? outerTypes : innerTypes).insert(type.substr(0, type.find_first_of(" .(")));
         });
         pinTypes.insert("std_logic");
         bool hasVectors = false;
@@ -142,6 +127,14 @@ private:
         if (hasVectors)
             pinTypes.insert("std_logic_vector");
         innerTypes.insert(pinTypes.begin(), pinTypes.end());
+    }
+
+    bool IsInConfiguration(AttributeUse const &use) const {
+        if (use.generic && use.kind == AttributeUse::COMPONENT)
+            return IsConfigured(design, static_cast<Component const &>(*use.owner));
+        bool const isDeclared =
+            use.generic ? use.kind == AttributeUse::MODULE : use.attribute->IsSynDeclared();
+        return isDeclared && isConfigured;
     }
 
     void Add(Id id, WrittenName const &name, Languages languages, std::string detail = {}) {
@@ -186,6 +179,8 @@ private:
             Add(Id::STANDARD_NAME, name, VHDL);
         if (name.what == "design" && IsLibrary(vhdl))
             Add(Id::LIBRARY_NAME, name, VHDL);
+        if (name.inConfiguration && vhdl == "work")
+            Add(Id::HIDDEN_LIBRARY, name, VHDL);
     }
 
     /// Whether the file names a library so, or VHDL does for every file (IEEE 1076-1993, 11.2).
@@ -202,10 +197,14 @@ private:
         WrittenName name{BaseOf(signal), signal.IsPort() ? "port" : "net", &signal,
                          design.options.verilogOption.signalCase};
         name.shown = signal.GetNameRef().View();
+        name.inConfiguration = isConfigured;
         if (SameIgnoringCase(name.shown, "open"))
             return Add(Id::OPEN_NAME, name, BOTH);
-        if (signal.GetSignalType() == Signal::SIGNAL_SCALAR && CheckScalar(signal, name))
-            return;
+        if (signal.GetSignalType() == Signal::SIGNAL_SCALAR) {
+            if (CheckScalar(signal, name))
+                return;
+            name.name = name.shown; // brackets and all
+        }
         Check(name);
     }
 
@@ -230,6 +229,9 @@ private:
         WrittenName name{BaseOf(pin), "pin", &pin};
         name.owner = std::string(component.GetNameRef().View()) + ".";
         name.shown = pin.GetNameRef().View();
+        if (!Bus::IsBusName(pin.GetNameRef()) && !BusIndex::IsBusIndexName(pin.GetNameRef()))
+            name.name = name.shown; // brackets and all
+        name.inConfiguration = IsConfigured(design, component);
         if (HasNegativeBound(name.shown))
             Add(Id::NEGATIVE_BOUND, name, BOTH);
         else
@@ -243,9 +245,10 @@ private:
     }
 
     Design const &design;
-    std::unordered_set<std::string> pinTypes;
-    std::unordered_set<std::string> innerTypes; ///< of the architecture
-    std::unordered_set<std::string> outerTypes; ///< of the entity
+    bool isConfigured = false; ///< some component
+    std::unordered_set<std::string, SeededHash> pinTypes;
+    std::unordered_set<std::string, SeededHash> innerTypes; ///< of the architecture
+    std::unordered_set<std::string, SeededHash> outerTypes; ///< of the entity
 };
 
 /// Names that meet although the library took both.
@@ -260,26 +263,12 @@ public:
         });
         CheckNetlistName();
         ForEachAttribute(design, [this](AttributeUse const &use) { CheckAttribute(use); });
-        for (auto const &[signal, dummy] : design.dummies)
-            CheckDummy(*signal, dummy);
     }
 
 private:
-    /// How a name is spelled in Verilog, for which names have to be alike in case to clash.
-    std::string InVerilog(Object const &object) const {
-        VerilogOption const &verilog = design.options.verilogOption;
-        VerilogOption::CaseType nameCase = VerilogOption::CASE_DEFAULT;
-        if (object.GetObjectType() == Object::OBJECT_SIGNAL)
-            nameCase = verilog.signalCase;
-        else if (object.GetObjectType() == Object::OBJECT_INSTANCE)
-            nameCase = verilog.instanceCase;
-        else if (object.GetObjectType() == Object::OBJECT_COMPONENT)
-            nameCase = verilog.componentCase;
-        return Cased(BaseOf(object), nameCase);
-    }
-
     Languages Clash(Object const &left, Object const &right) const {
-        return InVerilog(left) == InVerilog(right) ? BOTH : VHDL;
+        return NameInVerilog(left, design.options) == NameInVerilog(right, design.options) ? BOTH
+                                                                                           : VHDL;
     }
 
     void AddClash(Id id, std::string const &what, Object const &found, Object const &other,
@@ -309,6 +298,8 @@ private:
     void CheckCase(Signal const &part, Bus const &bus) {
         VerilogOption::CaseType const nameCase = design.options.verilogOption.signalCase;
         bool const isInside = design.IsInside(part);
+        if ((isInside || nameCase == VerilogOption::CASE_DEFAULT) && BaseOf(bus) == BaseOf(part))
+            return;
         std::string const base = Cased(BaseOf(bus), nameCase);
         std::string const partBase =
             isInside ? Cased(BaseOf(part), nameCase) : std::string(BaseOf(part));
@@ -333,15 +324,24 @@ private:
                  Clash(design.netlist, *component));
     }
 
+    /// The last pin of that base name; null if there is none. The attributes of a component come
+    /// one after the other.
+    Pin const *FindPin(Component const &component, std::string const &name) {
+        if (pinsOf != &component) {
+            pinsOf = &component;
+            pins.clear();
+            ForEach(component.GetPinIterator(),
+                    [this](Pin const *pin) { pins[Lowercase(BaseOf(*pin))] = pin; });
+        }
+        auto const found = pins.find(Lowercase(name));
+        return found == pins.end() ? nullptr : found->second;
+    }
+
     void CheckAttribute(AttributeUse const &use) {
         std::string const name(use.attribute->GetNameRef().View());
         Object const *other = nullptr;
         if (use.generic && use.kind == AttributeUse::COMPONENT) {
-            ForEach(static_cast<Component const *>(use.owner)->GetPinIterator(),
-                    [&](Pin const *pin) {
-                        if (SameIgnoringCase(BaseOf(*pin), name))
-                            other = pin;
-                    });
+            other = FindPin(*static_cast<Component const *>(use.owner), name);
         } else if (!use.generic || use.kind == AttributeUse::MODULE) {
             other = design.netlist.GetSignal(name.c_str());
             if (!other)
@@ -364,37 +364,9 @@ private:
                          : VHDL);
     }
 
-    void CheckDummy(Signal const &signal, Design::Dummy const &dummy) {
-        if (signal.GetSignalType() == Signal::SIGNAL_COMPOUND_BUS)
-            return;
-        Text const dummyName = signal.GetDummySignalName();
-        if (dummy.again)
-            return design.findings.Add({Id::DUMMY_OF_DUMMY,
-                                        design.MadeAt(&signal),
-                                        NetName(signal),
-                                        {{dummy.again, "it is a member of this compound"}},
-                                        BOTH,
-                                        Quoted(dummyName.View())});
-        std::string const base(BaseOf(dummyName.View()));
-        bool const itself = SameIgnoringCase(base, BaseOf(signal));
-        Object const *taken = design.netlist.GetSignal(base.c_str());
-        if (!taken)
-            taken = design.netlist.GetParentBus(base.c_str());
-        if (!taken)
-            taken = design.netlist.GetInstance(base.c_str());
-        if (!taken)
-            return;
-        bool const alike =
-            Cased(base, design.options.verilogOption.signalCase) == InVerilog(*taken);
-        design.findings.Add({itself ? Id::DUMMY_OF_DUMMY : Id::DUMMY_NAME_TAKEN,
-                             design.MadeAt(&signal),
-                             NetName(signal),
-                             {{itself ? dummy.demand : taken, "the other one is here"}},
-                             itself || alike ? BOTH : VHDL,
-                             Quoted(dummyName.View())});
-    }
-
     Design const &design;
+    Component const *pinsOf = nullptr;
+    std::unordered_map<std::string, Pin const *, SeededHash> pins; ///< by their base names
 };
 
 } // namespace

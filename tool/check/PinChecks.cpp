@@ -1,6 +1,8 @@
 // Pins of components and of instances, and the parts of buses that are on them.
 
+#include <algorithm>
 #include <map>
+#include <unordered_map>
 
 #include "tool/check/Design.h"
 
@@ -51,21 +53,26 @@ void CheckComponent(Design const &design, Component const &component) {
     });
 }
 
-/// Pins are appended to the component: the late ones are those behind the instance's.
-void CheckLatePins(Design const &design, Instance const &instance) {
-    Component const *const component = instance.GetComponent();
-    if (!component)
-        return;
-    Iterator<Pin *> own = instance.GetPinIterator();
-    Iterator<Pin *> all = component->GetPinIterator();
-    for (; own.HasMore() && all.HasMore(); all.Advance())
-        own.Advance();
-    for (; all.HasMore(); all.Advance())
-        if (Pin const *const pin = all.Current(); pin && !instance.GetPin(pin->GetNameRef()))
+/// Pins are appended to the component: the late ones are those behind the instance's. Each is told
+/// once, with the first instance that lacks it.
+void CheckLatePins(Design const &design) {
+    std::unordered_map<Component const *, int> checkedFrom; ///< the pins from this one on
+    design.ForEachInstance([&](Instance const *instance) {
+        Component const *const component = instance->GetComponent();
+        if (!component)
+            return;
+        auto const &all = *component->GetPinIterator().GetArray();
+        int const own = instance->GetPinIterator().GetArray()->GetSize();
+        if (own >= all.GetSize())
+            return;
+        int &end = checkedFrom.try_emplace(component, all.GetSize()).first->second;
+        for (int i = own; i < end; ++i)
             design.findings.Add({Id::LATE_PIN,
-                                 design.MadeAt(pin),
-                                 PinName(*component, *pin),
-                                 {{&instance, "this instance goes without it"}}});
+                                 design.MadeAt(all.GetAt(i)),
+                                 PinName(*component, *all.GetAt(i)),
+                                 {{instance, "this instance goes without it"}}});
+        end = std::min(end, own);
+    });
 }
 
 void CheckInstancePin(Design const &design, Instance const &instance, Pin const &pin) {
@@ -139,7 +146,7 @@ void CheckSlice(Design const &design, Bus const &bus, BusSlice const &slice) {
 void CheckPins(Design const &design) {
     design.ForEachUsedComponent(
         [&](Component const *component) { CheckComponent(design, *component); });
-    design.ForEachInstance([&](Instance const *instance) { CheckLatePins(design, *instance); });
+    CheckLatePins(design);
     design.ForEachPin(
         [&](Instance const &instance, Pin const &pin) { CheckInstancePin(design, instance, pin); });
     design.ForEachSignal([&](Signal const *signal) {

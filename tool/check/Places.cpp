@@ -1,16 +1,9 @@
 #include "tool/check/Places.h"
 
 #include <algorithm>
-
-#include "tool/session/LineReader.h"
+#include <tuple>
 
 namespace Checks {
-
-namespace {
-
-bool IsStandardInput(std::string const &path) { return path == "-"; }
-
-} // namespace
 
 Spot SpotOf(LineTokens const &tokens, int token, std::uint32_t line) {
     constexpr unsigned MOST = 0xFFFF;
@@ -22,45 +15,51 @@ Spot SpotOf(LineTokens const &tokens, int token, std::uint32_t line) {
 }
 
 void Places::BeginFile(std::string const &path, std::string const &shownName) {
-    files.push_back({path, shownName, lineCount, {}});
+    files.push_back({path, shownName, lineCount, nullptr});
+    if (!LineReader::CanReadAgain(path))
+        files.back().lines = std::make_unique<LineStore>();
 }
 
 std::uint32_t Places::NextLine(std::string const &text) {
-    if (!files.empty() && IsStandardInput(files.back().path))
-        files.back().lines.push_back(text);
+    if (!files.empty() && files.back().lines)
+        files.back().lines->Add(text);
     return ++lineCount;
 }
 
+/// The tokens of a line are put from left to right, so that the last one put is behind the others.
+bool Places::IsLess(Entry const &left, Entry const &right) {
+    return std::tie(left.key, left.spot.line, left.spot.column) <
+           std::tie(right.key, right.spot.line, right.spot.column);
+}
+
 Spot Places::Find(Event event, void const *object, std::uint32_t before) const {
-    auto const isLess = [](Entry const &left, Entry const &right) {
-        return left.key != right.key ? left.key < right.key : left.spot.line < right.spot.line;
-    };
     if (sortedCount < entries.size()) {
         auto const middle = entries.begin() + static_cast<std::ptrdiff_t>(sortedCount);
-        std::stable_sort(middle, entries.end(), isLess);
-        std::inplace_merge(entries.begin(), middle, entries.end(), isLess);
+        std::sort(middle, entries.end(), IsLess);
+        std::inplace_merge(entries.begin(), middle, entries.end(), IsLess);
         sortedCount = entries.size();
     }
     std::uintptr_t const key = KeyOf(event, object);
     auto const behind =
-        std::lower_bound(entries.begin(), entries.end(), Entry{key, {before, 0, 0}}, isLess);
+        std::lower_bound(entries.begin(), entries.end(), Entry{key, {before, 0, 0}}, IsLess);
     if (behind == entries.begin() || std::prev(behind)->key != key)
         return {};
     return std::prev(behind)->spot;
 }
 
-Places::File const &Places::FileOf(std::uint32_t line) const {
-    auto file = files.end() - 1;
-    while (file != files.begin() && file->linesBefore >= line)
-        --file;
-    return *file;
+/// The last file that begins before the line.
+std::size_t Places::FileOf(std::uint32_t line) const {
+    auto const behind =
+        std::partition_point(files.begin() + 1, files.end(),
+                             [line](File const &file) { return file.linesBefore < line; });
+    return static_cast<std::size_t>(behind - files.begin()) - 1;
 }
 
 Place Places::GetPlace(Spot spot) const {
     Place place;
     if (files.empty())
         return place;
-    File const &file = spot.line == 0 ? files.front() : FileOf(spot.line);
+    File const &file = files[spot.line == 0 ? 0 : FileOf(spot.line)];
     place.file = file.shownName;
     place.line = spot.line == 0 ? 0 : spot.line - file.linesBefore;
     place.column = spot.column;
@@ -68,30 +67,19 @@ Place Places::GetPlace(Spot spot) const {
     return place;
 }
 
-void Places::AddSources(std::vector<Diagnostic> &diagnostics,
-                        std::vector<Spot> const &spots) const {
-    std::size_t next = 0;
-    for (std::size_t i = 0; i < files.size() && next < spots.size(); ++i) {
-        File const &file = files[i];
-        std::uint32_t const last = i + 1 < files.size() ? files[i + 1].linesBefore : lineCount;
-        while (next < spots.size() && spots[next].line <= file.linesBefore)
-            ++next;
-        if (IsStandardInput(file.path)) {
-            for (; next < spots.size() && spots[next].line <= last; ++next)
-                diagnostics[next].source = file.lines[spots[next].line - file.linesBefore - 1];
-            continue;
-        }
-        if (next == spots.size() || spots[next].line > last)
-            continue;
-        LineReader reader(file.path);
-        std::string text;
-        std::uint32_t line = file.linesBefore;
-        while (next < spots.size() && spots[next].line <= last && reader.Next(text)) {
-            ++line;
-            for (; next < spots.size() && spots[next].line == line; ++next)
-                diagnostics[next].source = text;
-        }
+std::string const *Places::SourceReader::Get(std::uint32_t line) {
+    if (line == 0 || places.files.empty())
+        return nullptr;
+    std::size_t const wanted = places.FileOf(line);
+    if (!reader || wanted != file) {
+        File const &source = places.files[wanted];
+        file = wanted;
+        lineRead = source.linesBefore;
+        reader = source.lines ? source.lines->Read() : std::make_unique<LineReader>(source.path);
     }
+    while (lineRead < line && reader->Next(text))
+        ++lineRead;
+    return lineRead == line ? &text : nullptr;
 }
 
 } // namespace Checks

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstdint>
+#include <memory>
 #include <string>
 #include <string_view>
 #include <unordered_set>
@@ -8,6 +9,8 @@
 
 #include "tool/diagnostics/Diagnostic.h"
 #include "tool/diagnostics/LineTokens.h"
+#include "tool/session/LineReader.h"
+#include "tool/session/LineStore.h"
 
 namespace Checks {
 
@@ -22,16 +25,15 @@ struct Spot {
 /// Where a token stands, or its line as a whole if that is too far to the right for a spot.
 Spot SpotOf(LineTokens const &tokens, int token, std::uint32_t line);
 
-/// Who was made, connected or given a constant where.
+/// Who was made, connected, or given a constant or a text where.
 class Places {
 public:
-    enum Event : std::uintptr_t { MADE = 0, CONNECTED = 1, CONSTANT = 2, ASSIGNED = 3 };
+    enum Event : std::uintptr_t { MADE = 0, CONNECTED = 1, CONSTANT = 2, ASSIGNED = 3, TEXT = 4 };
     static constexpr std::uint32_t EVER = UINT32_MAX;
 
     /// The lines to come are of this file; `shownName` is what the user called it.
     void BeginFile(std::string const &path, std::string const &shownName);
-    /// Counts a line and gives its number. Of standard input the text is kept, since nobody can
-    /// read it again.
+    /// Counts a line and gives its number. Of an input that cannot be read again the text is kept.
     std::uint32_t NextLine(std::string const &text);
 
     void Put(Event event, void const *object, Spot spot) {
@@ -44,13 +46,26 @@ public:
     /// A net that a write gave to an open pin has no place, and no check looks at it.
     void PutOpen(void const *net) { openNets.insert(net); }
     bool IsOpen(void const *net) const { return !openNets.empty() && openNets.count(net) > 0; }
+    bool HasOpen() const { return !openNets.empty(); }
     /// When a line speaks of the net, it becomes one of that line's. Whether it was open.
-    bool TakeOpen(void const *net) { return openNets.erase(net) > 0; }
+    bool TakeOpen(void const *net) { return !openNets.empty() && openNets.erase(net) > 0; }
 
     Place GetPlace(Spot spot) const;
-    /// Gives each diagnostic the text of its line, as far as files can be read again. They have to
-    /// be in order of their places.
-    void AddSources(std::vector<Diagnostic> &diagnostics, std::vector<Spot> const &spots) const;
+
+    /// Reads lines again, one at a time.
+    class SourceReader {
+    public:
+        explicit SourceReader(Places const &readPlaces) : places(readPlaces) {}
+        /// The text of a line, null if it cannot be read. Lines are asked for in ascending order.
+        std::string const *Get(std::uint32_t line);
+
+    private:
+        Places const &places;
+        std::size_t file = 0;
+        std::unique_ptr<LineReader> reader; ///< of the file
+        std::uint32_t lineRead = 0;
+        std::string text;
+    };
 
 private:
     struct Entry {
@@ -61,19 +76,20 @@ private:
         std::string path;
         std::string shownName;
         std::uint32_t linesBefore;
-        std::vector<std::string> lines; ///< of standard input
+        std::unique_ptr<LineStore> lines; ///< of an input that cannot be read again
     };
 
     /// Objects stand at even addresses of eight bytes: the low bits are free for the event.
     static std::uintptr_t KeyOf(Event event, void const *object) {
         return reinterpret_cast<std::uintptr_t>(object) | event;
     }
-    File const &FileOf(std::uint32_t line) const;
+    static bool IsLess(Entry const &left, Entry const &right);
+    std::size_t FileOf(std::uint32_t line) const;
 
     std::unordered_set<void const *> openNets;
     std::vector<File> files;
     std::uint32_t lineCount = 0;
-    mutable std::vector<Entry> entries; ///< those in front sorted by key, then by line
+    mutable std::vector<Entry> entries; ///< those in front sorted by key, then by place
     mutable std::size_t sortedCount = 0;
 };
 

@@ -20,20 +20,23 @@ void Recorder::Before(LineTokens const &lineTokens, CommandHelp const *command, 
     tokens = &lineTokens;
     lineNumber = line;
     nets.clear();
-    buses.clear();
+    netCount = 0;
+    if (!buses.empty()) {
+        buses.clear();
+        busPlaces.clear();
+    }
     pin = nullptr;
     holder = nullptr;
     keyword = command ? command->keyword : "";
     firstArgument = words;
-    std::string const first(lineTokens.At(firstArgument));
+    Text const &first = lineTokens.GetTokens().At(firstArgument);
     if (keyword == CONNECT) {
         Name(first, firstArgument);
         NamePin(firstArgument + 1);
     } else if (keyword == ASSIGN) {
         NamePin(firstArgument);
     } else if (keyword == "ADD SIGNAL" || keyword == "ADD PORT") {
-        nets.push_back(
-            {first, firstArgument, model.GetSignal(first.c_str()) != nullptr, Origin::DECLARED});
+        nets.push_back({first, firstArgument, model.GetSignal(first) != nullptr, Origin::DECLARED});
     } else if (Contains(keyword, " ATTRIBUTE")) {
         bool const module = Contains(keyword, "MODULE");
         attributeToken = firstArgument + (module ? 0 : 1);
@@ -46,46 +49,48 @@ void Recorder::Before(LineTokens const &lineTokens, CommandHelp const *command, 
     }
 }
 
-/// Whether the net was there before the line.
-bool Recorder::Knows(std::string const &name, int token) {
-    Bus const *const bus = netlist.GetParentBus(name.c_str());
-    if (bus && places.TakeOpen(bus))
-        places.Put(Places::MADE, bus, SpotOf(token));
-    Signal const *const signal = model.GetSignal(name.c_str());
-    return signal && !places.TakeOpen(signal);
-}
-
 /// A net as CONNECT and ASSIGN name it, who make it if there is none. The form of a name is that of
 /// the text as it was typed.
-void Recorder::Name(std::string const &name, int token) {
-    Text const typed(name.c_str());
-    bool const existed = Knows(name, token);
-    bool const compound = CompoundBus::IsCompoundBusName(typed);
-    nets.push_back({name, token, existed, Origin::BRACKETS});
-    if (existed)
-        return;
-    WatchBus(name, token);
-    if (!compound)
+void Recorder::Name(Text const &name, int token) {
+    if (NameOne(name, token, Origin::BRACKETS) || !CompoundBus::IsCompoundBusName(name))
         return;
     StringArray members;
-    CompoundBus::ParseCompoundBusName(typed, members, false);
+    CompoundBus::ParseCompoundBusName(name, members, false);
     for (int i = 0; i < members.GetSize(); ++i)
-        NameMember(members.At(i).GetText(), token, Origin::COMPOUND);
+        NameOne(members.At(i), token, Origin::COMPOUND);
 }
 
-void Recorder::NameMember(std::string const &name, int token, Origin origin) {
-    nets.push_back({name, token, Knows(name, token), origin});
-    if (!nets.back().existed)
+/// Whether the net was there before the line.
+bool Recorder::NameOne(Text const &name, int token, Origin origin) {
+    if (netCount++ == 0)
+        firstNet = name;
+    if (places.HasOpen()) {
+        Bus const *const bus = netlist.GetParentBus(name);
+        if (bus && places.TakeOpen(bus))
+            places.Put(Places::MADE, bus, SpotOf(token));
+    }
+    Signal const *const signal = model.GetSignal(name);
+    bool const existed = signal && !places.TakeOpen(signal);
+    if (!existed)
         WatchBus(name, token);
+    if (!existed || signal->GetNameRef().View() != name.View())
+        nets.push_back({name, token, existed, origin});
+    return existed;
 }
 
-void Recorder::WatchBus(std::string const &name, int token) {
+void Recorder::WatchBus(Text const &name, int token) {
     Range wanted;
     Range present;
-    Bus *const bus = netlist.GetParentBus(name.c_str());
-    if (bus && Bus::IsBusName(name.c_str()) && GetRange(name.c_str(), wanted) &&
-        GetRange(bus->GetNameRef(), present) && wanted.Width() >= present.Width())
-        buses.push_back({bus, bus->GetNameRef().GetText(), LossesOf(*bus), token});
+    if (!Bus::IsBusName(name) || !GetRange(name, wanted))
+        return;
+    Bus *const bus = netlist.GetParentBus(name);
+    if (!bus || !GetRange(bus->GetNameRef(), present) || wanted.Width() < present.Width())
+        return;
+    auto const [known, isNew] = busPlaces.try_emplace(bus, buses.size());
+    if (isNew)
+        buses.push_back({bus, bus->GetNameRef(), LossesOf(*bus), token, token});
+    else
+        buses[known->second].lastToken = token;
 }
 
 std::string Recorder::LossesOf(Bus const &bus) {
@@ -108,7 +113,7 @@ void Recorder::NamePin(int token) {
     std::string pinName;
     std::string_view const text = tokens->At(token);
     if (!SplitPin(text, owner, pinName)) {
-        Name(std::string(text), token);
+        Name(tokens->GetTokens().At(token), token);
         return;
     }
     if (Instance const *const instance = model.GetInstance(owner.c_str()))
@@ -142,7 +147,7 @@ AttributeHolder *Recorder::HolderOf(int token, std::string_view kind) const {
 void Recorder::After(bool ran) {
     RecordNets();
     for (Widened const &widened : buses)
-        if (netlist.GetParentBus(widened.name.c_str()) != widened.bus)
+        if (netlist.GetParentBus(widened.name) != widened.bus)
             RecordWidening(widened);
     if (!ran)
         return;
@@ -150,11 +155,12 @@ void Recorder::After(bool ran) {
     RecordAssignment();
     RecordDeclaration();
     RecordAttribute();
+    RecordText();
 }
 
 void Recorder::RecordNets() {
     for (Named const &named : nets) {
-        Signal const *const signal = model.GetSignal(named.name.c_str());
+        Signal const *const signal = model.GetSignal(named.name);
         if (!signal)
             continue;
         if (named.existed) {
@@ -163,9 +169,10 @@ void Recorder::RecordNets() {
         }
         places.TakeOpen(signal);
         places.Put(Places::MADE, signal, SpotOf(named.token));
-        respelled.erase(signal);
+        if (!respelled.empty())
+            respelled.erase(signal);
         bool const bracketed = named.origin == Origin::BRACKETS &&
-                               named.name.find_first_of("[]{}<>") != std::string::npos;
+                               named.name.View().find_first_of("[]{}<>") != std::string_view::npos;
         if (signal->GetSignalType() == Signal::SIGNAL_SCALAR &&
             (bracketed || BusIndex::IsBusIndexName(signal->GetNameRef())))
             origins[signal] = named.origin;
@@ -174,7 +181,7 @@ void Recorder::RecordNets() {
 
 /// Two nets to the eye, one to the library.
 void Recorder::CompareSpelling(Named const &named, Signal const &signal) {
-    std::string const typed = Normal(named.name);
+    std::string const typed = Normal(named.name.View());
     std::string_view const made = signal.GetNameRef().View();
     if (typed == made || !SameIgnoringCase(typed, made) || named.origin == Origin::DECLARED ||
         !respelled.insert(&signal).second)
@@ -200,6 +207,8 @@ void Recorder::RecordPin() {
         return;
     if (formerNet && net != formerNet) {
         moved[pin] = net;
+        if (!connects)
+            movedTies.emplace(net, pin);
         findings.Add(
             {Id::PIN_MOVED,
              SpotOf(pinToken),
@@ -211,57 +220,75 @@ void Recorder::RecordPin() {
     places.Put(Places::CONNECTED, pin, SpotOf(pinToken));
 }
 
-/// The old bus is gone: it is known by its name and by what it had.
+/// The old bus is gone: it is known by its name and by what it had. A slice of the new one has its
+/// name and its pins, in front of all that were slices before the line.
 void Recorder::RecordWidening(Widened const &widened) {
-    Bus *const wide = netlist.GetParentBus(widened.name.c_str());
+    Bus *const wide = netlist.GetParentBus(widened.name);
     if (!wide)
         return;
-    places.Put(Places::MADE, wide, SpotOf(widened.token));
-    ForEach(wide->GetBusSliceIterator(), [&](Signal const *slice) {
-        if (slice->GetNameRef() == widened.name.c_str())
-            places.Put(Places::MADE, slice, SpotOf(widened.token));
-    });
+    places.Put(Places::MADE, wide, SpotOf(widened.lastToken));
     if (!widened.losses.empty())
         findings.Add({Id::WIDENED_BUS,
-                      SpotOf(widened.token),
-                      "bus " + Quoted(widened.name),
+                      SpotOf(widened.firstToken),
+                      "bus " + Quoted(widened.name.View()),
                       {{widened.bus, "it was made here", Places::MADE, lineNumber}},
                       BOTH,
                       "to " + Quoted(wide->GetNameRef().View()) + "; lost: " + widened.losses});
-    for (auto &[movedPin, net] : moved) {
-        Signal *const now = movedPin->GetSignal();
-        if (net == widened.bus)
-            net = now;
-        else if (now && now != net && now->GetNameRef() == widened.name.c_str() && movedPin != pin)
+    for (Iterator<Signal *> slices = wide->GetBusSliceIterator(); slices.HasMore();
+         slices.Advance())
+        if (slices.Current() && slices.Current()->GetNameRef() == widened.name) {
+            places.Put(Places::MADE, slices.Current(), SpotOf(widened.lastToken));
+            RecordReturns(widened, *slices.Current());
+            break;
+        }
+}
+
+/// Pins that had left the bus and are taken along to the slice.
+void Recorder::RecordReturns(Widened const &widened, Signal &slice) {
+    if (moved.empty())
+        return;
+    ForEach(slice.GetPinIterator(), [&](Pin *listed) {
+        auto const found = moved.find(listed);
+        if (found == moved.end() || listed->GetSignal() != &slice)
+            return;
+        if (found->second == widened.bus)
+            found->second = &slice;
+        else if (found->second != &slice && listed != pin)
             findings.Add({Id::PIN_RETURNS,
-                          SpotOf(widened.token),
-                          "pin " + Quoted(movedPin->GetNameRef().View()),
-                          {{movedPin, "it was connected here", Places::CONNECTED, lineNumber}},
+                          SpotOf(widened.firstToken),
+                          "pin " + Quoted(listed->GetNameRef().View()),
+                          {{listed, "it was connected here", Places::CONNECTED, lineNumber}},
                           BOTH,
                           "widening takes along all that was ever connected"});
-    }
+    });
+    auto const [first, last] = movedTies.equal_range(widened.bus);
+    for (auto tie = first; tie != last; ++tie)
+        if (Signal *&net = moved[tie->second]; net == widened.bus)
+            net = tie->second->GetSignal();
+    movedTies.erase(first, last);
 }
 
 void Recorder::RecordAssignment() {
-    bool const isAssignment = keyword == CONNECT && nets.size() >= 2 && !pin;
-    if (isAssignment || (keyword == ASSIGN && !pin && !nets.empty()))
-        if (Signal const *const target = model.GetSignal(nets.front().name.c_str()))
+    bool const isAssignment = keyword == CONNECT && netCount >= 2 && !pin;
+    if (isAssignment || (keyword == ASSIGN && !pin && netCount > 0))
+        if (Signal const *const target = model.GetSignal(firstNet))
             places.Put(isAssignment ? Places::ASSIGNED : Places::CONSTANT, target,
-                       SpotOf(nets.front().token));
+                       SpotOf(firstArgument));
 }
 
 void Recorder::RecordDeclaration() {
-    std::string const first(tokens->At(firstArgument));
-    std::string const second(tokens->At(firstArgument + 1));
+    auto const argument = [this](int index) -> Text const & {
+        return tokens->GetTokens().At(firstArgument + index);
+    };
     Object const *made = nullptr;
     int token = firstArgument;
     if (keyword == "ADD COMPONENT") {
-        made = model.GetComponent(first.c_str());
+        made = model.GetComponent(argument(0));
     } else if (keyword == "ADD PIN") {
-        made = model.GetPin(second.c_str(), model.GetComponent(first.c_str()));
+        made = model.GetPin(argument(1), model.GetComponent(argument(0)));
         ++token;
     } else if (keyword == "ADD INSTANCE") {
-        made = model.GetInstance(second.c_str());
+        made = model.GetInstance(argument(1));
         ++token;
     } else if (keyword == "SET NETLIST NAME") {
         made = &netlist;
@@ -275,6 +302,34 @@ void Recorder::RecordAttribute() {
         return;
     if (Attribute const *const made = holder->GetAttr(Normal(tokens->At(attributeToken)).c_str()))
         places.Put(Places::MADE, made, SpotOf(attributeToken));
+}
+
+/// What the line gave a comment, or the option that it set or added to; null for other lines.
+void const *Recorder::OwnerOfText() const {
+    if (Contains(keyword, "COMMENT") || keyword == "ADD NOTES")
+        return dynamic_cast<Object const *>(HolderOf(firstArgument, keyword));
+    HdlOptions const &options = *model.GetOptions();
+    std::pair<char const *, void const *> const rows[] = {
+        {"ADD LIBRARY", &options.vhdlOption.libraries},
+        {"ADD USE LIBRARY", &options.vhdlOption.useLibraries},
+        {"ADD INCLUDE", &options.verilogOption.includes},
+        {"Set Application", &options.application},
+        {"Set Command", &options.commandStr},
+        {"Set Device", &options.device},
+        {"Set Purpose", &options.purpose},
+        {"Set Reference", &options.reference},
+    };
+    for (auto const &[command, option] : rows)
+        if (keyword == command)
+            return option;
+    return nullptr;
+}
+
+void Recorder::RecordText() {
+    if (void const *const owner = keyword == CONNECT ? nullptr : OwnerOfText())
+        places.Put(Places::TEXT, owner,
+                   SpotOf(firstArgument +
+                          (Contains(keyword, " COMMENT") && !Contains(keyword, "MODULE") ? 1 : 0)));
 }
 
 Origin Recorder::GetOrigin(Signal const *signal) const {

@@ -35,9 +35,10 @@ public:
     Origin GetOrigin(Vesk_Hdl::Signal const *signal) const;
 
 private:
-    /// A net that the line names.
+    /// A net that the line names, if there is something to look at behind the line: it did not
+    /// exist, or it is spelled in another way.
     struct Named {
-        std::string name;
+        Text name;
         int token;
         bool existed;
         Origin origin;
@@ -45,16 +46,16 @@ private:
     /// A bus that may give way, and what it would lose.
     struct Widened {
         Vesk_Hdl::Bus *bus;
-        std::string name;
+        Text name;
         std::string losses;
-        int token;
+        int firstToken; ///< that names a wider one
+        int lastToken;
     };
 
     Spot SpotOf(int token) const { return Checks::SpotOf(*tokens, token, lineNumber); }
-    bool Knows(std::string const &name, int token);
-    void Name(std::string const &name, int token);
-    void NameMember(std::string const &name, int token, Origin origin);
-    void WatchBus(std::string const &name, int token);
+    void Name(Text const &name, int token);
+    bool NameOne(Text const &name, int token, Origin origin);
+    void WatchBus(Text const &name, int token);
     static std::string LossesOf(Vesk_Hdl::Bus const &bus);
     void NamePin(int token);
     Vesk_Hdl::AttributeHolder *HolderOf(int token, std::string_view kind) const;
@@ -63,9 +64,12 @@ private:
     void CompareSpelling(Named const &named, Vesk_Hdl::Signal const &signal);
     void RecordPin();
     void RecordWidening(Widened const &widened);
+    void RecordReturns(Widened const &widened, Vesk_Hdl::Signal &slice);
     void RecordAssignment();
     void RecordDeclaration();
     void RecordAttribute();
+    void RecordText();
+    void const *OwnerOfText() const;
 
     Vesk_Hdl::Model &model;
     Vesk_Hdl::Netlist &netlist;
@@ -78,7 +82,10 @@ private:
     std::string_view keyword;
     int firstArgument = 0;
     std::vector<Named> nets;
+    int netCount = 0; ///< of all that the line names
+    Text firstNet;
     std::vector<Widened> buses;
+    std::unordered_map<Vesk_Hdl::Bus *, std::size_t> busPlaces; ///< where they are in `buses`
     Vesk_Hdl::Pin *pin = nullptr;
     Vesk_Hdl::Signal *formerNet = nullptr; ///< of the pin
     Text formerNetName;
@@ -88,6 +95,8 @@ private:
     std::unordered_map<Vesk_Hdl::Signal const *, Origin> origins;
     std::unordered_set<Vesk_Hdl::Signal const *> respelled;
     std::unordered_map<Vesk_Hdl::Pin *, Vesk_Hdl::Signal *> moved; ///< pins and their last nets
+    /// Those of them that a net does not list, since they were tied.
+    std::unordered_multimap<Vesk_Hdl::Signal *, Vesk_Hdl::Pin *> movedTies;
 };
 
 } // namespace Checks

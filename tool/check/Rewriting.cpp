@@ -1,7 +1,6 @@
 #include "tool/check/Rewriting.h"
 
 #include <fcntl.h>
-#include <unordered_set>
 #include <utility>
 
 using namespace Vesk_Hdl;
@@ -28,16 +27,15 @@ void Rewrite(Session &session, Design const &design, Places &places, std::string
         if (auto const *const bus = dynamic_cast<Bus const *>(signal))
             ForEach(bus->GetBusSliceIterator(), [&](Signal const *part) { note(*part); });
     }
-    std::unordered_set<Signal const *> before;
-    ForEach(design.netlist.GetSignalIterator(), [&](Signal const *net) { before.insert(net); });
+    auto const &nets = *design.netlist.GetSignalIterator().GetArray();
+    int const before = nets.GetSize();
     Nowhere nowhere;
     session.GetModel().SetWriteOpener(&nowhere);
     session.RunLine(line, {});
     session.GetModel().SetWriteOpener(nullptr);
-    ForEach(design.netlist.GetSignalIterator(), [&](Signal const *net) {
-        if (before.count(net) == 0)
-            places.PutOpen(net);
-    });
+    // The write sorted the nets and put those that it made behind them.
+    for (int i = before; i < nets.GetSize(); ++i)
+        places.PutOpen(nets.GetAt(i));
     for (auto const &[name, spot] : dummyNames)
         if (Signal const *const made = design.netlist.GetSignal(name)) {
             places.TakeOpen(made);

@@ -24,12 +24,27 @@ inline std::string_view BaseOf(Vesk_Hdl::Object const &object) {
     return BaseOf(object.GetNameRef().View());
 }
 
-/// Whether the net was made for a pin that was given a constant.
-inline bool IsTieOfPin(Vesk_Hdl::Signal const &net) {
-    constexpr std::string_view TAG = "_CONST_SIGNAL";
-    std::string_view const base = BaseOf(net);
-    return base.size() > TAG.size() &&
-           SameIgnoringCase(base.substr(base.size() - TAG.size()), TAG); // a write may change it
+/// A name as Verilog has it after UPPERCASE and LOWERCASE lines.
+inline std::string Cased(std::string_view name,
+                         Vesk_Hdl::HdlOptions::VerilogOption::CaseType nameCase) {
+    Text text(name);
+    if (nameCase == Vesk_Hdl::HdlOptions::VerilogOption::CASE_UPPER)
+        text.MakeUpper();
+    else if (nameCase == Vesk_Hdl::HdlOptions::VerilogOption::CASE_LOWER)
+        text.MakeLower();
+    return text.GetText();
+}
+
+/// How an object is spelled in Verilog, where names in two cases are two names.
+inline std::string NameInVerilog(Vesk_Hdl::Object const &object,
+                                 Vesk_Hdl::HdlOptions const &options) {
+    using namespace Vesk_Hdl;
+    HdlOptions::VerilogOption const &verilog = options.verilogOption;
+    Object::ObjectType const type = object.GetObjectType();
+    return Cased(BaseOf(object), type == Object::OBJECT_SIGNAL      ? verilog.signalCase
+                                 : type == Object::OBJECT_INSTANCE  ? verilog.instanceCase
+                                 : type == Object::OBJECT_COMPONENT ? verilog.componentCase
+                                                                    : verilog.CASE_DEFAULT);
 }
 
 /// The bits of a bus, a slice or one bit, as its name tells them.
@@ -80,7 +95,7 @@ inline bool SplitPin(std::string_view token, std::string &owner, std::string &pi
 
 inline std::string PinName(Vesk_Hdl::Object const &owner, Vesk_Hdl::Pin const &pin) {
     return "pin " +
-           Quoted(std::string(owner.GetNameRef().View()) + "." + pin.GetNameRef().GetText());
+           Quoted(Shortened(owner.GetNameRef().View()) + "." + Shortened(pin.GetNameRef().View()));
 }
 
 inline std::string NetName(Vesk_Hdl::Signal const &signal) {

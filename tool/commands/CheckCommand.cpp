@@ -60,11 +60,11 @@ int Check(CheckOptions const &options) {
             refuse(
                 About(place.file, std::string("cannot read: ") + std::strerror(reader.GetError())));
     }
-    for (Diagnostic &finding : checker.Finish()) {
+    checker.Finish([&](Diagnostic &finding) {
         if (options.strict)
             finding.severity = Severity::ERROR;
-        reporter.Report(finding);
-    }
+        reporter.ReportNext(finding);
+    });
     if (reporter.GetErrorCount() + reporter.GetWarningCount() > 0)
         reporter.ReportCount();
     return reporter.GetErrorCount() > 0 ? SOMETHING_REFUSED : ALL_WELL;

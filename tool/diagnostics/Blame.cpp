@@ -384,19 +384,6 @@ Diagnostic At(std::string const &line, Place const &place) {
 
 } // namespace
 
-CommandHelp const *KeywordOf(StringArray const &tokens, int &words) {
-    CommandHelp const *found = nullptr;
-    StringArray begin;
-    for (int i = 0; i < std::min(tokens.GetSize(), MOST_KEYWORD_WORDS); ++i) {
-        begin.Add(tokens.At(i));
-        if (CommandHelp const *const command = CommandReference::Find(KeywordPart(begin).c_str())) {
-            found = command;
-            words = i + 1;
-        }
-    }
-    return found;
-}
-
 Diagnostic BlameRefusal(std::string const &line, Place const &place, std::string text,
                         Model const &model) {
     return Refusal(line, place, std::move(text), model).Explain();

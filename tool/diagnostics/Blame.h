@@ -3,6 +3,7 @@
 #include <string>
 
 #include "tool/diagnostics/Diagnostic.h"
+#include "tool/diagnostics/Keywords.h"
 #include "vesk_hdl/Vesk_Hdl.h"
 
 // Which token of a line is to blame for what the library says of it, and what to do next. The
@@ -19,7 +20,3 @@ Diagnostic BlameWrite(std::string const &line, Place const &place,
 
 /// A line with a NUL byte at the index.
 Diagnostic BlameNul(std::string const &line, Place const &place, std::size_t at);
-
-/// The keyword that the line begins with, longest first, as the engine finds it; null for none.
-/// `words` becomes the number of its words.
-Vesk_Hdl::CommandHelp const *KeywordOf(Vesk_Hdl::StringArray const &tokens, int &words);

@@ -26,6 +26,8 @@ struct Diagnostic {
     Place place;
     std::string message; ///< without an end of line; of a refused line the library's own text
     std::string source;  ///< the line that the place is in, shown with a caret; may be empty
+    std::size_t sourceBegin = 0;    ///< bytes of the line in front of `source`, if that is a part
+    bool sourceGoesOn = false;      ///< the line has more than this part
     std::vector<std::string> hints; ///< what to do next, a sentence each
     std::vector<Note> notes;        ///< other places that have to do with it
     std::string name;               ///< of a finding, such as "reserved-word"; otherwise empty

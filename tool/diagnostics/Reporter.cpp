@@ -56,6 +56,30 @@ std::size_t SequenceAt(std::string_view text) {
     return bad ? 0 : length;
 }
 
+/// What is shown of a line: all, or of a long one the part around a column.
+struct Window {
+    std::string_view text;
+    std::size_t begin; ///< bytes of the line in front of it
+    bool goesOn;
+};
+
+Window WindowOf(std::string_view line, unsigned column) {
+    std::size_t const at = std::min<std::size_t>(column - 1, line.size());
+    std::size_t begin = 0;
+    if (line.size() > MOST_SOURCE && at > SOURCE_BEFORE) {
+        begin = at - SOURCE_BEFORE;
+        while (begin < at && Continues(line[begin]))
+            ++begin;
+    }
+    std::string_view const rest = line.substr(begin);
+    if (rest.size() <= MOST_SOURCE)
+        return {rest, begin, false};
+    std::size_t end = MOST_SOURCE;
+    while (end > 0 && Continues(rest[end]))
+        --end;
+    return {rest.substr(0, end), begin, true};
+}
+
 /// Writes the members of a JSON object, a comma between them.
 class JsonObject {
 public:
@@ -106,6 +130,15 @@ std::string JsonString(std::string_view text) {
 Reporter::Reporter(std::ostream &destination, ReportStyle style)
     : output(destination), reportStyle(style) {}
 
+void SetSource(Diagnostic &diagnostic, std::string_view line) {
+    if (diagnostic.place.column == 0)
+        return;
+    Window const window = WindowOf(line, diagnostic.place.column);
+    diagnostic.source = window.text;
+    diagnostic.sourceBegin = window.begin;
+    diagnostic.sourceGoesOn = window.goesOn;
+}
+
 /// In one piece: standard error is not buffered, and others may write to it.
 void Reporter::Show() {
     output << stream.str();
@@ -114,12 +147,23 @@ void Reporter::Show() {
 }
 
 void Reporter::Report(Diagnostic const &diagnostic) {
+    Put(diagnostic);
+    Show();
+}
+
+void Reporter::ReportNext(Diagnostic const &diagnostic) {
+    constexpr int ENOUGH = 32 * 1024;
+    Put(diagnostic);
+    if (stream.tellp() > ENOUGH)
+        Show();
+}
+
+void Reporter::Put(Diagnostic const &diagnostic) {
     ++(diagnostic.severity == Severity::ERROR ? errors : warnings);
     if (reportStyle.format == ReportStyle::JSON)
         ReportJson(diagnostic);
     else
         ReportText(diagnostic);
-    Show();
 }
 
 void Reporter::ReportText(Diagnostic const &diagnostic) {
@@ -149,30 +193,19 @@ void Reporter::ReportText(Diagnostic const &diagnostic) {
     }
 }
 
-/// The line and, below it, a caret under what is to blame. Of a long line only the part around the
-/// caret is shown.
+/// The line and, below it, a caret under what is to blame.
 void Reporter::ReportSource(Diagnostic const &diagnostic, char const *colour, char const *plain) {
     if (diagnostic.place.column == 0 || diagnostic.source.empty())
         return;
-    std::string_view source = diagnostic.source;
-    std::size_t at = std::min<std::size_t>(diagnostic.place.column - 1, source.size());
-    bool const clipFront = source.size() > MOST_SOURCE && at > SOURCE_BEFORE;
-    if (clipFront) {
-        std::size_t cut = at - SOURCE_BEFORE;
-        while (cut < at && Continues(source[cut]))
-            ++cut;
-        source.remove_prefix(cut);
-        at -= cut;
-    }
-    bool const clipBack = source.size() > MOST_SOURCE;
-    if (clipBack) {
-        std::size_t end = MOST_SOURCE;
-        while (end > 0 && Continues(source[end]))
-            --end;
-        source = source.substr(0, end);
-    }
+    bool const isPart = diagnostic.sourceBegin > 0 || diagnostic.sourceGoesOn;
+    auto const [source, begin, goesOn] =
+        isPart ? Window{diagnostic.source, diagnostic.sourceBegin, diagnostic.sourceGoesOn}
+               : WindowOf(diagnostic.source, diagnostic.place.column);
+    std::size_t const at =
+        std::min<std::size_t>(diagnostic.place.column - 1 - begin, source.size());
+    bool const clipFront = begin > 0;
     std::size_t const marked = CharactersIn(source.substr(at, diagnostic.place.length));
-    stream << "  " << (clipFront ? CLIPPED : "") << Harmless(source) << (clipBack ? CLIPPED : "")
+    stream << "  " << (clipFront ? CLIPPED : "") << Harmless(source) << (goesOn ? CLIPPED : "")
            << '\n'
            << std::string(2 + (clipFront ? sizeof CLIPPED - 1 : 0) +
                               CharactersIn(source.substr(0, at)),

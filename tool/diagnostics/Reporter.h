@@ -22,8 +22,13 @@ class Reporter {
 public:
     /// The stream is not owned.
     Reporter(std::ostream &destination, ReportStyle style);
+    Reporter(Reporter const &) = delete;
+    Reporter &operator=(Reporter const &) = delete;
+    ~Reporter() { Show(); }
 
     void Report(Diagnostic const &diagnostic);
+    /// The same for one of many, which may be shown together with those that follow.
+    void ReportNext(Diagnostic const &diagnostic);
     /// How many there were, on a line of its own.
     void ReportCount();
     unsigned long GetErrorCount() const { return errors; }
@@ -34,6 +39,7 @@ private:
     void ReportSource(Diagnostic const &diagnostic, char const *colour, char const *plain);
     void ReportJson(Diagnostic const &diagnostic);
 
+    void Put(Diagnostic const &diagnostic);
     void Show();
 
     std::ostream &output;
@@ -42,6 +48,9 @@ private:
     unsigned long errors = 0;
     unsigned long warnings = 0;
 };
+
+/// Gives a diagnostic as much of the line of its place as is shown.
+void SetSource(Diagnostic &diagnostic, std::string_view line);
 
 /// Text as a JSON string, with its quotes. Bytes that are no UTF-8 become U+FFFD.
 std::string JsonString(std::string_view text);

@@ -33,7 +33,22 @@ std::string Alternatives(std::vector<std::string_view> const &words) {
     return text;
 }
 
-std::string Quoted(std::string_view text) { return '"' + std::string(text) + '"'; }
+std::string Quoted(std::string_view text) { return '"' + Shortened(text) + '"'; }
+
+std::string Shortened(std::string_view text) {
+    constexpr std::size_t MOST = 160;
+    constexpr std::size_t PART = 78; // in front of the dots and behind them
+    if (text.size() <= MOST)
+        return std::string(text);
+    auto const continues = [](char c) { return (static_cast<unsigned char>(c) & 0xC0) == 0x80; };
+    std::size_t front = PART;
+    std::size_t back = text.size() - PART;
+    while (front > 0 && continues(text[front]))
+        --front;
+    while (back < text.size() && continues(text[back]))
+        ++back;
+    return std::string(text.substr(0, front)).append("...").append(text.substr(back));
+}
 
 std::vector<std::string> WordsOf(std::string_view text) {
     std::vector<std::string> words;

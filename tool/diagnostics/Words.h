@@ -10,7 +10,11 @@
 
 bool SameIgnoringCase(std::string_view left, std::string_view right);
 std::string Lowercase(std::string_view text);
+/// In quotes; of a very long text the beginning and the end, so that a message stays one to read
+/// and many messages about one long name do not grow beyond all bounds.
 std::string Quoted(std::string_view text);
+/// What `Quoted` puts between the quotes.
+std::string Shortened(std::string_view text);
 /// The words between blanks.
 std::vector<std::string> WordsOf(std::string_view text);
 /// "A, B or C"

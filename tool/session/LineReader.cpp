@@ -2,7 +2,9 @@
 
 #include <cerrno>
 #include <fcntl.h>
+#include <sys/stat.h>
 #include <unistd.h>
+#include <utility>
 
 namespace {
 
@@ -12,15 +14,23 @@ constexpr std::size_t BLOCK = 64 * 1024;
 
 LineReader::LineReader(std::string const &path)
     : descriptor(path == "-" ? STDIN_FILENO : ::open(path.c_str(), O_RDONLY | O_CLOEXEC)),
-      error(descriptor < 0 ? errno : 0), position(0) {}
+      error(descriptor < 0 ? errno : 0) {}
+
+LineReader::LineReader(int ownDescriptor, std::string text)
+    : descriptor(ownDescriptor), error(0), block(std::move(text)) {}
 
 LineReader::~LineReader() {
     if (descriptor > STDIN_FILENO)
         ::close(descriptor);
 }
 
+bool LineReader::CanReadAgain(std::string const &path) {
+    struct stat status = {};
+    return path != "-" && ::stat(path.c_str(), &status) == 0 && S_ISREG(status.st_mode);
+}
+
 bool LineReader::Fill() {
-    if (error != 0)
+    if (error != 0 || descriptor < 0)
         return false;
     block.resize(BLOCK);
     position = 0;

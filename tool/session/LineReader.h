@@ -8,9 +8,15 @@ class LineReader {
 public:
     /// Opens a file, or standard input for "-".
     explicit LineReader(std::string const &path);
+    /// Reads a text, then from a descriptor on, which becomes the reader's; -1 for none.
+    LineReader(int ownDescriptor, std::string text);
     ~LineReader();
     LineReader(LineReader const &) = delete;
     LineReader &operator=(LineReader const &) = delete;
+
+    /// Whether a path names a file that gives the same lines whenever it is read: no standard
+    /// input, no pipe, no device.
+    static bool CanReadAgain(std::string const &path);
 
     /// The next line without its end, "\n" or "\r\n". False at the end and after an error.
     bool Next(std::string &line);
@@ -23,5 +29,5 @@ private:
     int descriptor;
     int error;
     std::string block;
-    std::size_t position;
+    std::size_t position = 0;
 };

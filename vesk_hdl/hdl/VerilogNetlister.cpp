@@ -1,6 +1,7 @@
 #include "vesk_hdl/hdl/VerilogNetlister.h"
 
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 #include "vesk_hdl/hdl/HdlUtilities.h"
@@ -119,6 +120,28 @@ bool IsDeclaredWire(Signal const &signal) {
 } // namespace
 
 namespace Vesk_Hdl {
+
+/// The attributes of a component that may be written at its instances. They are collected once: a
+/// component may have many that are never written, and as many instances.
+struct VerilogNetlister::ComponentAttrs {
+    PtrArray<Attribute *> synthesis; ///< of each name the first, if it is written
+    PtrArray<Attribute *> generics;  ///< and INIT, which a macro hands on in any case
+
+    explicit ComponentAttrs(Component const *component) {
+        if (!component || !component->HasAttrs())
+            return;
+        IStringPtrMap<Attribute *> names;
+        ForEach(component->GetAttrIterator(), [&](Attribute *attr) {
+            bool const isFirst = !names.Contains(attr->GetNameRef());
+            if (isFirst)
+                names.Add(attr->GetNameRef(), attr);
+            if (isFirst && attr->IsSynAssigned())
+                synthesis.Add(attr);
+            if (attr->IsGenericSyn() || attr->IsGenericNoSyn() || attr->GetNameRef() == "INIT")
+                generics.Add(attr);
+        });
+    }
+};
 
 VerilogNetlister::VerilogNetlister(OutStream &out)
     : statements(std::make_unique<VerilogStatements>(out)), stream(&out) {}
@@ -307,11 +330,18 @@ void VerilogNetlister::WriteSignalAssignments(Iterator<Signal *> const &signals)
 
 void VerilogNetlister::WriteInstances(Iterator<Instance *> const &instances,
                                       HdlOptions const &options) {
+    std::unordered_map<Component const *, ComponentAttrs> attrs;
+    ComponentAttrs const none(nullptr);
     ForEachAhead(instances, [&](Instance const *instance) {
         if (!WriteInstance(instance, options))
             return;
-        EndWithAttrs(options, [&] { WriteSynthesisAttr(instance, options); });
-        WriteDefParam(instance, options);
+        Component const *const component = instance->GetComponent();
+        ComponentAttrs const &inherited =
+            component && component->HasAttrs()
+                ? attrs.try_emplace(component, component).first->second
+                : none;
+        EndWithAttrs(options, [&] { WriteSynthesisAttr(instance, inherited, options); });
+        WriteDefParam(instance, inherited, options);
     });
 }
 
@@ -345,23 +375,20 @@ void VerilogNetlister::WriteSynthesisAttr(Signal const *signal, HdlOptions const
 }
 
 /// The instance's attributes, then those of its component that it does not have itself.
-void VerilogNetlister::WriteSynthesisAttr(Instance const *instance, HdlOptions const &options) {
-    if (!instance)
-        return;
+void VerilogNetlister::WriteSynthesisAttr(Instance const *instance, ComponentAttrs const &inherited,
+                                          HdlOptions const &options) {
     PtrArray<Attribute *> merged;
     IStringPtrMap<Attribute *> names;
-    auto const add = [&](Attribute *attr) {
-        merged.Add(attr);
-        names.Add(attr->GetNameRef(), attr);
-    };
     if (instance->HasAttrs())
-        ForEach(instance->GetAttrIterator(), add);
-    Component const *const component = instance->GetComponent();
-    if (component && component->HasAttrs())
-        ForEach(component->GetAttrIterator(), [&](Attribute *attr) {
-            if (!names.Contains(attr->GetNameRef()))
-                add(attr);
+        ForEach(instance->GetAttrIterator(), [&](Attribute *attr) {
+            merged.Add(attr);
+            if (!inherited.synthesis.IsEmpty())
+                names.Add(attr->GetNameRef(), attr);
         });
+    ForEach(inherited.synthesis, [&](Attribute *attr) {
+        if (!names.Contains(attr->GetNameRef()))
+            merged.Add(attr);
+    });
     if (!merged.IsEmpty())
         WriteSynthesisAttr(Iterator<Attribute *>(&merged), instance->GetNameRef(), options);
 }
@@ -387,8 +414,9 @@ void VerilogNetlister::WriteSynthesisAttr(Iterator<Attribute *> const &attrs, ch
 /// The instance's generics, then those of its component that it does not have itself. In a macro
 /// INIT is handed on instead of set. It is left out of the lines for synthesis but not of those
 /// between the translate marks: meant so.
-void VerilogNetlister::WriteDefParam(Instance const *instance, HdlOptions const &options) {
-    if (!instance)
+void VerilogNetlister::WriteDefParam(Instance const *instance, ComponentAttrs const &inherited,
+                                     HdlOptions const &options) {
+    if (!instance->HasAttrs() && inherited.generics.IsEmpty())
         return;
     bool const macro = options.macroNetlist;
     Attribute const *init = nullptr;
@@ -407,20 +435,17 @@ void VerilogNetlister::WriteDefParam(Instance const *instance, HdlOptions const 
         Iterator<Attribute *> attrs = instance->GetAttrIterator();
         GetGenericAttrs(attrs, syn, nosyn);
         ForEach(attrs, [&](Attribute *attr) {
-            if (!isInit(attr))
+            if (!isInit(attr) && !inherited.generics.IsEmpty())
                 names.Add(attr->GetNameRef(), attr);
         });
     }
-    Component const *const component = instance->GetComponent();
-    if (component && component->HasAttrs()) {
-        PtrArray<Attribute *> kept;
-        ForEach(component->GetAttrIterator(), [&](Attribute *attr) {
-            if (!names.Contains(attr->GetNameRef()) && !isInit(attr))
-                kept.Add(attr);
-        });
-        Iterator<Attribute *> attrs(&kept);
-        GetGenericAttrs(attrs, syn, nosyn);
-    }
+    PtrArray<Attribute *> kept;
+    ForEach(inherited.generics, [&](Attribute *attr) {
+        if (!names.Contains(attr->GetNameRef()) && !isInit(attr))
+            kept.Add(attr);
+    });
+    Iterator<Attribute *> keptAttrs(&kept);
+    GetGenericAttrs(keptAttrs, syn, nosyn);
 
     Text const &name = instance->GetNameRef();
     if (init) {

@@ -27,6 +27,8 @@ public:
     void WriteNetlist(Netlist *netlist, HdlOptions const &options);
 
 private:
+    struct ComponentAttrs;
+
     void SetNameCase(Netlist *netlist, HdlOptions const &options);
     void SetNameCase(Object *object, bool upper);
     bool InitDefined(Netlist const *netlist);
@@ -44,10 +46,12 @@ private:
     void WriteInstances(Iterator<Instance *> const &instances, HdlOptions const &options);
     bool WriteInstance(Instance const *instance, HdlOptions const &options);
     void WriteSynthesisAttr(Signal const *signal, HdlOptions const &options);
-    void WriteSynthesisAttr(Instance const *instance, HdlOptions const &options);
+    void WriteSynthesisAttr(Instance const *instance, ComponentAttrs const &inherited,
+                            HdlOptions const &options);
     void WriteSynthesisAttr(Iterator<Attribute *> const &attrs, char const *target,
                             HdlOptions const &options);
-    void WriteDefParam(Instance const *instance, HdlOptions const &options);
+    void WriteDefParam(Instance const *instance, ComponentAttrs const &inherited,
+                       HdlOptions const &options);
     template <class WriteAttrs> void EndWithAttrs(HdlOptions const &options, WriteAttrs writeAttrs);
     template <class WriteItem>
     void WriteGenerics(PtrArray<Attribute *> const &syn, PtrArray<Attribute *> const &nosyn,

@@ -178,8 +178,12 @@ void VhdlNetlister::WriteAttrDeclarations(PtrArray<Signal *> const &signals,
     bool const useAttrType = options->vhdlOption.useAttrType;
     auto const forEachHolder = [&](auto act) {
         ForEachAhead(signals, act);
-        ForEachAhead(telling, [&act](Instance const *instance) {
-            act(instance->GetComponent());
+        // A component declares nothing more at its later instances.
+        std::unordered_set<Component const *> seen;
+        ForEachAhead(telling, [&](Instance const *instance) {
+            Component const *const component = instance->GetComponent();
+            if (component && component->HasAttrs() && seen.insert(component).second)
+                act(component);
             act(instance);
         });
     };

@@ -3,9 +3,10 @@
 
 What the tool finds has to be what a case says, and nothing in its clean design. Both are written,
 and independent readers have to refuse of the first exactly the languages that the case says, of the
-second none: GHDL reads VHDL-93, Icarus and Verilator read Verilog. A case may instead tell, by
-regular expressions, what wrong text is there. The head of a case is `### CHECK`, then, behind
-semicolons, `alone` (without prelude.cmd), `refused LANGUAGE...`, `shows LANGUAGE EXPRESSION`.
+second none: GHDL reads VHDL-93, Icarus and Verilator read Verilog. A case may instead say, by
+regular expressions, what wrong text is there. The head of a case is `### CHECK`, then, separated by
+semicolons, `alone` (without prelude.cmd), `refused LANGUAGE...`, `shows LANGUAGE EXPRESSION`. A
+backslash, x and two digits in its commands are the character of that number.
 """
 
 import concurrent.futures
@@ -29,31 +30,45 @@ def run(folder, *command):
     return subprocess.run(command, cwd=folder, capture_output=True, text=True, errors="replace")
 
 
+def ports_of(component, commands):
+    return dict((port[0], port[1:]) for port in re.findall(
+        rf"^ADD PIN {component} (\w+)(?:[(\[](\d+)(?::(\d+))?[)\]])? (\w)", commands, re.M))
+
+
 def stubs(commands):
-    """A module for each component, with the parameters that the design knows."""
+    """A module for each component, with the parameters that the design knows; an entity with a
+    configuration."""
     parameters = sorted(set(re.findall(r"ATTRIBUTE (?:BUF|keep) (?:-TYPE=\w+ )?(\w+)", commands)))
-    text = ""
+    verilog, vhdl = "", ""
     for name in re.findall(r"^ADD COMPONENT (\w+)$", commands, re.M):
-        ports = {}
-        for base, left, right, direction in re.findall(
-            rf"^ADD PIN {name} (\w+)(?:[(\[](\d+)(?::(\d+))?[)\]])? (\w+)", commands, re.M):
+        ports, entity = [], []
+        for base, (left, right, way) in ports_of(name, commands).items():
             bounds = f"[{left}:{right or 0}] " if left else ""
-            word = {"i": "input", "o": "output", "b": "inout"}[direction[0]]
-            ports[base] = f"{word} {bounds}{base}"
-        text += f"module {name}({', '.join(ports.values())});\n"
-        text += "".join(f"parameter {p} = 0;\n" for p in parameters) + "endmodule\n"
-    return text
+            ports.append(f"{dict(i='input', o='output', b='inout')[way]} {bounds}{base}")
+            entity.append(f"{base} : {dict(i='in', o='out', b='inout')[way]} std_logic" + (
+                f"_vector({left} downto {right or 0})" if left else ""))
+        verilog += f"module {name}({', '.join(ports)});\n"
+        verilog += "".join(f"parameter {p} = 0;\n" for p in parameters) + "endmodule\n"
+        if name != "work":
+            vhdl += (f"library ieee; use ieee.std_logic_1164.all; entity {name} is "
+                     f"{'port (' * bool(entity)}{'; '.join(entity)}{');' * bool(entity)} end;\n"
+                     f"architecture a of {name} is begin end;\n"
+                     f"configuration CFG_{name} of {name} is for a end for; end;\n")
+    return verilog, vhdl
 
 
 def accepts(folder, language, commands):
     """Whether the readers take a written file, and what they say."""
     top = re.findall(r"^SET NETLIST NAME (\S+)", commands, re.M)[-1]
+    verilog, vhdl = stubs(commands)
     if language == "vhdl":
+        (folder / "stubs.vhd").write_text(vhdl)
+        files = ["stubs.vhd"] * ("CONFIGURATION false" in commands) + ["out.vhd"]
         steps = [["ghdl", "-a", "--std=93", "--work=KORBAL", KELEMENTS],
-                 ["ghdl", "-a", "--std=93", "out.vhd"],
-                 ["ghdl", "-r", "--std=93", "-Wno-binding", top, "--stop-time=0ns"]]
+                 ["ghdl", "-a", "--std=93", "--ieee=synopsys", *files],
+                 ["ghdl", "-r", "--std=93", "--ieee=synopsys", "-Wno-binding", top, "--stop-time=0ns"]]
     else:
-        (folder / "stubs.v").write_text(stubs(commands))
+        (folder / "stubs.v").write_text(verilog)
         steps = [["iverilog", "-t", "null", "-s", top, "out.v", "stubs.v"],
                  ["verilator", "--lint-only", "-Wno-lint", "-Wno-style", "-Wno-fatal",
                   "--top-module", top, "-v", "stubs.v", "out.v"]]
@@ -71,8 +86,13 @@ def findings(folder, *arguments):
 
 def check(folder, check_name, *files):
     off = [] if check_name == "unused-component" else ["--off", "unused-component"]
-    return [(one["file"], f"{one['line']}:{one['column']} {one.get('finding', one['message'])} "
-             + one.get("language", "")) for one in findings(folder, *off, *files)]
+    found = []
+    for one in findings(folder, *off, *files):
+        notes = [str(note) for note in one.get("notes", [])]
+        found.append((one["file"], f"{one['line']}:{one['column']} "
+                      f"{one.get('finding', one['message'])} {one.get('language', '')}"
+                      + " with a note twice" * (len(notes) > len(set(notes)))))
+    return found
 
 
 def judge(case):
@@ -81,6 +101,8 @@ def judge(case):
     trips, finds, clean = re.split(r"^--- (?:finds|clean)\n", body, flags=re.M)
     name, *settings = [part.strip() for part in head.replace(";;", "\0").split(";")]
     settings = [part.replace("\0", ";") for part in settings]
+    trips, clean = (re.sub(r"\\x([0-9A-F]{2})", lambda code: chr(int(code[1], 16)), text)
+                    for text in (trips, clean))
     alone = "alone" in settings
     refused = [w for s in settings if s.startswith("refused ") for w in s.split()[1:]]
     shows = [s.split(" ", 2)[1:] for s in settings if s.startswith("shows ")]

@@ -1,6 +1,6 @@
 // Attributes: whether what they need is declared, and whether their values make whole strings.
 
-#include <unordered_map>
+#include <map>
 
 #include "tool/check/Attributes.h"
 #include "tool/check/Digits.h"
@@ -313,8 +313,8 @@ private:
 
     Design const &design;
     bool useAttrType;
-    std::unordered_map<std::string, Attribute const *> declared; ///< by name, the first
-    std::unordered_map<std::string, Attribute const *> declaredByPorts;
+    std::map<std::string, Attribute const *> declared; ///< by name, the first
+    std::map<std::string, Attribute const *> declaredByPorts;
 };
 
 /// In a macro the INIT of an instance is handed on, and one of option NOSYN is written as well.

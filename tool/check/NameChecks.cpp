@@ -1,5 +1,6 @@
 // Names: whether the languages take them, and whether two of them meet.
 
+#include <set>
 #include <unordered_set>
 
 #include "tool/check/Attributes.h"
@@ -243,9 +244,9 @@ private:
     }
 
     Design const &design;
-    std::unordered_set<std::string> pinTypes;
-    std::unordered_set<std::string> innerTypes; ///< of the architecture
-    std::unordered_set<std::string> outerTypes; ///< of the entity
+    std::set<std::string> pinTypes;
+    std::set<std::string> innerTypes; ///< of the architecture
+    std::set<std::string> outerTypes; ///< of the entity
 };
 
 /// Names that meet although the library took both.

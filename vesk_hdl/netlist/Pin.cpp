@@ -11,7 +11,7 @@
 #include "vesk_hdl/netlist/ObjectRecord.h"
 #include "vesk_hdl/netlist/Signal.h"
 #include "vesk_hdl/text/LentPtrArray.h"
-#include "vesk_hdl/text/StringTable.h"
+#include "vesk_hdl/text/TextIndex.h"
 #include "vesk_hdl/text/basis/Ascii.h"
 
 namespace Vesk_Hdl {
@@ -44,21 +44,20 @@ public:
 
     void Add(StringBase<char> const &name, int position) {
         isUnique = isUnique && !table.Find(name.View());
-        table.GrowForOneMore();
         // NOLINTNEXTLINE(performance-no-int-to-ptr): a small number in the slot of a pointer
         void *const value = reinterpret_cast<void *>(static_cast<std::uintptr_t>(position));
         if (isUnique)
-            table.Insert(name, value);
+            table.Put(name, value);
     }
     bool IsUsable() const { return isUnique && !somePinHasChanged; }
     /// -1 when absent.
     int Find(std::string_view name) const {
-        StringTable::Node const *const node = table.Find(name);
+        TextIndex::Node const *const node = table.Find(name);
         return node ? static_cast<int>(reinterpret_cast<std::uintptr_t>(node->value)) : -1;
     }
 
 private:
-    StringTable table{StringTable::CASE_IGNORED, FEWEST_PINS};
+    TextIndex table{TextIndex::CASE_IGNORED};
     bool isUnique = true;
 };
 

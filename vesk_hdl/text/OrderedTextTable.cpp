@@ -68,7 +68,7 @@ void OrderedTextTable::Rebuild(std::uint32_t newCount) {
     std::vector<std::uint32_t> old(newCount, NONE);
     old.swap(buckets);
     bucketCount = newCount;
-    emptyBuckets = 0;
+    lowestBucket = 0;
     std::uint32_t longest = 0;
     for (std::uint32_t number : old)
         while (number != NONE) {
@@ -131,7 +131,7 @@ void OrderedTextTable::Add(Basis::StringBase<char> const &key) {
     if (node.next != NONE)
         nodes[node.next].previous = number;
     place = number;
-    emptyBuckets = std::min(emptyBuckets, bucket);
+    lowestBucket = std::min(lowestBucket, bucket);
     ++count;
 }
 
@@ -173,9 +173,9 @@ OrderedTextTable::Node const *OrderedTextTable::FirstFrom(std::uint32_t bucket) 
 }
 
 OrderedTextTable::Node const *OrderedTextTable::GetFirst() {
-    while (emptyBuckets < buckets.size() && buckets[emptyBuckets] == NONE)
-        ++emptyBuckets;
-    return FirstFrom(emptyBuckets);
+    while (lowestBucket < buckets.size() && buckets[lowestBucket] == NONE)
+        ++lowestBucket;
+    return FirstFrom(lowestBucket);
 }
 
 OrderedTextTable::Node const *OrderedTextTable::GetNext(Node const *node) const {

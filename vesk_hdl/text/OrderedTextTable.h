@@ -64,7 +64,7 @@ private:
     Node const *FirstFrom(std::uint32_t bucket) const;
 
     std::uint32_t bucketCount;
-    std::uint32_t emptyBuckets = 0; ///< no bucket before this one holds a text
+    std::uint32_t lowestBucket = 0; ///< no bucket before this one holds a text
     std::size_t count = 0;
     std::vector<std::uint32_t> buckets; ///< numbers of nodes; empty until the first text
     std::deque<Node> nodes;

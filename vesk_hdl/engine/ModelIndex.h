@@ -1,10 +1,8 @@
 #pragma once
 
-#include <string>
-#include <unordered_map>
-
 #include "vesk_hdl/model/HdlModel.h"
 #include "vesk_hdl/netlist/NetlistEdit.h"
+#include "vesk_hdl/text/TextIndex.h"
 #include "vesk_hdl/text/basis/Ascii.h"
 
 namespace Vesk_Hdl {
@@ -18,24 +16,25 @@ public:
         Basis::StringBase<char> const wanted(name);
         if (models.GetSize() <= MAX_WALK) {
             for (int i = 0; i < models.GetSize(); ++i)
-                if (Basis::Ascii::EqualIgnoringCase(NameOf(*models.GetAt(i)), wanted.View()))
+                if (Basis::Ascii::EqualIgnoringCase(NameOf(*models.GetAt(i)).View(), wanted.View()))
                     return models.GetAt(i);
             return nullptr;
         }
         if (indexedRenames != renames)
             MakeAnew(models);
-        auto const found = index.find(Fold(wanted.View()));
-        return found == index.end() ? nullptr : found->second;
+        TextIndex::Node const *const found = index.Find(wanted.View());
+        return found ? static_cast<Model *>(found->value) : nullptr;
     }
+    /// A model of a name that no other has.
     void Add(Model &model) {
         NetlistEdit(*model.GetNetlist()).CountRenames(renames);
-        index.try_emplace(Fold(NameOf(model)), &model);
+        index.Put(NameOf(model), &model);
     }
     /// A model that is going to be deleted. Another one of its name may be found instead.
     void Remove(Model const &model) {
-        auto const found = index.find(Fold(NameOf(model)));
-        if (found != index.end() && found->second == &model && !hasEqualNames)
-            index.erase(found);
+        TextIndex::Node const *const found = index.Find(NameOf(model).View());
+        if (found && found->value == &model && !hasEqualNames)
+            index.Remove(NameOf(model).View());
         else
             ++renames;
     }
@@ -43,24 +42,23 @@ public:
 private:
     static constexpr int MAX_WALK = 8; ///< a walk over fewer models is as fast
 
-    static std::string_view NameOf(Model const &model) {
-        return model.GetNetlist()->GetNameRef().View();
-    }
-    static std::string Fold(std::string_view name) {
-        std::string folded(name);
-        for (char &c : folded)
-            c = Basis::Ascii::ToUpper(c);
-        return folded;
+    static Basis::StringBase<char> const &NameOf(Model const &model) {
+        return model.GetNetlist()->GetNameRef();
     }
     void MakeAnew(PtrArray<Model *> const &models) {
-        index.clear();
+        index.Empty();
         hasEqualNames = false;
-        for (int i = 0; i < models.GetSize(); ++i)
-            hasEqualNames |= !index.try_emplace(Fold(NameOf(*models.GetAt(i))), models.GetAt(i)).second;
+        for (int i = 0; i < models.GetSize(); ++i) {
+            Basis::StringBase<char> const &name = NameOf(*models.GetAt(i));
+            if (index.Find(name.View()))
+                hasEqualNames = true; // the first of them is the one that is found
+            else
+                index.Put(name, models.GetAt(i));
+        }
         indexedRenames = renames;
     }
 
-    std::unordered_map<std::string, Model *> index;
+    TextIndex index{TextIndex::CASE_IGNORED};
     unsigned long renames = 0;        ///< of all models so far
     unsigned long indexedRenames = 0; ///< when the index was made
     bool hasEqualNames = false;       ///< only clients give two models one name

@@ -4,7 +4,7 @@
 #include <unordered_map>
 
 #include "vesk_hdl/netlist/Names.h"
-#include "vesk_hdl/text/StringTable.h"
+#include "vesk_hdl/text/TextIndex.h"
 
 namespace Vesk_Hdl {
 
@@ -13,7 +13,7 @@ namespace Vesk_Hdl {
 template <class T> class NameTable {
 public:
     T *Get(Names::Key const &key) const {
-        StringTable::Node const *const node = table.Find(key.View(), key.GetHash());
+        TextIndex::Node const *const node = table.Find(key.View(), key.GetHash());
         return node ? static_cast<T *>(node->value) : nullptr;
     }
 
@@ -21,13 +21,7 @@ public:
     void Add(Basis::StringBase<char> const &name, T *object) {
         if (formerNames)
             formerNames->emplace(object, name);
-        std::uint32_t const hash = StringTable::HashIgnoringCase(name.View());
-        if (StringTable::Node *const node = table.Find(name.View(), hash)) {
-            node->value = object;
-            return;
-        }
-        table.GrowForOneMore();
-        table.Insert(name, hash, object);
+        table.Put(name, object);
     }
 
     /// The object is about to be destroyed, and nothing finds it any more: its former names are of
@@ -40,7 +34,7 @@ public:
     /// Takes away what the name finds, and the object: if it was renamed since it was added, it is
     /// still found by its former name, and nobody must find what is gone.
     void Remove(Basis::StringBase<char> const &name, T const *object) {
-        StringTable::Node const *const found = table.Find(name.View());
+        TextIndex::Node const *const found = table.Find(name.View());
         bool const isFiledSo = found && found->value == object;
         table.Remove(name.View());
         if (isFiledSo && !formerNames)
@@ -49,7 +43,7 @@ public:
             FindFormerNames();
         auto const [begin, end] = formerNames->equal_range(object);
         for (auto former = begin; former != end; ++former) {
-            StringTable::Node const *const node = table.Find(former->second.View());
+            TextIndex::Node const *const node = table.Find(former->second.View());
             if (node && node->value == object)
                 table.Remove(former->second.View());
         }
@@ -61,13 +55,13 @@ private:
 
     void FindFormerNames() {
         auto found = std::make_unique<FormerNames>();
-        for (StringTable::Node const *node = table.GetFirst(); node; node = table.GetNext(node))
-            found->emplace(node->value, node->key);
+        for (TextIndex::Node const &node : table)
+            found->emplace(node.value, node.key);
         formerNames = std::move(found);
     }
 
     std::unique_ptr<FormerNames> formerNames; ///< null until somebody removes a renamed object
-    StringTable table{StringTable::CASE_IGNORED, 7, StringTable::ORDER_FREE};
+    TextIndex table{TextIndex::CASE_IGNORED};
 };
 
 } // namespace Vesk_Hdl

@@ -19,20 +19,14 @@ namespace {
 
 constexpr std::string_view::size_type NPOS = std::string_view::npos;
 
-constexpr char REWRITTEN = '\0'; ///< no name holds it
-
-/// What a character adds to the hash of a name, or REWRITTEN.
-constexpr std::array<char, 256> FoldAndMark() {
-    std::array<char, 256> folded = {};
-    for (unsigned int c = 0; c < folded.size(); ++c)
-        folded[c] = ToUpper(static_cast<char>(c));
+constexpr std::array<bool, 256> FindNormalCharacters() {
+    std::array<bool, 256> isNormal = {};
+    isNormal.fill(true);
     for (unsigned char const c : {'[', ']', '{', '}', '<', '>', '-'})
-        folded[c] = REWRITTEN;
-    return folded;
+        isNormal[c] = false;
+    return isNormal;
 }
-constexpr std::array<char, 256> FOLDED = FoldAndMark();
-
-char Folded(char c) { return FOLDED[static_cast<unsigned char>(c)]; }
+constexpr std::array<bool, 256> IS_NORMAL = FindNormalCharacters();
 
 bool IsMember(std::string_view token) {
     std::string_view base;
@@ -192,15 +186,8 @@ StringBase<char> BusName(std::string_view base, std::string_view left, std::stri
 bool IsNormal(std::string_view name) {
     bool isNormal = true;
     for (char const c : name)
-        isNormal &= Folded(c) != REWRITTEN;
+        isNormal &= IS_NORMAL[static_cast<unsigned char>(c)];
     return isNormal;
-}
-
-Key::Scan::Scan(std::string_view name) {
-    for (char const c : name) {
-        isNormal &= Folded(c) != REWRITTEN;
-        hash = StringTable::AddToHash(hash, Folded(c));
-    }
 }
 
 void Normalize(StringBase<char> &name) {

@@ -2,7 +2,7 @@
 
 #include <string_view>
 
-#include "vesk_hdl/text/StringTable.h"
+#include "vesk_hdl/text/SeededHash.h"
 #include "vesk_hdl/text/basis/StringBase.h"
 
 /// The grammar of names, in one place and free of all classes. Everything here but the rewriting
@@ -88,19 +88,16 @@ Basis::StringBase<char> PinSignalBase(std::string_view instance, std::string_vie
 class NormalName {
 public:
     explicit NormalName(char const *name) : NormalName(std::string_view(name ? name : "")) {}
-    explicit NormalName(std::string_view name) : NormalName(name, IsNormal(name)) {}
-    NormalName(NormalName const &) = delete;
-    NormalName &operator=(NormalName const &) = delete;
-    std::string_view View() const { return view; }
-
-protected:
-    NormalName(std::string_view name, bool isNormal) : view(name) {
-        if (isNormal)
+    explicit NormalName(std::string_view name) : view(name) {
+        if (IsNormal(name))
             return;
         rewritten = Basis::StringBase<char>(name);
         Normalize(rewritten);
         view = rewritten.View();
     }
+    NormalName(NormalName const &) = delete;
+    NormalName &operator=(NormalName const &) = delete;
+    std::string_view View() const { return view; }
 
 private:
     Basis::StringBase<char> rewritten;
@@ -111,20 +108,10 @@ private:
 class Key : public NormalName {
 public:
     explicit Key(char const *name) : Key(std::string_view(name ? name : "")) {}
-    explicit Key(std::string_view name) : Key(name, Scan(name)) {}
+    explicit Key(std::string_view name) : NormalName(name), hash(SeededHashIgnoringCase(View())) {}
     std::uint32_t GetHash() const { return hash; }
 
 private:
-    /// IsNormal and StringTable::HashIgnoringCase in one walk.
-    struct Scan {
-        explicit Scan(std::string_view name);
-        bool isNormal = true;
-        std::uint32_t hash = StringTable::FIRST_HASH;
-    };
-    Key(std::string_view name, Scan const &scan)
-        : NormalName(name, scan.isNormal),
-          hash(scan.isNormal ? scan.hash : StringTable::HashIgnoringCase(View())) {}
-
     std::uint32_t hash;
 };
 

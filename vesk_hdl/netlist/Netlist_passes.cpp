@@ -4,14 +4,13 @@
 
 #include "vesk_hdl/netlist/Netlist.h"
 
-#include <string>
-#include <unordered_map>
 #include <vector>
 
 #include "vesk_hdl/netlist/As.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/NetlistRecord.h"
 #include "vesk_hdl/text/ForEachAhead.h"
+#include "vesk_hdl/text/SeededHash.h"
 #include "vesk_hdl/text/basis/Ascii.h"
 
 namespace Vesk_Hdl {
@@ -29,19 +28,19 @@ public:
             auto *const compound = As<CompoundBus>(signal);
             for (int i = 0; compound && i < compound->GetSize(); ++i)
                 if (As<ScalarSignal>(compound->GetAt(i)))
-                    places[Fold(compound->GetAt(i)->GetNameRef())].push_back({compound, i});
+                    places[compound->GetAt(i)->GetNameRef().GetText()].push_back({compound, i});
         });
     }
 
     /// Puts `dummy` into every place of a scalar of that name.
     void Replace(StringBase<char> const &name, Signal *dummy) {
-        auto const found = places.find(Fold(name));
+        auto const found = places.find(name.View());
         if (found == places.end())
             return;
         std::vector<Place> const replaced = std::move(found->second);
         places.erase(found);
         // The places now bear the dummy's name, by which a later round may find them again.
-        std::vector<Place> &now = places[Fold(dummy->GetNameRef())];
+        std::vector<Place> &now = places[dummy->GetNameRef().GetText()];
         for (Place const &place : replaced) {
             place.compound->SetAt(place.position, dummy);
             now.push_back(place);
@@ -54,14 +53,7 @@ private:
         int position;
     };
 
-    static std::string Fold(StringBase<char> const &name) {
-        std::string folded(name.View());
-        for (char &c : folded)
-            c = Basis::Ascii::ToUpper(c);
-        return folded;
-    }
-
-    std::unordered_map<std::string, std::vector<Place>> places;
+    FoldedTextMap<std::vector<Place>> places;
 };
 
 void AddNames(PtrArray<Signal *> const &signals, StringSet &names) {

@@ -1,22 +1,14 @@
 #include "vesk_hdl/text/IStringPtrMap.h"
 
-#include "vesk_hdl/text/StringTable.h"
+#include "vesk_hdl/text/TextIndex.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
 
 namespace Vesk_Hdl {
 
 using Basis::ViewOf;
 
-namespace {
-
-/// Nobody sees a map's order, so that it need not begin as large as a set: attributes come with a
-/// map for each owner that has any.
-constexpr std::uint32_t FIRST_BUCKETS = 7;
-
-} // namespace
-
 struct IStringPtrMapBase::Record {
-    StringTable table{StringTable::CASE_IGNORED, FIRST_BUCKETS, StringTable::ORDER_FREE};
+    TextIndex table{TextIndex::CASE_IGNORED};
 };
 
 IStringPtrMapBase::IStringPtrMapBase() : record(nullptr) {}
@@ -33,9 +25,8 @@ IStringPtrMapBase &IStringPtrMapBase::operator=(IStringPtrMapBase &other) {
     Empty();
     if (!other.record)
         return *this;
-    StringTable const &source = other.record->table;
-    for (StringTable::Node const *node = source.GetFirst(); node; node = source.GetNext(node))
-        Add(node->key, node->value);
+    for (TextIndex::Node const &node : other.record->table)
+        Add(node.key, node.value);
     return *this;
 }
 
@@ -46,18 +37,13 @@ void IStringPtrMapBase::Add(char const *key, void *value) {
 void IStringPtrMapBase::Add(Basis::StringBase<char> const &key, void *value) {
     if (!record)
         record = new Record;
-    if (StringTable::Node *const node = record->table.Find(key.View())) {
-        node->value = value;
-        return;
-    }
-    record->table.GrowForOneMore();
-    record->table.Insert(key, value);
+    record->table.Put(key, value);
 }
 
 void *IStringPtrMapBase::Get(char const *key) const { return Get(ViewOf(key)); }
 
 void *IStringPtrMapBase::Get(std::string_view key) const {
-    StringTable::Node const *const node = record ? record->table.Find(key) : nullptr;
+    TextIndex::Node const *const node = record ? record->table.Find(key) : nullptr;
     return node ? node->value : nullptr;
 }
 

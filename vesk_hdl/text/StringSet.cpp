@@ -1,6 +1,7 @@
 #include "vesk_hdl/text/StringSet.h"
 
-#include "vesk_hdl/text/StringTable.h"
+#include "vesk_hdl/text/OrderedTextTable.h"
+#include "vesk_hdl/text/TextIndex.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
 
 namespace Vesk_Hdl {
@@ -14,8 +15,8 @@ constexpr std::uint32_t FIRST_BUCKETS = 100;
 } // namespace
 
 struct StringSetIterator::Cell {
-    StringTable const *table;
-    StringTable::Node const *node; ///< null at the end
+    OrderedTextTable const *table;
+    OrderedTextTable::Node const *node; ///< null at the end
 };
 
 StringSetIterator::StringSetIterator() : cell(nullptr) {}
@@ -56,8 +57,8 @@ Basis::StringBase<char> StringSetIterator::operator*() const {
 }
 
 struct StringSet::Record {
-    StringTable insensitiveTable{StringTable::CASE_IGNORED, FIRST_BUCKETS};
-    StringTable sensitiveTable{StringTable::CASE_EXACT, FIRST_BUCKETS};
+    TextIndex insensitiveTable{TextIndex::CASE_IGNORED}; ///< without values
+    OrderedTextTable sensitiveTable{FIRST_BUCKETS};
 };
 
 StringSet::StringSet() : record(new Record) {}
@@ -68,8 +69,8 @@ StringSet &StringSet::operator=(StringSet &other) {
     if (this == &other)
         return *this;
     record->insensitiveTable.Empty();
-    StringTable const &source = other.record->sensitiveTable;
-    for (StringTable::Node const *node = source.GetFirst(); node; node = source.GetNext(node))
+    OrderedTextTable &source = other.record->sensitiveTable;
+    for (OrderedTextTable::Node const *node = source.GetFirst(); node; node = source.GetNext(node))
         Add(node->key);
     return *this;
 }
@@ -77,13 +78,8 @@ StringSet &StringSet::operator=(StringSet &other) {
 void StringSet::Add(char const *string) { Add(Basis::StringBase<char>(string)); }
 
 void StringSet::Add(Basis::StringBase<char> const &string) {
-    // Both tables grow before anybody asks whether the string is new: an addition that changes
-    // nothing else can still change the order.
-    record->insensitiveTable.GrowForOneMore();
-    record->sensitiveTable.GrowForOneMore();
-    for (StringTable *const table : {&record->insensitiveTable, &record->sensitiveTable})
-        if (!table->Find(string.View()))
-            table->Insert(string, nullptr);
+    record->insensitiveTable.Put(string, nullptr);
+    record->sensitiveTable.Add(string);
 }
 
 bool StringSet::IContains(char const *string) const { return IContains(ViewOf(string)); }
@@ -93,7 +89,7 @@ bool StringSet::IContains(std::string_view string) const {
 }
 
 bool StringSet::Contains(char const *string) const {
-    return record->sensitiveTable.Find(ViewOf(string)) != nullptr;
+    return record->sensitiveTable.Contains(ViewOf(string));
 }
 
 void StringSet::Remove(char const *string) {
@@ -106,7 +102,7 @@ bool StringSet::IsEmpty() const { return record->sensitiveTable.GetCount() == 0;
 void StringSet::Empty() { record->sensitiveTable.Empty(); }
 
 StringSetIterator StringSet::GetBeginPos() {
-    StringTable const &table = record->sensitiveTable;
+    OrderedTextTable &table = record->sensitiveTable;
     return StringSetIterator(new StringSetIterator::Cell{&table, table.GetFirst()});
 }
 

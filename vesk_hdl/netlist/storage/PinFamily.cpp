@@ -61,8 +61,7 @@ void PinFamily::AddPin(PtrArray<Pin *> const &pins) noexcept {
     try {
         int place = size - 1;
         if (!index) {
-            index = std::make_unique<StringTable>(StringTable::CASE_IGNORED, MIN_INDEXED,
-                                                  StringTable::ORDER_FREE);
+            index = std::make_unique<TextIndex>(TextIndex::CASE_IGNORED);
             place = 0;
         }
         for (; place < size; ++place)
@@ -76,15 +75,14 @@ void PinFamily::Index(PtrArray<Pin *> const &pins, int place) {
     Basis::StringBase<char> const &name = pins.GetAt(place)->GetNameRef();
     if (index->Find(name.View()))
         return; // the first pin of a name is the one that is found
-    index->GrowForOneMore();
     // NOLINTNEXTLINE(performance-no-int-to-ptr): a small number in the slot of a pointer
-    index->Insert(name, reinterpret_cast<void *>(static_cast<std::uintptr_t>(place)));
+    index->Put(name, reinterpret_cast<void *>(static_cast<std::uintptr_t>(place)));
 }
 
 int PinFamily::Find(std::string_view name) const {
     if (!index || HasChanged())
         return UNKNOWN;
-    StringTable::Node const *const node = index->Find(name);
+    TextIndex::Node const *const node = index->Find(name);
     return node ? static_cast<int>(reinterpret_cast<std::uintptr_t>(node->value)) : ABSENT;
 }
 

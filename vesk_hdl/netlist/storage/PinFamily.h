@@ -9,7 +9,7 @@
 
 #include "vesk_hdl/netlist/NetlistFwd.h"
 #include "vesk_hdl/text/PtrArray.h"
-#include "vesk_hdl/text/StringTable.h"
+#include "vesk_hdl/text/TextIndex.h"
 
 namespace Vesk_Hdl {
 
@@ -59,7 +59,7 @@ private:
     void Index(PtrArray<Pin *> const &pins, int place);
 
     Component *const component;
-    std::unique_ptr<StringTable> index; ///< from a name to a place; null while there are few pins
+    std::unique_ptr<TextIndex> index; ///< from a name to a place; null while there are few pins
     /// By the number of pins: instances that are older than a pin of the component go without it.
     /// Null for pins of which some are equal.
     std::map<int, std::unique_ptr<Order>> orders;

@@ -1,14 +1,14 @@
+#include "vesk_hdl/text/StringSet.h"
+
 #include <algorithm>
 #include <cstdint>
-#include <map>
+#include <functional>
 #include <utility>
 #include <vector>
 
 #include <gtest/gtest.h>
 
 #include "tests/support/RandomText.h"
-#include "vesk_hdl/text/IStringPtrMap.h"
-#include "vesk_hdl/text/StringSet.h"
 
 using namespace Vesk_Hdl;
 using Strings = std::vector<std::string>;
@@ -16,6 +16,21 @@ using Strings = std::vector<std::string>;
 namespace {
 
 constexpr std::string_view LETTERS = "aAbB_09z\x80\xC4\xE4\xFF";
+
+std::uint32_t HashOf(std::string_view text) {
+    std::uint32_t hash = 5381;
+    for (char const c : text)
+        hash = hash * 33 + static_cast<std::uint32_t>(static_cast<signed char>(c));
+    return hash;
+}
+
+/// "1Z" and "29" hash alike, and so do all names of one length that are made of them.
+std::string CollidingName(unsigned int number, unsigned int pairs) {
+    std::string name;
+    for (unsigned int bit = 0; bit < pairs; ++bit)
+        name += number >> bit & 1U ? "1Z" : "29";
+    return name;
+}
 
 Strings Walk(StringSet &set) {
     Strings strings;
@@ -42,9 +57,7 @@ struct NaiveTable {
             for (auto const &node : std::exchange(nodes, {}))
                 nodes.insert(PlaceOf(node.second), node);
         }
-        std::uint32_t hash = 5381;
-        for (char const c : text)
-            hash = hash * 33 + static_cast<std::uint32_t>(static_cast<signed char>(c));
+        std::uint32_t const hash = HashOf(text);
         auto const place = PlaceOf(hash);
         bool const taken = place != nodes.end() && place->second % buckets == hash % buckets;
         if (std::find(nodes.begin(), nodes.end(), std::pair(text, hash)) == nodes.end())
@@ -62,24 +75,64 @@ struct NaiveTable {
 };
 
 TEST(StringSet, WalksLikeTheNaiveTable) {
-    for (unsigned int const seed : {1, 2, 3}) {
-        std::mt19937 random(seed);
+    struct Case {
+        char const *names;
+        std::function<std::string(std::mt19937 &)> makeName;
+        bool isEmptied = false; ///< halfway; the buckets stay as many as they are
+    };
+    auto const upTo = [](std::size_t longest) {
+        return [=](std::mt19937 &random) { return RandomText(random, LETTERS, longest); };
+    };
+    for (Case const &test : {
+             Case{"short", upTo(3)},
+             Case{"long", upTo(6)},
+             Case{"emptied", upTo(6), true},
+             Case{"one bucket for each length",
+                  [](std::mt19937 &random) {
+                      auto const pairs = static_cast<unsigned int>(random() % 12);
+                      return CollidingName(static_cast<unsigned int>(random()), pairs);
+                  }},
+             Case{"in one bucket once the table has 389",
+                  [](std::mt19937 &random) {
+                      std::string name = RandomText(random, "abc", 7);
+                      while (random() % 4 && HashOf(name) % 389 != 7)
+                          name = RandomText(random, "abc", 7);
+                      return name;
+                  }},
+         }) {
+        SCOPED_TRACE(test.names);
+        std::mt19937 random(1);
         StringSet set;
         NaiveTable naive;
         for (int step = 0; step < 5000; ++step) {
-            std::string const name = RandomText(random, LETTERS, seed == 1 ? 3 : 6);
+            std::string const name = test.makeName(random);
             bool const removes = random() % 8 == 0;
             removes ? set.Remove(name.c_str()) : set.Add(name.c_str());
             removes ? naive.Remove(name) : naive.Add(name);
-            if (step == 2500 && seed == 3) { // the buckets stay as many as they are
+            if (step == 2500 && test.isEmptied) {
                 set.Empty();
                 naive.nodes.clear();
             }
-            SCOPED_TRACE(testing::Message() << "seed " << seed << ", step " << step);
+            SCOPED_TRACE(step);
             if (step % 100 == 99)
                 naive.ExpectSameWalk(set);
         }
     }
+}
+
+/// All in one bucket: a table that walks along it would have this test run for a minute.
+TEST(StringSet, FindsNamesThatWereMadeToCollide) {
+    constexpr unsigned int PAIRS = 16;
+    StringSet set;
+    for (unsigned int i = 0; i < 1U << PAIRS; ++i)
+        set.Add(CollidingName(i, PAIRS).c_str());
+    for (unsigned int i = 0; i < 1U << PAIRS; i += 2)
+        set.Remove(CollidingName(i, PAIRS).c_str());
+    for (unsigned int i = 0; i < 1U << PAIRS; ++i)
+        ASSERT_EQ(set.Contains(CollidingName(i, PAIRS).c_str()), i % 2 == 1) << i;
+    EXPECT_EQ(Walk(set).size(), 1U << (PAIRS - 1));
+    while (!set.IsEmpty()) // the first name first
+        set.Remove(*set.GetBeginPos());
 }
 
 TEST(StringSet, GrowsAlsoForAStringThatItHolds) {
@@ -139,57 +192,6 @@ TEST(StringSetIterator, ComparesByPosition) {
     EXPECT_TRUE(copy != at && at == set.GetEndPos());
     nowhere = copy;
     EXPECT_STREQ(*nowhere, "A");
-}
-
-TEST(IStringPtrMap, AnswersLikeANaiveMap) {
-    std::mt19937 random(7);
-    std::vector<int> values(20000);
-    IStringPtrMap<int *> map;
-    std::map<std::string, int *> naive;
-    auto upper = [](std::string text) {
-        for (char &c : text)
-            c = c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c;
-        return text;
-    };
-    for (int &value : values) {
-        std::string const name = RandomText(random, LETTERS, 5);
-        int *const pointer = random() % 9 ? &value : nullptr;
-        bool const removes = random() % 4 == 0;
-        removes ? map.Remove(name.c_str()) : map.Add(name.c_str(), pointer);
-        removes ? void(naive.erase(upper(name))) : void(naive[upper(name)] = pointer);
-        std::string const asked = RandomText(random, LETTERS, 4);
-        auto const found = naive.find(upper(asked));
-        ASSERT_EQ(map.Get(asked.c_str()), found == naive.end() ? nullptr : found->second) << asked;
-        ASSERT_EQ(map.Contains(asked.c_str()), found != naive.end()) << asked;
-    }
-    IStringPtrMap<int *> assigned;
-    assigned.Add("no letters of those", values.data());
-    assigned = map;
-    IStringPtrMap<int *> const copy(map);
-    map.Empty();
-    EXPECT_TRUE(map.IsEmpty() && !assigned.Contains("no letters of those"));
-    for (auto const &[name, pointer] : naive)
-        ASSERT_TRUE(assigned.Get(name.c_str()) == pointer && copy.Get(name.c_str()) == pointer);
-}
-
-/// "1Z" and "29" hash alike, and so does everything that is made of them: 65,536 names in one
-/// bucket would have this test run for a minute.
-TEST(IStringPtrMap, FindsNamesThatWereMadeToCollide) {
-    constexpr unsigned int PAIRS = 16;
-    auto const nameOf = [](unsigned int number) {
-        std::string name;
-        for (unsigned int bit = 0; bit < PAIRS; ++bit)
-            name += number >> bit & 1U ? "1z" : "29";
-        return name;
-    };
-    std::vector<int> values(1U << PAIRS);
-    IStringPtrMap<int *> map;
-    for (unsigned int i = 0; i < values.size(); ++i)
-        map.Add(nameOf(i).c_str(), &values[i]);
-    map.Remove("292929292929292929292929292929"
-               "1Z");
-    for (unsigned int i = 0; i < values.size(); ++i)
-        ASSERT_EQ(i == 1U << (PAIRS - 1) ? nullptr : &values[i], map.Get(nameOf(i).c_str())) << i;
 }
 
 } // namespace

@@ -1,3 +1,6 @@
+#include <new>
+#include <typeinfo>
+
 #include <gtest/gtest.h>
 
 #include "tests/support/Lines.h"
@@ -97,6 +100,54 @@ TEST(CommandManager, KeepsWhatRanAndDeletesWhatFailed) {
     manager.Clear();
     EXPECT_EQ(0, manager.GetDoneCommandCount());
     EXPECT_EQ(0, TellingCommand<1>::alive);
+}
+
+struct OwnRefusal : Exception {
+    using Exception::Exception;
+};
+
+/// A command that throws what its first argument names.
+class ThrowingCommand : public Command {
+public:
+    static inline ThrowingCommand *alive = nullptr;
+    ThrowingCommand(Model *owner) : Command(owner) { alive = this; }
+    ~ThrowingCommand() override { alive = nullptr; }
+    bool ParseArguments(StringArray const &tokens) override {
+        what = tokens.GetAt(1);
+        return true;
+    }
+    void Execute() override {
+        if (what == "refusal")
+            throw OwnRefusal(Basis::Exception("m", "f", "r", 7).setDescription("own"));
+        if (what == "memory")
+            throw std::bad_alloc();
+        throw 5;
+    }
+    char const *GetKeyword() const override { return "throw"; }
+    static Command *Make(Model *owner, StringArray const &) { return new ThrowingCommand(owner); }
+
+private:
+    Basis::StringBase<char> what;
+};
+
+TEST(CommandManager, WhatAClientsCommandThrows) {
+    Design design;
+    design.factory.AddCommandCreator("throw", ThrowingCommand::Make);
+    try {
+        design.model.Execute("throw refusal");
+        ADD_FAILURE();
+    } catch (Exception const &refusal) {
+        EXPECT_EQ(typeid(refusal), typeid(Exception)); // a new one, not the command's
+        EXPECT_STREQ(refusal.getDescription(), "own");
+        EXPECT_EQ(refusal.getLine(), 7);
+    }
+    EXPECT_EQ(ThrowingCommand::alive, nullptr);
+    EXPECT_THROW(design.model.Execute("throw memory"), std::bad_alloc);
+    EXPECT_EQ(ThrowingCommand::alive, nullptr);
+    EXPECT_THROW(design.model.Execute("throw 5"), int);
+    EXPECT_NE(ThrowingCommand::alive, nullptr); // the client's, who may have kept it
+    delete ThrowingCommand::alive;
+    EXPECT_EQ(design.model.GetCommandManager()->GetDoneCommandCount(), 0);
 }
 
 TEST(DesignCommands, Grammar) {

@@ -2,6 +2,7 @@
 
 #include <atomic>
 #include <cstdint>
+#include <new>
 #include <string>
 #include <utility>
 #include <vector>
@@ -167,13 +168,21 @@ CommandManager::~CommandManager() = default;
 
 bool CommandManager::CreateAndExecute(StringArray const &tokens, Model *model,
                                       CommandFactory *factory) {
-    std::unique_ptr<Command> command(factory ? factory->CreateCommand(model, tokens) : nullptr);
+    Command *const command = factory ? factory->CreateCommand(model, tokens) : nullptr;
     if (!command)
         RAISE("Command not find.\n");
-    if (!command->ParseArguments(tokens))
-        RAISE("%s: Invalid Arguments.\n", command->GetKeyword());
-    command->Execute();
-    record->done.push_back(std::move(command));
+    try {
+        if (!command->ParseArguments(tokens))
+            RAISE("%s: Invalid Arguments.\n", command->GetKeyword());
+        command->Execute();
+        record->done.emplace_back(command);
+    } catch (Exception const &refusal) {
+        std::unique_ptr<Command> const failed(command);
+        throw Exception(refusal); // required: a new Exception, also of a class derived from it
+    } catch (std::bad_alloc const &) {
+        delete command;
+        throw;
+    }
     return true;
 }
 

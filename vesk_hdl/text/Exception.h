@@ -8,7 +8,7 @@ namespace Vesk_Hdl {
 /// feed, with nothing in front. Module tag "DesignEntry". It adds nothing to its base.
 class VESK_HDL_API Exception : public Basis::Exception {
 public:
-    explicit Exception(Basis::Exception const &other);
+    Exception(Basis::Exception const &other);
     Exception(Exception const &other);
     Exception &operator=(Exception const &other);
     ~Exception() override;

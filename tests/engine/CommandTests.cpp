@@ -150,6 +150,54 @@ TEST(CommandManager, WhatAClientsCommandThrows) {
     EXPECT_EQ(design.model.GetCommandManager()->GetDoneCommandCount(), 0);
 }
 
+TEST(Exception, KindAndSubjectOfEachRefusal) {
+    using E = Exception;
+    using Row = std::tuple<char const *, E::Kind, char const *>;
+    for (auto const &[lines, kind, subject] :
+         {Row{"add; x y", E::UNKNOWN_COMMAND, ""},
+          Row{"add pin CELL; add pin", E::INVALID_ARGUMENTS, "ADD PIN"},
+          Row{"ADD COMPONENT U1; ADD INSTANCE CELL U1; ADD SIGNAL U1; CONNECT SIGNAL U1 u2.A",
+              E::NAME_TAKEN, "U1"},
+          Row{"ADD SIGNAL d(3:0); ADD PORT d(3:0) in", E::BUS_DECLARED, "d(3:0)"},
+          Row{"ADD PIN CELL a in", E::PIN_TAKEN, "a"},
+          Row{"ADD INSTANCE X n; ADD PIN X p in; ADD COMPONENT COMMENT X c;"
+              "ADD COMPONENT PIN COMMENT X.A c; SET COMPONENT PIN ATTRIBUTE VALUE X.A K v",
+              E::COMPONENT_NOT_FOUND, "X"},
+          Row{"CONNECT SIGNAL n X.A; ASSIGN CONSTANT X.A 1; ADD INSTANCE ATTRIBUTE X K;"
+              "ADD INSTANCE PIN ATTRIBUTE X.A K; SET INSTANCE ATTRIBUTE VALUE X K v;"
+              "SET INSTANCE ATTRIBUTE OPTION X K -GENERIC=SYN;"
+              "SET INSTANCE ATTRIBUTE OPTION X K -SYNATTR=NONE",
+              E::INSTANCE_NOT_FOUND, "X"},
+          Row{"CONNECT SIGNAL X(3) u1.A; ASSIGN CONSTANT X(3) 1; ADD SIGNAL COMMENT X(3) c",
+              E::SIGNAL_NOT_FOUND, "X(3)"},
+          Row{"CONNECT SIGNAL n u1.X; ASSIGN CONSTANT u1.X 1; ADD COMPONENT PIN COMMENT CELL.X c;"
+              "SET INSTANCE PIN ATTRIBUTE VALUE u1.X K v",
+              E::PIN_NOT_FOUND, "X"},
+          Row{"SET MODULE ATTRIBUTE VALUE X v; SET INSTANCE ATTRIBUTE USERTYPE u1 X t",
+              E::ATTRIBUTE_NOT_FOUND, "X"},
+          Row{"ADD MODULE ATTRIBUTE -TYPE=Word K v", E::INVALID_ATTRIBUTE_TYPE, "Word"},
+          Row{"SET MODULE ATTRIBUTE USERTYPE w t", E::NOT_A_USER_ATTRIBUTE, "W"},
+          Row{"SET MODULE ATTRIBUTE OPTION W -GENERIC=1", E::INVALID_GENERIC_WORD, "1"},
+          Row{"SET MODULE ATTRIBUTE OPTION W -SYNATTR=", E::INVALID_SYNTHESIS_WORD, ""}})
+        for (std::string const &line : Pieces(lines)) {
+            Design design(CellsAnd("sig D(7:0); ADD MODULE ATTRIBUTE -TYPE=Integer W 1"));
+            try {
+                design.model.Execute(line.c_str());
+                ADD_FAILURE() << line;
+            } catch (E const &refusal) {
+                EXPECT_EQ(refusal.getKind(), kind) << line;
+                EXPECT_STREQ(refusal.getSubject(), subject) << line;
+            }
+        }
+    Model model;
+    try {
+        model.AddSignal(nullptr);
+    } catch (E const &refusal) {
+        EXPECT_EQ(refusal.getKind(), E::INVALID_NAME);
+    }
+    EXPECT_EQ(Basis::Exception("m", "f", "r", 1).getKind(), E::OTHER);
+}
+
 TEST(DesignCommands, Grammar) {
     // Lines, each in a design of its own, and the message of them all.
     using Row = std::pair<char const *, char const *>;

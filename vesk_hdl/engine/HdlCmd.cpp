@@ -10,7 +10,7 @@
 #include "vesk_hdl/engine/Commands.h"
 #include "vesk_hdl/engine/JoinTokens.h"
 #include "vesk_hdl/model/HdlModel.h"
-#include "vesk_hdl/text/Raise.h"
+#include "vesk_hdl/model/Messages.h"
 #include "vesk_hdl/text/basis/Ascii.h"
 
 #define RAISE(...) VESK_HDL_RAISE("HdlCmd", __VA_ARGS__)
@@ -24,7 +24,7 @@ Command::~Command() = default;
 
 Model &Command::RequireModel() const {
     if (!commandModel)
-        RAISE("Missing Model.\n");
+        RAISE(Messages::MISSING_MODEL);
     return *commandModel;
 }
 
@@ -170,10 +170,10 @@ bool CommandManager::CreateAndExecute(StringArray const &tokens, Model *model,
                                       CommandFactory *factory) {
     Command *const command = factory ? factory->CreateCommand(model, tokens) : nullptr;
     if (!command)
-        RAISE("Command not find.\n");
+        RAISE(Messages::UNKNOWN_COMMAND);
     try {
         if (!command->ParseArguments(tokens))
-            RAISE("%s: Invalid Arguments.\n", command->GetKeyword());
+            RAISE(Messages::INVALID_ARGUMENTS, command->GetKeyword());
         command->Execute();
         record->done.emplace_back(command);
     } catch (Exception const &refusal) {

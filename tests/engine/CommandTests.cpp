@@ -45,6 +45,12 @@ TEST(CommandFactory, TheLongestKeywordWins) {
     factory.AddCommandCreator("late", TellingCommand<1>::Make);
     EXPECT_EQ(1, CreatorOf(copy, "LATE"));
     EXPECT_EQ(nullptr, factory.CreateCommand(nullptr, "unknown"));
+    for (int i = 0; i < 40; ++i) // more than a place of the library's keywords has
+        factory.AddCommandCreator(("many k" + std::to_string(i)).c_str(), TellingCommand<1>::Make);
+    factory.AddCommandCreator("MANY K39", TellingCommand<2>::Make);
+    for (auto const &[line, creator] : {Row{"Many K0", 1}, Row{"many k38 x", 1}, Row{"MANY k39", 2},
+                                        Row{"many k40", 0}, Row{"'many k20'", 1}})
+        EXPECT_EQ(creator, CreatorOf(factory, line)) << line;
     std::string endless = "word";
     for (int i = 0; i < 100000; ++i)
         endless += " word";

@@ -4,7 +4,7 @@
 #include <array>
 #include <ostream>
 
-#include "tool/diagnostics/Format.h"
+#include "tool/diagnostics/Terminal.h"
 
 namespace {
 
@@ -125,12 +125,12 @@ void Reporter::Report(Diagnostic const &diagnostic) {
 void Reporter::ReportText(Diagnostic const &diagnostic) {
     auto const colour = [this](char const *code) { return reportStyle.colour ? code : ""; };
     auto const head = [&](Place const &place, Word const &word, std::string_view text) {
-        stream << colour(BOLD) << Harmless(place.file);
+        stream << colour(BOLD) << SanitizeForTerminal(place.file);
         for (unsigned long const number : {place.line, static_cast<unsigned long>(place.column)})
             if (number > 0)
                 stream << ':' << number;
         stream << ": " << colour(PLAIN) << colour(word.colour) << word.text << ": " << colour(PLAIN)
-               << Harmless(text);
+               << SanitizeForTerminal(text);
     };
 
     head(diagnostic.place, WordOf(diagnostic.severity), diagnostic.message);
@@ -142,7 +142,7 @@ void Reporter::ReportText(Diagnostic const &diagnostic) {
     ReportSource(diagnostic, colour(GREEN), colour(PLAIN));
     for (std::string const &hint : diagnostic.hints)
         stream << "  " << colour(HINT_WORD.colour) << HINT_WORD.text << ": " << colour(PLAIN)
-               << Harmless(hint) << '\n';
+               << SanitizeForTerminal(hint) << '\n';
     for (Diagnostic::Note const &note : diagnostic.notes) {
         head(note.place, NOTE_WORD, note.text);
         stream << '\n';
@@ -172,8 +172,8 @@ void Reporter::ReportSource(Diagnostic const &diagnostic, char const *colour, ch
         source = source.substr(0, end);
     }
     std::size_t const marked = CharactersIn(source.substr(at, diagnostic.place.length));
-    stream << "  " << (clipFront ? CLIPPED : "") << Harmless(source) << (clipBack ? CLIPPED : "")
-           << '\n'
+    stream << "  " << (clipFront ? CLIPPED : "") << SanitizeForTerminal(source)
+           << (clipBack ? CLIPPED : "") << '\n'
            << std::string(2 + (clipFront ? sizeof CLIPPED - 1 : 0) +
                               CharactersIn(source.substr(0, at)),
                           ' ')

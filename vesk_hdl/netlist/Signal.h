@@ -75,7 +75,7 @@ public:
 
 protected:
     Signal();
-    explicit Signal(char const *name);
+    Signal(char const *name);
 
 private:
     friend class BusSlice;

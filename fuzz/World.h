@@ -143,6 +143,7 @@ struct World {
                 ForEach(bus->GetBusSliceIterator(), [&](Signal *slice) {
                     if (!signals.Knows(slice))
                         signals.Add(slice, netlist, true);
+                    replaced.erase(slice); // the slice lies where the bus was
                 });
     }
     /// Nothing that a netlist holds points at a bus that the netlist replaced by a wider one.

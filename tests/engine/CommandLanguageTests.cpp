@@ -1,3 +1,4 @@
+#include <algorithm>
 #include <cctype>
 #include <memory>
 
@@ -7,7 +8,6 @@
 #include "tests/support/MemoryFile.h"
 #include "tests/support/Options.h"
 #include "tests/support/Owners.h"
-#include "vesk_hdl/engine/CommandTable.h"
 
 using namespace Vesk_Hdl;
 
@@ -17,6 +17,10 @@ std::string Lower(std::string text) {
     for (char &c : text)
         c = static_cast<char>(std::tolower(static_cast<unsigned char>(c)));
     return text;
+}
+
+StringArray Tokens(std::string const &line) {
+    return StringArray(line.c_str(), " ", true, "\"\"''");
 }
 
 std::string Invalid(std::string const &keyword) { return keyword + ": Invalid Arguments.\n"; }
@@ -61,10 +65,10 @@ TEST(CommandLanguage, EachKeywordRunsOnJustEnoughArgumentsAndNeedsAModel) {
         EXPECT_EQ(arguments.empty() ? "" : Invalid(keyword),
                   Refusal(design.model, {line.substr(0, line.rfind(' '))}))
             << line;
-        StringArray const tokens(line.c_str(), " ", true, "\"\"''");
         CommandManager manager;
-        EXPECT_EQ(keyword == "NOOP" ? "" : "Missing Model.\n",
-                  MessageOf([&] { manager.CreateAndExecute(tokens, nullptr, &design.factory); }))
+        EXPECT_EQ(keyword == "NOOP" ? "" : "Missing Model.\n", MessageOf([&] {
+                      manager.CreateAndExecute(Tokens(line), nullptr, &design.factory);
+                  }))
             << line;
     }
 }
@@ -230,10 +234,35 @@ TEST(CommandReference, ItsExamplesRunAndItsWrongLinesAreRefusedAsTold) {
         EXPECT_EQ(design.model.GetCommandManager()->GetDoneCommandCount(), lines.GetSize());
         std::string const told = help.message + std::string(*help.message ? "\n" : "");
         EXPECT_EQ(Refusal(design.model, {help.wrong}), told);
+        EXPECT_EQ(help.words, Tokens(help.keyword).GetSize());
+        EXPECT_EQ(CommandReference::FindFor(Tokens(Lower(help.keyword) + " x")), &help);
+        EXPECT_EQ(CommandReference::FindFor(Tokens("'" + Lower(help.keyword) + "'")), &help);
+    }
+    for (auto const &[keyword, arguments] : Language()) {
+        CommandHelp const &help = *CommandReference::Find(keyword.c_str());
+        auto const required = std::count_if(help.arguments.begin(), help.arguments.end(),
+                                            [](Argument const &each) { return !each.optional; });
+        EXPECT_EQ(required, Tokens(arguments).GetSize()) << keyword;
     }
     EXPECT_EQ(CommandReference::GetAt(-1), nullptr);
     EXPECT_EQ(CommandReference::GetAt(CommandReference::GetCount()), nullptr);
     EXPECT_EQ(CommandReference::Find("ADD"), nullptr);
+    EXPECT_EQ(CommandReference::FindFor(Tokens("ADD x")), nullptr);
+}
+
+TEST(PinReference, SplitsAtTheFirstPointAfterTheFirstOtherCharacter) {
+    using Row = std::tuple<char const *, char const *, char const *>;
+    for (auto const &[token, holder, pin] :
+         {Row{"u.A", "u", "A"}, Row{"u.A.B", "u", "A.B"}, Row{"u..", "u", "."},
+          Row{".u.D(7:0)", ".u", "D(7:0)"}, Row{"..u.A", "..u", "A"}, Row{"u", "-", "-"},
+          Row{"u.", "-", "-"}, Row{".u", "-", "-"}, Row{"..", "-", "-"}, Row{"", "-", "-"}}) {
+        std::string left = "-";
+        std::string right = "-";
+        EXPECT_EQ(SplitPinReference(token, left, right), *holder != '-') << token;
+        EXPECT_EQ(left, holder) << token;
+        EXPECT_EQ(right, pin) << token;
+    }
+    EXPECT_EQ(FindPinPoint(".u."), 2U); // the pin may still be missing
 }
 
 } // namespace

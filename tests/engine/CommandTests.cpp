@@ -1,3 +1,6 @@
+#include <new>
+#include <typeinfo>
+
 #include <gtest/gtest.h>
 
 #include "tests/support/Lines.h"
@@ -42,6 +45,12 @@ TEST(CommandFactory, TheLongestKeywordWins) {
     factory.AddCommandCreator("late", TellingCommand<1>::Make);
     EXPECT_EQ(1, CreatorOf(copy, "LATE"));
     EXPECT_EQ(nullptr, factory.CreateCommand(nullptr, "unknown"));
+    for (int i = 0; i < 40; ++i) // more than a place of the library's keywords has
+        factory.AddCommandCreator(("many k" + std::to_string(i)).c_str(), TellingCommand<1>::Make);
+    factory.AddCommandCreator("MANY K39", TellingCommand<2>::Make);
+    for (auto const &[line, creator] : {Row{"Many K0", 1}, Row{"many k38 x", 1}, Row{"MANY k39", 2},
+                                        Row{"many k40", 0}, Row{"'many k20'", 1}})
+        EXPECT_EQ(creator, CreatorOf(factory, line)) << line;
     std::string endless = "word";
     for (int i = 0; i < 100000; ++i)
         endless += " word";
@@ -97,6 +106,102 @@ TEST(CommandManager, KeepsWhatRanAndDeletesWhatFailed) {
     manager.Clear();
     EXPECT_EQ(0, manager.GetDoneCommandCount());
     EXPECT_EQ(0, TellingCommand<1>::alive);
+}
+
+struct OwnRefusal : Exception {
+    using Exception::Exception;
+};
+
+/// A command that throws what its first argument names.
+class ThrowingCommand : public Command {
+public:
+    static inline ThrowingCommand *alive = nullptr;
+    ThrowingCommand(Model *owner) : Command(owner) { alive = this; }
+    ~ThrowingCommand() override { alive = nullptr; }
+    bool ParseArguments(StringArray const &tokens) override {
+        what = tokens.GetAt(1);
+        return true;
+    }
+    void Execute() override {
+        if (what == "refusal")
+            throw OwnRefusal(Basis::Exception("m", "f", "r", 7).setDescription("own"));
+        if (what == "memory")
+            throw std::bad_alloc();
+        throw 5;
+    }
+    char const *GetKeyword() const override { return "throw"; }
+    static Command *Make(Model *owner, StringArray const &) { return new ThrowingCommand(owner); }
+
+private:
+    Basis::StringBase<char> what;
+};
+
+TEST(CommandManager, WhatAClientsCommandThrows) {
+    Design design;
+    design.factory.AddCommandCreator("throw", ThrowingCommand::Make);
+    try {
+        design.model.Execute("throw refusal");
+        ADD_FAILURE();
+    } catch (Exception const &refusal) {
+        EXPECT_EQ(typeid(refusal), typeid(Exception)); // a new one, not the command's
+        EXPECT_STREQ(refusal.getDescription(), "own");
+        EXPECT_EQ(refusal.getLine(), 7);
+    }
+    EXPECT_EQ(ThrowingCommand::alive, nullptr);
+    EXPECT_THROW(design.model.Execute("throw memory"), std::bad_alloc);
+    EXPECT_EQ(ThrowingCommand::alive, nullptr);
+    EXPECT_THROW(design.model.Execute("throw 5"), int);
+    EXPECT_NE(ThrowingCommand::alive, nullptr); // the client's, who may have kept it
+    delete ThrowingCommand::alive;
+    EXPECT_EQ(design.model.GetCommandManager()->GetDoneCommandCount(), 0);
+}
+
+TEST(Exception, KindAndSubjectOfEachRefusal) {
+    using E = Exception;
+    using Row = std::tuple<char const *, E::Kind, char const *>;
+    for (auto const &[lines, kind, subject] :
+         {Row{"add; x y", E::UNKNOWN_COMMAND, ""},
+          Row{"add pin CELL; add pin", E::INVALID_ARGUMENTS, "ADD PIN"},
+          Row{"ADD COMPONENT U1; ADD INSTANCE CELL U1; ADD SIGNAL U1; CONNECT SIGNAL U1 u2.A",
+              E::NAME_TAKEN, "U1"},
+          Row{"ADD SIGNAL d(3:0); ADD PORT d(3:0) in", E::BUS_DECLARED, "d(3:0)"},
+          Row{"ADD PIN CELL a in", E::PIN_TAKEN, "a"},
+          Row{"ADD INSTANCE X n; ADD PIN X p in; ADD COMPONENT COMMENT X c;"
+              "ADD COMPONENT PIN COMMENT X.A c; SET COMPONENT PIN ATTRIBUTE VALUE X.A K v",
+              E::COMPONENT_NOT_FOUND, "X"},
+          Row{"CONNECT SIGNAL n X.A; ASSIGN CONSTANT X.A 1; ADD INSTANCE ATTRIBUTE X K;"
+              "ADD INSTANCE PIN ATTRIBUTE X.A K; SET INSTANCE ATTRIBUTE VALUE X K v;"
+              "SET INSTANCE ATTRIBUTE OPTION X K -GENERIC=SYN;"
+              "SET INSTANCE ATTRIBUTE OPTION X K -SYNATTR=NONE",
+              E::INSTANCE_NOT_FOUND, "X"},
+          Row{"CONNECT SIGNAL X(3) u1.A; ASSIGN CONSTANT X(3) 1; ADD SIGNAL COMMENT X(3) c",
+              E::SIGNAL_NOT_FOUND, "X(3)"},
+          Row{"CONNECT SIGNAL n u1.X; ASSIGN CONSTANT u1.X 1; ADD COMPONENT PIN COMMENT CELL.X c;"
+              "SET INSTANCE PIN ATTRIBUTE VALUE u1.X K v",
+              E::PIN_NOT_FOUND, "X"},
+          Row{"SET MODULE ATTRIBUTE VALUE X v; SET INSTANCE ATTRIBUTE USERTYPE u1 X t",
+              E::ATTRIBUTE_NOT_FOUND, "X"},
+          Row{"ADD MODULE ATTRIBUTE -TYPE=Word K v", E::INVALID_ATTRIBUTE_TYPE, "Word"},
+          Row{"SET MODULE ATTRIBUTE USERTYPE w t", E::NOT_A_USER_ATTRIBUTE, "W"},
+          Row{"SET MODULE ATTRIBUTE OPTION W -GENERIC=1", E::INVALID_GENERIC_WORD, "1"},
+          Row{"SET MODULE ATTRIBUTE OPTION W -SYNATTR=", E::INVALID_SYNTHESIS_WORD, ""}})
+        for (std::string const &line : Pieces(lines)) {
+            Design design(CellsAnd("sig D(7:0); ADD MODULE ATTRIBUTE -TYPE=Integer W 1"));
+            try {
+                design.model.Execute(line.c_str());
+                ADD_FAILURE() << line;
+            } catch (E const &refusal) {
+                EXPECT_EQ(refusal.getKind(), kind) << line;
+                EXPECT_STREQ(refusal.getSubject(), subject) << line;
+            }
+        }
+    Model model;
+    try {
+        model.AddSignal(nullptr);
+    } catch (E const &refusal) {
+        EXPECT_EQ(refusal.getKind(), E::INVALID_NAME);
+    }
+    EXPECT_EQ(Basis::Exception("m", "f", "r", 1).getKind(), E::OTHER);
 }
 
 TEST(DesignCommands, Grammar) {

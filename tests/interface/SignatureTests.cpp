@@ -16,11 +16,14 @@ namespace {
 
 // HAVE(Class, row, ...), with rows of two kinds. As<Type>(&Class::Operation, ...): the class itself
 // declares each operation or field in just that type; functions and static operations are of no
-// class. From<void(Argument, ...), ...>(): it can be made from these arguments.
+// class. From<void(Argument, ...), ...>(): it can be made from these arguments, and a single
+// argument converts to it.
 
 template <class Class, class Arguments> constexpr bool made = false;
 template <class Class, class... Arguments>
 constexpr bool made<Class, void(Arguments...)> = std::is_constructible_v<Class, Arguments...>;
+template <class Class, class Argument>
+constexpr bool made<Class, void(Argument)> = std::is_convertible_v<Argument, Class>;
 template <class... Signatures> struct From {
     template <class Class> static constexpr bool holds = (made<Class, Signatures> && ...);
 };
@@ -409,6 +412,20 @@ HAVE(ObjectVisitor, VISITS(Object, Attribute), VISITS(Object, Signal), VISITS(Ob
 // What the classes are.
 
 static_assert(AreAbstract<Command, StreamDst, Object, A, S, P>);
+struct AnyCommand : Command { // inherits whether a constructor converts
+    using Command::Command;
+    bool ParseArguments(Tokens) override { return true; }
+    void Execute() override {}
+    Text GetKeyword() const override { return ""; }
+};
+struct AnyAttribute : A {
+    using A::A;
+    A *CloneAttribute() const override { return nullptr; }
+    void SetValue(Text) override {}
+    Str GetValueString() const override { return ""; }
+    ValueType GetValueType() const override { return VALUE_STRING; }
+};
+static_assert(made<AnyCommand, void(M *)> && made<AnyAttribute, void(Text)>);
 static_assert(Extend<Object, A, S, P, C, I, N> && Extend<Holder, S, P, C, I, N>);
 static_assert(Extend<Error, Exception> && Extend<OutStream, File, TextMemOutStream> &&
               Extend<IStringPtrMapBase, Map>);

@@ -3,6 +3,7 @@
 #include "vesk_hdl/Vesk_Hdl.h"
 
 using namespace Vesk_Hdl;
+using enum ArgumentKind;
 
 namespace {
 
@@ -11,30 +12,11 @@ constexpr char const *DIRECTIONS[] = {"in", "in", "out", "out", "bi", "in", "out
 constexpr char const *BASES[] = {"D", "d", "E", "s", "T", "x_DUMMY", "q"};
 constexpr char const *INSTANCES[] = {"u1", "U2", "u3", "v"};
 constexpr char const *COMPONENTS[] = {"C", "c", "B"};
-constexpr char const *POLARITIES[] = {"in", "OUT", "BiDir", "x"};
 constexpr char const *ATTRIBUTES[] = {"INIT", "K", "Level", "BOX_TYPE", "k"};
-constexpr char const *TYPES[] = {"String", "Integer", "Float",     "Boolean",
-                                 "Bit",    "User",    "BitVector", "word"};
 constexpr char const *VALUES[] = {"1",      "0",    "x",       "2.50",     "ORVANE", "4:b:1010",
                                   "8:h:FF", "\"\"", "\"a b\"", "10:d:512", "'it'"};
-constexpr char const *SETTINGS[] = {"-GENERIC=SYN",    "-GENERIC=NOSYN",       "-GENERIC=none",
-                                    "-SYNATTR=ASSIGN", "-SYNATTR=ASSIGNNODEC", "-SYNATTR=x"};
-constexpr char const *TOOLS[] = {"QRT",         "exemplar",  "SYNPLICITY", "synopsys",
-                                 "VERILOG2001", "PRECISION", "other"};
-constexpr char const *OPTIONS[] = {"-APPEND", "-NOHEADER", "-OVERWRITE", "-x"};
 constexpr char const *TEXTS[] = {"hello", "a fairly long text of many words that has to wrap",
                                  "\"quoted  blanks\"", "/*", "--"};
-constexpr char const *FLAGS[] = {"false", "true", ""};
-
-std::vector<std::string> Split(std::string const &text, char separator) {
-    std::vector<std::string> parts(1);
-    for (char const c : text)
-        if (c == separator)
-            parts.emplace_back();
-        else
-            parts.back() += c;
-    return parts;
-}
 
 } // namespace
 
@@ -54,51 +36,43 @@ std::string RandomLines::Next() {
         Below(2) ? *CommandReference::Find("CONNECT SIGNAL")
                  : *CommandReference::GetAt(Below(CommandReference::GetCount()));
     std::string line = command.keyword;
-    for (std::string word : Split(command.grammar, ' ')) {
-        bool const optional = word.find_first_of("[]") != std::string::npos;
-        std::erase_if(word, [](char c) { return c == '[' || c == ']'; });
-        if (!word.empty() && (!optional || Below(2)))
-            line += " " + Argument(word);
-    }
+    for (Argument const &argument : command.arguments)
+        if (!argument.optional || Below(2))
+            line += " " + Word(argument.alternative != NONE && Below(2) ? argument.alternative
+                                                                        : argument.kind);
     return line + "\n";
 }
 
-std::string RandomLines::Argument(std::string word) {
-    std::vector<std::string> const alternatives = Split(word, '|');
-    word = alternatives[random() % alternatives.size()];
-    if (alternatives.size() == 3)
-        return word; // of UPPERCASE and LOWERCASE
-    if (word == "component")
+std::string RandomLines::Word(ArgumentKind kind) {
+    switch (kind) {
+    case COMPONENT:
         return Pick(COMPONENTS);
-    if (word == "instance")
+    case INSTANCE:
         return Pick(INSTANCES);
-    if (word == "component.pin")
+    case COMPONENT_PIN:
         return Pick(COMPONENTS) + std::string(".") + Pick(PINS);
-    if (word == "instance.pin")
+    case INSTANCE_PIN:
         return Pick(INSTANCES) + std::string(".") + Pick(PINS);
-    if (word == "pin")
+    case PIN:
         return Pick(PINS);
-    if (word == "signal")
+    case SIGNAL:
         return Name();
-    if (word == "polarity")
-        return Pick(POLARITIES);
-    if (word == "attribute")
+    case ATTRIBUTE:
         return Pick(ATTRIBUTES);
-    if (word == "usertype")
-        return Pick(TYPES);
-    if (word == "-TYPE=type")
-        return std::string("-TYPE=") + Pick(TYPES);
-    if (word == "setting")
-        return Pick(SETTINGS);
-    if (word == "option")
-        return Pick(OPTIONS);
-    if (word == "tool")
-        return Pick(TOOLS);
-    if (word == "flag")
-        return Pick(FLAGS);
-    if (word == "text...")
+    case VALUE:
+        return Pick(VALUES);
+    case TEXT:
         return Pick(TEXTS);
-    return word == "value" ? Pick(VALUES) : "name";
+    case USER_TYPE:
+        return Pick(Vocabulary::ATTRIBUTE_TYPES);
+    default:
+        break;
+    }
+    std::span<Vocabulary::Choice const> const choices = CommandReference::GetArgument(kind).choices;
+    if (choices.empty())
+        return "name";
+    Vocabulary::Choice const &choice = Pick(choices);
+    return choice.prefix + std::string(Below(8) ? Pick(choice.words) : "x");
 }
 
 std::string RandomLines::Index() { return std::to_string(Below(10)); }

@@ -3,6 +3,8 @@
 #include <random>
 #include <string>
 
+#include "vesk_hdl/Vesk_Hdl.h"
+
 /// Command lines made from the grammar of the commands and a small stock of names, so that most of
 /// them are accepted, meet each other's objects and reach deep states.
 class RandomLines {
@@ -15,15 +17,14 @@ public:
     std::string Next();
 
 private:
-    std::string Argument(std::string word);
+    std::string Word(Vesk_Hdl::ArgumentKind kind);
     std::string Name();
     std::string SimpleName();
     std::string Index();
-    std::string Value();
 
     int Below(int limit) { return static_cast<int>(random() % static_cast<unsigned>(limit)); }
-    template <std::size_t Count> char const *Pick(char const *const (&words)[Count]) {
-        return words[random() % Count];
+    template <class List> auto const &Pick(List const &list) {
+        return list[random() % std::size(list)];
     }
 
     std::mt19937 &random;

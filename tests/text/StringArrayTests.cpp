@@ -97,12 +97,13 @@ TEST(StringArray, Contains) {
 }
 
 TEST(StringArray, ReadsIntegers) {
-    StringArray const array = FromBars("12||-3|4x|99999999999|");
+    StringArray const array = FromBars("12||-3|4x|99999999999999999999|4294967303|");
     int value = 99;
     EXPECT_TRUE(array.GetIntAt(0, value, 5) && value == 12);
     EXPECT_TRUE(array.GetIntAt(2, value, 5) && value == -3);
-    for (int const index : {1, 3, 4, 5, -1})
+    for (int const index : {1, 3, 4, 6, -1})
         EXPECT_TRUE(!array.GetIntAt(index, value, 5) && value == -3) << index;
+    EXPECT_TRUE(array.GetIntAt(5, value, 5) && value == 7); // more than an int holds: converted
 }
 
 TEST(StringArray, Sorts) {

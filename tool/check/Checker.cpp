@@ -5,7 +5,7 @@
 #include <utility>
 
 #include "tool/check/Rewriting.h"
-#include "tool/diagnostics/Blame.h"
+#include "tool/diagnostics/RefusalExplainer.h"
 #include "tool/diagnostics/Words.h"
 
 using namespace Vesk_Hdl;
@@ -15,8 +15,7 @@ namespace Checks {
 std::optional<Diagnostic> Checker::RunLine(std::string const &line, Place const &place) {
     std::uint32_t const number = places.NextLine(line);
     LineTokens const tokens(line);
-    int words = 0;
-    CommandHelp const *const command = KeywordOf(tokens.GetTokens(), words);
+    CommandHelp const *const command = CommandReference::FindFor(tokens.GetTokens());
     bool const isVhdl = command && std::strcmp(command->keyword, "WRITE VHDL") == 0;
     bool const isVerilog = command && std::strcmp(command->keyword, "WRITE VERILOG") == 0;
     if ((isVhdl || isVerilog) && line.find('\0') == std::string::npos)
@@ -27,7 +26,7 @@ std::optional<Diagnostic> Checker::RunLine(std::string const &line, Place const 
     }
     // What happens while lines run concerns whatever will be written.
     findings.SetLanguages(RequestedOr(BOTH));
-    recorder.Before(tokens, command, words, number);
+    recorder.Before(tokens, command, command ? command->words : 0, number);
     std::optional<Diagnostic> diagnostic = session.RunLine(line, place);
     recorder.After(!diagnostic);
     return diagnostic;
@@ -46,8 +45,10 @@ std::optional<Diagnostic> Checker::PassWrite(std::string const &line, Place cons
     std::unique_ptr<Command> const command(
         factory.CreateCommand(&session.GetModel(), tokens.GetTokens()));
     if (!command->ParseArguments(tokens.GetTokens())) {
-        std::string const text = std::string(command->GetKeyword()) + ": Invalid Arguments.";
-        return BlameRefusal(line, place, text, session.GetModel());
+        Basis::Exception refusal("DesignEntry", "Checker", "", __LINE__);
+        refusal.setDescription("%s: Invalid Arguments.\n", command->GetKeyword())
+            .setKind(Exception::INVALID_ARGUMENTS, command->GetKeyword());
+        return ExplainRefusal(line, place, refusal, session.GetModel());
     }
     written |= language;
     changed = false;

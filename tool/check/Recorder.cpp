@@ -112,7 +112,7 @@ void Recorder::NamePin(int token) {
     std::string owner;
     std::string pinName;
     std::string_view const text = tokens->At(token);
-    if (!SplitPin(text, owner, pinName)) {
+    if (!SplitPinReference(text, owner, pinName)) {
         Name(tokens->GetTokens().At(token), token);
         return;
     }
@@ -129,7 +129,7 @@ AttributeHolder *Recorder::HolderOf(int token, std::string_view kind) const {
     std::string owner;
     std::string pinName;
     if (Contains(kind, " PIN ")) {
-        if (!SplitPin(name, owner, pinName))
+        if (!SplitPinReference(name, owner, pinName))
             return nullptr;
         return Contains(kind, "INSTANCE")
                    ? model.GetPin(pinName.c_str(), model.GetInstance(owner.c_str()))

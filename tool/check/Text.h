@@ -82,17 +82,6 @@ inline std::string Normal(std::string_view name) {
     return std::string(text.View());
 }
 
-/// "INSTANCE.PIN" without its first point, as the commands split it.
-inline bool SplitPin(std::string_view token, std::string &owner, std::string &pin) {
-    std::size_t const begin = std::min(token.find_first_not_of('.'), token.size());
-    std::size_t const point = token.find('.', begin);
-    if (point == std::string_view::npos || point + 1 >= token.size())
-        return false;
-    owner = token.substr(0, point);
-    pin = token.substr(point + 1);
-    return true;
-}
-
 inline std::string PinName(Vesk_Hdl::Object const &owner, Vesk_Hdl::Pin const &pin) {
     return "pin " +
            Quoted(Shortened(owner.GetNameRef().View()) + "." + Shortened(pin.GetNameRef().View()));

@@ -3,11 +3,12 @@
 #include <algorithm>
 #include <iomanip>
 #include <iostream>
-#include <map>
 #include <memory>
+#include <set>
 
 #include <CLI/CLI.hpp>
 
+#include "tool/diagnostics/Keywords.h"
 #include "tool/diagnostics/Words.h"
 #include "vesk_hdl/Vesk_Hdl.h"
 
@@ -17,46 +18,17 @@ namespace {
 
 constexpr std::size_t COLUMNS = 80;
 
-/// What stands for a word of a grammar.
-std::map<std::string, char const *> const &Glossary() {
-    static std::map<std::string, char const *> const glossary = {
-        {"-TYPE=type", "String (the default), Integer, Float, Boolean, Bit, BitVector or User"},
-        {"attribute", "the name of an attribute"},
-        {"component", "the name of a component"},
-        {"component.pin", "a pin of a component, such as AND2.I0"},
-        {"file", "the name of a file; in quotes if it holds blanks"},
-        {"flag", "\"false\"; anything else, also nothing, means true"},
-        {"instance", "the name of an instance"},
-        {"instance.pin", "a pin of an instance, such as U1.I0"},
-        {"library", "the name of a library, or of what is used of it"},
-        {"name", "a word; in quotes if it holds blanks"},
-        {"option", "-NOHEADER, -APPEND or -OVERWRITE"},
-        {"pin", "the name of a pin: I0, or D(7:0) for eight bits"},
-        {"polarity", "Input, Output or BiDirectional, or any beginning of one, in any case"},
-        {"setting", "-GENERIC=NONE, SYN or NOSYN; -SYNATTR=NONE, ASSIGN or ASSIGNNODEC"},
-        {"signal", "NET, BUS(7:0), a part of a bus such as BUS(3) and BUS(6:4), or A,BUS(1:0),B"},
-        {"text...", "all words to the end of the line"},
-        {"tool", "QRT, EXEMPLAR, SYNPLICITY, SYNOPSYS, VERILOG2001 or PRECISION"},
-        {"usertype", "the name of a type"},
-        {"value", "a text; of a constant or default 1, 0110 or WIDTH:BASE:DIGITS, as in 8:h:A5"}};
-    return glossary;
-}
-
-/// The words of a grammar that stand for something, each once.
-std::vector<std::string> PlaceholdersOf(CommandHelp const &command) {
-    std::vector<std::string> found;
-    std::string word;
-    for (char const *at = command.grammar;; ++at) {
-        if (*at && *at != ' ' && *at != '|' && *at != '[' && *at != ']') {
-            word += *at;
-            continue;
+/// What the words of the command's grammar mean, each once.
+std::vector<ArgumentHelp> MeaningsOf(CommandHelp const &command) {
+    std::vector<ArgumentHelp> found;
+    std::set<ArgumentKind> seen;
+    for (Argument const &argument : command.arguments)
+        for (ArgumentKind const kind : {argument.kind, argument.alternative}) {
+            ArgumentHelp const &help = CommandReference::GetArgument(kind);
+            if (*help.meaning && seen.insert(kind).second)
+                found.push_back(help);
         }
-        if (Glossary().count(word) && std::find(found.begin(), found.end(), word) == found.end())
-            found.push_back(word);
-        word.clear();
-        if (!*at)
-            return found;
-    }
+    return found;
 }
 
 std::string GrammarOf(CommandHelp const &command) {
@@ -84,13 +56,15 @@ void PrintWrapped(std::ostream &stream, std::string const &head, std::string con
 void PrintScreen(std::ostream &stream, CommandHelp const &command) {
     stream << GrammarOf(command) << "\n\n";
     PrintWrapped(stream, "  ", command.summary);
-    std::vector<std::string> const placeholders = PlaceholdersOf(command);
+    std::vector<ArgumentHelp> const arguments = MeaningsOf(command);
     std::size_t width = 0;
-    for (std::string const &word : placeholders)
-        width = std::max(width, word.size());
-    for (std::string const &word : placeholders)
-        PrintWrapped(stream, "    " + word + std::string(width + 2 - word.size(), ' '),
-                     Glossary().at(word));
+    for (ArgumentHelp const &help : arguments)
+        width = std::max(width, std::string_view(help.word).size());
+    for (ArgumentHelp const &help : arguments) {
+        std::string word = std::string("    ") + help.word;
+        word.resize(4 + width + 2, ' ');
+        PrintWrapped(stream, word, help.meaning);
+    }
     if (*command.refused)
         PrintWrapped(stream, "  refused:  ", command.refused);
     if (*command.notes)
@@ -111,9 +85,9 @@ void PrintMarkdown(std::ostream &stream) {
     stream
         << "# The commands\n\n"
            "A line is a command: a keyword, in any case, and its arguments, with blanks between "
-           "them. A word in\n`\"` or `'` may hold blanks. `[ ]` stands around what may be missing, "
-           "`|` between alternatives, `...`\nbehind a word that stands for all the rest. Names "
-           "ignore case.\n\nThis page is what `vesk-hdl commands --markdown` prints; "
+           "them. A word in\n`\"` or `'` may hold blanks. `[ ]` is around what may be missing, `|` "
+           "between alternatives, `...`\nafter a word that takes all the rest. Names ignore "
+           "case.\n\nThis page is what `vesk-hdl commands --markdown` prints; "
            "`vesk-hdl commands WORD...` shows one command.\n";
     for (int i = 0; i < CommandReference::GetCount(); ++i) {
         CommandHelp const &command = *CommandReference::GetAt(i);
@@ -122,13 +96,13 @@ void PrintMarkdown(std::ostream &stream) {
         if (*command.notes)
             stream << ' ' << command.notes;
         stream << "\n" << (*command.grammar || *command.refused ? "\n" : "");
-        for (std::string const &word : PlaceholdersOf(command))
-            stream << "- `" << word << "`: " << Glossary().at(word) << '\n';
+        for (ArgumentHelp const &help : MeaningsOf(command))
+            stream << "- `" << help.word << "`: " << help.meaning << '\n';
         if (*command.refused)
             stream << "- Refused: " << command.refused << ".\n";
         stream << "\n```\n" << command.example << "\n```\n";
         if (*command.wrong)
-            stream << "\nBehind it, `" << command.wrong << "` gives `" << command.message << "`\n";
+            stream << "\nAfter it, `" << command.wrong << "` gives `" << command.message << "`\n";
     }
 }
 

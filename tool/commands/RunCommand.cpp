@@ -134,6 +134,7 @@ private:
         // "used", so that no optimizer takes away what a search for leaks starts from.
         [[gnu::used]] static Session *lasting = nullptr;
         session = lasting = new Session(options.modelName);
+        session->SetHints(!options.quiet);
         outputs.SetListener([this](char const *file) { progress.TellWrite(file); });
         session->GetModel().SetWriteOpener(&outputs);
         return true;

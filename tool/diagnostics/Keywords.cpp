@@ -1,8 +1,8 @@
 #include "tool/diagnostics/Keywords.h"
 
 #include <algorithm>
-#include <string>
-#include <vector>
+#include <cstring>
+#include <numeric>
 
 #include "tool/diagnostics/Words.h"
 
@@ -10,57 +10,76 @@ using namespace Vesk_Hdl;
 
 namespace {
 
-/// All keywords, sorted in lower case: `check` asks for one at each line.
-class Keywords {
-public:
-    struct Entry {
-        std::string text;
-        CommandHelp const *command;
-    };
+constexpr int MAX_KEYWORD_WORDS = 5;
+constexpr std::size_t MAX_WORD = 40; ///< no word of a keyword comes near it
 
-    Keywords() {
-        for (int i = 0; i < CommandReference::GetCount(); ++i) {
-            CommandHelp const *const command = CommandReference::GetAt(i);
-            entries.push_back({Lowercase(command->keyword), command});
-            longest = std::max(longest, entries.back().text.size());
+/// The number of edits (a letter more, less, other, or two exchanged) between two texts, case
+/// ignored.
+int Distance(std::string_view left, std::string_view right) {
+    std::size_t const width = right.size() + 1;
+    std::vector<int> before(width);
+    std::vector<int> row(width);
+    std::vector<int> beforeThat(width);
+    std::iota(row.begin(), row.end(), 0);
+    for (std::size_t i = 1; i <= left.size(); ++i) {
+        beforeThat.swap(before);
+        before.swap(row);
+        row[0] = static_cast<int>(i);
+        for (std::size_t j = 1; j < width; ++j) {
+            auto const same = [&](std::size_t a, std::size_t b) {
+                return SameIgnoringCase(left.substr(a, 1), right.substr(b, 1));
+            };
+            row[j] = std::min(
+                {before[j] + 1, row[j - 1] + 1, before[j - 1] + (same(i - 1, j - 1) ? 0 : 1)});
+            if (i > 1 && j > 1 && same(i - 1, j - 2) && same(i - 2, j - 1))
+                row[j] = std::min(row[j], beforeThat[j - 2] + 1);
         }
-        std::sort(entries.begin(), entries.end(),
-                  [](Entry const &a, Entry const &b) { return a.text < b.text; });
     }
-
-    std::size_t GetLongest() const { return longest; }
-    /// The first one at or behind a text, the end for none.
-    std::vector<Entry>::const_iterator From(std::string const &text) const {
-        return std::lower_bound(
-            entries.begin(), entries.end(), text,
-            [](Entry const &entry, std::string const &wanted) { return entry.text < wanted; });
-    }
-    std::vector<Entry>::const_iterator End() const { return entries.end(); }
-
-private:
-    std::vector<Entry> entries;
-    std::size_t longest = 0;
-};
+    return row[width - 1];
+}
 
 } // namespace
 
-CommandHelp const *KeywordOf(StringArray const &tokens, int &words) {
-    static Keywords const keywords;
-    CommandHelp const *found = nullptr;
-    std::string begin; // the first tokens, joined: a token may hold blanks, too
-    for (int i = 0; i < std::min(tokens.GetSize(), MOST_KEYWORD_WORDS); ++i) {
-        std::string_view const token = tokens.At(i).View();
-        if (begin.size() + token.size() > keywords.GetLongest())
-            break;
-        begin += i > 0 ? " " : "";
-        begin += Lowercase(token);
-        auto const at = keywords.From(begin);
-        if (at == keywords.End() || at->text.compare(0, begin.size(), begin) != 0)
-            break;
-        if (at->text.size() == begin.size()) {
-            found = at->command;
-            words = i + 1;
-        }
+std::string KeywordPart(StringArray const &tokens) {
+    std::string part;
+    for (int i = 0; i < tokens.GetSize() && i < MAX_KEYWORD_WORDS; ++i)
+        (part += i > 0 ? " " : "") += tokens.At(i).View().substr(0, MAX_WORD);
+    return part;
+}
+
+std::vector<std::string_view> NextKeywordWords(std::string_view words) {
+    std::string const begin = std::string(words) + (words.empty() ? "" : " ");
+    std::vector<std::string_view> found;
+    for (int i = 0; i < CommandReference::GetCount(); ++i) {
+        std::string_view rest = CommandReference::GetAt(i)->keyword;
+        if (!SameIgnoringCase(rest.substr(0, begin.size()), begin))
+            continue;
+        rest.remove_prefix(begin.size());
+        rest = rest.substr(0, rest.find(' '));
+        if (std::find(found.begin(), found.end(), rest) == found.end())
+            found.push_back(rest);
     }
     return found;
+}
+
+CommandHelp const *NearestKeyword(std::string_view keywordPart) {
+    std::vector<std::string> const given = WordsOf(keywordPart);
+    CommandHelp const *nearest = nullptr;
+    int least = 0;
+    for (int i = 0; i < CommandReference::GetCount(); ++i) {
+        CommandHelp const &candidate = *CommandReference::GetAt(i);
+        std::string begin; // as many words as the keyword has
+        for (int word = 0; word < candidate.words && word < static_cast<int>(given.size()); ++word)
+            (begin += word > 0 ? " " : "") += given[static_cast<std::size_t>(word)];
+        int const length = static_cast<int>(std::strlen(candidate.keyword));
+        int const farthest = nearest ? std::min(length / 3, least - 1) : length / 3;
+        if (std::abs(static_cast<int>(begin.size()) - length) > farthest)
+            continue; // it takes an edit for each letter more or less
+        int const distance = Distance(begin, candidate.keyword);
+        if (distance <= farthest) {
+            nearest = &candidate;
+            least = distance;
+        }
+    }
+    return nearest;
 }

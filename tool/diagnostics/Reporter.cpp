@@ -4,7 +4,7 @@
 #include <array>
 #include <ostream>
 
-#include "tool/diagnostics/Format.h"
+#include "tool/diagnostics/Terminal.h"
 
 namespace {
 
@@ -169,12 +169,12 @@ void Reporter::Put(Diagnostic const &diagnostic) {
 void Reporter::ReportText(Diagnostic const &diagnostic) {
     auto const colour = [this](char const *code) { return reportStyle.colour ? code : ""; };
     auto const head = [&](Place const &place, Word const &word, std::string_view text) {
-        stream << colour(BOLD) << Harmless(place.file);
+        stream << colour(BOLD) << SanitizeForTerminal(place.file);
         for (unsigned long const number : {place.line, static_cast<unsigned long>(place.column)})
             if (number > 0)
                 stream << ':' << number;
         stream << ": " << colour(PLAIN) << colour(word.colour) << word.text << ": " << colour(PLAIN)
-               << Harmless(text);
+               << SanitizeForTerminal(text);
     };
 
     head(diagnostic.place, WordOf(diagnostic.severity), diagnostic.message);
@@ -186,7 +186,7 @@ void Reporter::ReportText(Diagnostic const &diagnostic) {
     ReportSource(diagnostic, colour(GREEN), colour(PLAIN));
     for (std::string const &hint : diagnostic.hints)
         stream << "  " << colour(HINT_WORD.colour) << HINT_WORD.text << ": " << colour(PLAIN)
-               << Harmless(hint) << '\n';
+               << SanitizeForTerminal(hint) << '\n';
     for (Diagnostic::Note const &note : diagnostic.notes) {
         head(note.place, NOTE_WORD, note.text);
         stream << '\n';
@@ -205,8 +205,8 @@ void Reporter::ReportSource(Diagnostic const &diagnostic, char const *colour, ch
         std::min<std::size_t>(diagnostic.place.column - 1 - begin, source.size());
     bool const clipFront = begin > 0;
     std::size_t const marked = CharactersIn(source.substr(at, diagnostic.place.length));
-    stream << "  " << (clipFront ? CLIPPED : "") << Harmless(source) << (goesOn ? CLIPPED : "")
-           << '\n'
+    stream << "  " << (clipFront ? CLIPPED : "") << SanitizeForTerminal(source)
+           << (goesOn ? CLIPPED : "") << '\n'
            << std::string(2 + (clipFront ? sizeof CLIPPED - 1 : 0) +
                               CharactersIn(source.substr(0, at)),
                           ' ')

@@ -6,6 +6,7 @@
 #include <unistd.h>
 
 #include "tool/diagnostics/Format.h"
+#include "tool/diagnostics/Terminal.h"
 
 using namespace std::chrono_literals;
 
@@ -60,7 +61,7 @@ void Progress::Draw() {
 
 void Progress::TellWrite(char const *fileName) {
     if (shown && Clock::now() >= nextDraw)
-        Put("writing " + Harmless(fileName));
+        Put("writing " + SanitizeForTerminal(fileName));
 }
 
 void Progress::Put(std::string const &text) {

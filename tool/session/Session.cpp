@@ -2,7 +2,7 @@
 
 #include <cstring>
 
-#include "tool/diagnostics/Blame.h"
+#include "tool/diagnostics/RefusalExplainer.h"
 
 using namespace Vesk_Hdl;
 
@@ -14,12 +14,12 @@ Session::Session(std::string const &modelName) {
 
 std::optional<Diagnostic> Session::RunLine(std::string const &line, Place const &place) {
     if (std::size_t const at = line.find('\0'); at != std::string::npos)
-        return BlameNul(line, place, at);
+        return ExplainNul(line, place, at);
     int const writesBefore = model->GetLastWrite().number;
     try {
         engine.Execute(line.c_str());
     } catch (Exception const &refusal) {
-        return BlameRefusal(line, place, refusal.getDescription(), *model);
+        return ExplainRefusal(line, place, refusal, *model, withHints);
     }
     // Commands are kept as done until somebody clears them, and the tool never looks back. One at a
     // time: its memory is then at hand for the next one.
@@ -27,7 +27,7 @@ std::optional<Diagnostic> Session::RunLine(std::string const &line, Place const 
     WriteStatus const &write = model->GetLastWrite();
     if (write.number == writesBefore || write.error == 0)
         return std::nullopt;
-    return BlameWrite(line, place, write);
+    return ExplainWrite(line, place, write);
 }
 
 int Session::Write(char const *language, std::string const &file) {

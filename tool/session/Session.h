@@ -19,9 +19,14 @@ public:
     /// failure.
     int Write(char const *language, std::string const &file);
 
+    /// Whether the diagnostics of refused lines get hints for which the design is searched; they do
+    /// unless this turns it off.
+    void SetHints(bool wanted) { withHints = wanted; }
+
     Vesk_Hdl::Model &GetModel() { return *model; }
 
 private:
     Vesk_Hdl::Engine engine;
     Vesk_Hdl::Model *model; ///< the engine's current one
+    bool withHints = true;
 };

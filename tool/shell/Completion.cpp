@@ -3,17 +3,13 @@
 #include <algorithm>
 #include <filesystem>
 
-#include "tool/diagnostics/Blame.h"
+#include "tool/diagnostics/Keywords.h"
 #include "tool/diagnostics/Words.h"
 
 using namespace Vesk_Hdl;
 namespace fs = std::filesystem;
 
 namespace {
-
-bool BeginsWith(std::string_view text, std::string_view begin) {
-    return SameIgnoringCase(text.substr(0, begin.size()), begin);
-}
 
 class Completer {
 public:
@@ -70,102 +66,87 @@ private:
         std::string const last = before.empty() ? word : before.back() + word;
         bool const lower =
             std::any_of(last.begin(), last.end(), [](char c) { return c >= 'a' && c <= 'z'; });
-        for (int i = 0; i < CommandReference::GetCount(); ++i) {
-            std::string_view rest = CommandReference::GetAt(i)->keyword;
-            if (!words.empty()) {
-                if (!BeginsWith(rest, words + " "))
-                    continue;
-                rest.remove_prefix(words.size() + 1);
-            }
-            std::string const next(rest.substr(0, rest.find(' ')));
-            Offer(lower ? Lowercase(next) : next);
-        }
+        for (std::string_view const next : NextKeywordWords(words))
+            Offer(lower ? Lowercase(next) : std::string(next));
     }
 
+    /// The argument that comes next, and if it may be left out, the one after it.
     void OfferArguments() {
         StringArray tokens;
         for (std::string const &each : before)
             tokens.Add(each.c_str());
-        int words = 0;
-        CommandHelp const *const command = KeywordOf(tokens, words);
+        CommandHelp const *const command = CommandReference::FindFor(tokens);
         if (!command)
             return;
-        std::string grammar = command->grammar;
-        std::erase_if(grammar, [](char c) { return c == '[' || c == ']'; });
-        std::vector<std::string> const placeholders = WordsOf(grammar);
-        auto const at = before.size() - static_cast<std::size_t>(words);
-        if (at >= placeholders.size())
-            return;
-        bool const names = BeginsWith(command->keyword, "ADD COMPONENT") && words == 2;
-        bool const makesInstance = SameIgnoringCase(command->keyword, "ADD INSTANCE") && at == 1;
-        if (!names && !makesInstance) // those are new
-            OfferPlaceholder(placeholders[at]);
-        // What may be missing: the next one may stand here.
-        if (placeholders[at] == "-TYPE=type" || placeholders[at] == "option")
-            OfferPlaceholder(placeholders[std::min(at + 1, placeholders.size() - 1)]);
-        if (placeholders.back() == "file" && placeholders[at] != "file")
-            OfferFiles();
-    }
-
-    void OfferPlaceholder(std::string_view placeholder) {
-        Netlist const &netlist = *model.GetNetlist();
-        static constexpr std::string_view POLARITIES[] = {"Input", "Output", "BiDirectional"};
-        static constexpr std::string_view OPTIONS[] = {"-NOHEADER", "-APPEND", "-OVERWRITE"};
-        static constexpr std::string_view FLAGS[] = {"true", "false"};
-        static constexpr std::string_view TOOLS[] = {"QRT",      "EXEMPLAR",    "SYNPLICITY",
-                                                     "SYNOPSYS", "VERILOG2001", "PRECISION"};
-        static constexpr std::string_view SETTINGS[] = {"-GENERIC=NONE",   "-GENERIC=SYN",
-                                                        "-GENERIC=NOSYN",  "-SYNATTR=NONE",
-                                                        "-SYNATTR=ASSIGN", "-SYNATTR=ASSIGNNODEC"};
-        static constexpr std::string_view TYPES[] = {
-            "-TYPE=String", "-TYPE=Integer",   "-TYPE=Float", "-TYPE=Boolean",
-            "-TYPE=Bit",    "-TYPE=BitVector", "-TYPE=User"};
-        for (std::size_t at = 0; at <= placeholder.size();) {
-            std::size_t const end = std::min(placeholder.find('|', at), placeholder.size());
-            std::string_view const each = placeholder.substr(at, end - at);
-            at = end + 1;
-            if (each == "component")
-                OfferNames(netlist.GetComponentIterator());
-            else if (each == "instance" && placeholder == each)
-                OfferNames(netlist.GetInstanceIterator());
-            else if (each == "signal" && placeholder.find("component") == std::string_view::npos)
-                OfferNames(netlist.GetSignalIterator());
-            else if (each == "instance.pin")
-                OfferPins(netlist.GetInstanceIterator(), model.GetInstance(Owner().c_str()));
-            else if (each == "component.pin")
-                OfferPins(netlist.GetComponentIterator(), model.GetComponent(Owner().c_str()));
-            else if (each == "polarity")
-                OfferAll(POLARITIES);
-            else if (each == "option")
-                OfferAll(OPTIONS);
-            else if (each == "flag")
-                OfferAll(FLAGS);
-            else if (each == "tool")
-                OfferAll(TOOLS);
-            else if (each == "setting")
-                OfferAll(SETTINGS);
-            else if (each == "-TYPE=type")
-                OfferAll(TYPES);
-            else if (each == "file")
-                OfferFiles();
-            else if (placeholder.find('|') != std::string_view::npos)
-                Offer(each); // a word that stands for itself
+        std::span<Argument const> const arguments = command->arguments;
+        std::size_t next = 0;
+        for (auto token = static_cast<std::size_t>(command->words); token < before.size();
+             ++token) {
+            while (next < arguments.size() && !MayBe(arguments[next], before[token]))
+                ++next;
+            ++next;
+        }
+        while (next < arguments.size()) {
+            OfferArgument(arguments[next]);
+            if (!arguments[next++].optional)
+                break;
         }
     }
 
-    std::string Owner() const { return word.substr(0, word.find('.')); }
+    /// Whether that word is what gives an argument, which may be left out. An option is known by
+    /// its words; any other argument is taken to be there.
+    static bool MayBe(Argument const &argument, std::string const &text) {
+        ArgumentHelp const &help = CommandReference::GetArgument(argument.kind);
+        if (!argument.optional || help.choices.empty())
+            return true;
+        for (Vocabulary::Choice const &choice : help.choices)
+            if (*choice.prefix ? BeginsWith(text, choice.prefix)
+                               : Vocabulary::IndexOf(choice.words, text.c_str()) >= 0)
+                return true;
+        return false;
+    }
 
-    /// Owners up to the point, behind it the pins of the one that is named.
-    template <class T, class Holder> void OfferPins(Iterator<T> owners, Holder const *owner) {
-        if (word.find('.') == std::string::npos) {
-            ForEach(owners, [this](Object const *each) {
+    void OfferArgument(Argument const &argument) {
+        if (argument.declares)
+            return; // a new name
+        OfferKind(argument.kind);
+        OfferKind(argument.alternative);
+    }
+
+    void OfferKind(ArgumentKind kind) {
+        Netlist const &netlist = *model.GetNetlist();
+        std::string const holder = word.substr(0, FindPinPoint(word));
+        switch (kind) {
+        case ArgumentKind::COMPONENT:
+            return OfferNames(netlist.GetComponentIterator());
+        case ArgumentKind::INSTANCE:
+            return OfferNames(netlist.GetInstanceIterator());
+        case ArgumentKind::SIGNAL:
+            return OfferNames(netlist.GetSignalIterator());
+        case ArgumentKind::COMPONENT_PIN:
+            return OfferPins(netlist.GetComponentIterator(), model.GetComponent(holder.c_str()));
+        case ArgumentKind::INSTANCE_PIN:
+            return OfferPins(netlist.GetInstanceIterator(), model.GetInstance(holder.c_str()));
+        case ArgumentKind::FILE_NAME:
+            return OfferFiles();
+        default:
+            for (Vocabulary::Choice const &choice : CommandReference::GetArgument(kind).choices)
+                for (char const *const each : choice.words)
+                    Offer(std::string(choice.prefix) + each);
+        }
+    }
+
+    /// Holders up to the point, then the pins of the one that is named.
+    template <class T, class Holder> void OfferPins(Iterator<T> holders, Holder const *holder) {
+        if (FindPinPoint(word) == std::string::npos) {
+            ForEach(holders, [this](Object const *each) {
                 Offer(std::string(each->GetNameRef().View()) + ".");
             });
             result.wordEnds = false;
-        } else if (owner) {
-            ForEach(owner->GetPinIterator(), [&](Pin const *pin) {
-                Offer(Owner() + "." + std::string(pin->GetNameRef().View()));
-            });
+        } else if (holder) {
+            std::string const begin = word.substr(0, FindPinPoint(word) + 1);
+            ForEach(holder->GetPinIterator(),
+                    [&](Pin const *pin) { Offer(begin + std::string(pin->GetNameRef().View())); });
         }
     }
 

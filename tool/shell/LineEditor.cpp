@@ -6,7 +6,7 @@
 #include <histedit.h>
 #include <unistd.h>
 
-#include "tool/diagnostics/Format.h"
+#include "tool/diagnostics/Terminal.h"
 
 namespace {
 
@@ -24,7 +24,7 @@ void List(std::vector<std::string> const &candidates) {
             std::fputc('\n', stdout);
             column = 0;
         }
-        std::fprintf(stdout, "%-*s", static_cast<int>(width), Harmless(each).c_str());
+        std::fprintf(stdout, "%-*s", static_cast<int>(width), SanitizeForTerminal(each).c_str());
         column += width;
     }
     std::fputc('\n', stdout);

@@ -14,7 +14,7 @@ class Model;
 class VESK_HDL_API Command {
 public:
     /// The model is not owned. Null is legal up to Execute.
-    explicit Command(Model *model = nullptr);
+    Command(Model *model = nullptr);
     virtual ~Command();
     /// Reads the whole line's tokens, keyword words included, by index from 0. False if the
     /// arguments are not acceptable.
@@ -81,8 +81,10 @@ public:
 
     /// Makes the command of a line, has it read its arguments and runs it; true. Raises "Command
     /// not find.\n" (the wording is part of the interface) if no keyword matches, "KEYWORD: Invalid
-    /// Arguments.\n", and whatever the command raises. What failed is deleted; what it did before
-    /// it failed stays.
+    /// Arguments.\n", and the refusal of the command, always as a new Exception, also if the
+    /// command threw an object of a class derived from Exception. What the command did before it
+    /// failed stays. A refused command is deleted, and so is one that ran out of memory. One that
+    /// threw anything else is not deleted: it belongs to the client that made it.
     bool CreateAndExecute(StringArray const &tokens, Model *model, CommandFactory *factory);
     /// Takes over a command; null is ignored.
     void AddDoneCommand(Command *command);

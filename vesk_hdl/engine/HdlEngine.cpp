@@ -3,9 +3,9 @@
 #include "vesk_hdl/engine/Keywords.h"
 #include "vesk_hdl/hdl/NetlistHeader.h"
 #include "vesk_hdl/model/HdlOptions.h"
+#include "vesk_hdl/model/Messages.h"
 #include "vesk_hdl/netlist/Netlist.h"
 #include "vesk_hdl/text/OutStream.h"
-#include "vesk_hdl/text/Raise.h"
 #include "vesk_hdl/text/basis/File.h"
 
 namespace Vesk_Hdl {
@@ -146,7 +146,7 @@ namespace {
 
 void ExecuteOn(Model *model, char const *line) {
     if (!model)
-        VESK_HDL_RAISE("HdlEngine", "Missing Model.\n");
+        VESK_HDL_RAISE("HdlEngine", Messages::MISSING_MODEL);
     model->Execute(line);
 }
 

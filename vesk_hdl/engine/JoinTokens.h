@@ -6,6 +6,14 @@ namespace Vesk_Hdl {
 
 /// The tokens from an index to the last, with single blanks between them. What the tokenizer took
 /// away, quotes and runs of blanks, does not come back.
-Basis::StringBase<char> JoinTokens(StringArray const &tokens, int first);
+inline Basis::StringBase<char> JoinTokens(StringArray const &tokens, int first) {
+    Basis::StringBase<char> joined;
+    for (int i = first; i < tokens.GetSize(); ++i) {
+        if (i > first)
+            joined += ' ';
+        joined += tokens.At(i);
+    }
+    return joined;
+}
 
 } // namespace Vesk_Hdl

@@ -3,29 +3,25 @@
 #include <string>
 #include <string_view>
 
-// A pin in a line is HOLDER.PIN: a first part that a point ends, and at least one more character.
-// It is split at the first point behind the first other character. A bus form holds no point and so
-// names a signal.
-
 namespace Vesk_Hdl {
 
-/// Where the first part ends, or npos if the token names no pin.
-inline std::size_t FindPinPoint(std::string_view token) {
+/// A pin on a command line is one token, HOLDER.PIN. The holder ends at the first point behind its
+/// first other character: points in front of it belong to it, further ones to the pin. This is the
+/// index of that point, npos if there is none. The pin behind it may be empty, as in a line that is
+/// still being typed.
+constexpr std::size_t FindPinPoint(std::string_view token) {
     std::size_t const begin = token.find_first_not_of('.');
-    std::size_t const point = begin == token.npos ? begin : token.find('.', begin);
-    return point == token.npos || point + 1 == token.size() ? token.npos : point;
+    return begin == token.npos ? begin : token.find('.', begin);
 }
 
-inline bool IsPinReference(std::string_view token) { return FindPinPoint(token) != token.npos; }
-
-/// If the token names no pin, nothing changes. Short names, as most are, take no memory of their
-/// own.
-inline bool SplitPinReference(std::string_view token, std::string &left, std::string &right) {
+/// Splits a token that names a pin. If it names none, since there is no such point or nothing
+/// behind it, the answer is false and both texts stay as they were.
+inline bool SplitPinReference(std::string_view token, std::string &holder, std::string &pin) {
     std::size_t const point = FindPinPoint(token);
-    if (point == token.npos)
+    if (point == token.npos || point + 1 == token.size())
         return false;
-    left = token.substr(0, point);
-    right = token.substr(point + 1);
+    holder = token.substr(0, point);
+    pin = token.substr(point + 1);
     return true;
 }
 

@@ -17,7 +17,7 @@ class VerilogStatements;
 class VESK_HDL_API VerilogNetlister {
 public:
     /// Points at the stream, which must outlive the netlister.
-    explicit VerilogNetlister(OutStream &stream);
+    VerilogNetlister(OutStream &stream);
     ~VerilogNetlister();
     VerilogNetlister(VerilogNetlister const &) = delete;
     VerilogNetlister &operator=(VerilogNetlister const &) = delete;

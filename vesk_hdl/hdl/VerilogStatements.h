@@ -17,7 +17,7 @@ class OutStream;
 class VESK_HDL_API VerilogStatements {
 public:
     /// Points at the stream, which must outlive this object.
-    explicit VerilogStatements(OutStream &stream);
+    VerilogStatements(OutStream &stream);
     ~VerilogStatements();
 
     /// `timescale UNIT / PRECISION¶

@@ -19,7 +19,7 @@ class VhdlStatements;
 class VESK_HDL_API VhdlNetlister {
 public:
     /// Points at the stream, which must outlive the netlister.
-    explicit VhdlNetlister(OutStream &stream);
+    VhdlNetlister(OutStream &stream);
     /// Shares the statements and copies the set of declared attributes.
     VhdlNetlister(VhdlNetlister &other);
     ~VhdlNetlister();

@@ -18,7 +18,7 @@ class OutStream;
 class VESK_HDL_API VhdlStatements {
 public:
     /// Points at the stream, which must outlive this object.
-    explicit VhdlStatements(OutStream &stream);
+    VhdlStatements(OutStream &stream);
 
     /// -- VHDL model created from FILE - TIME¶, without " created from FILE" for an empty or null
     /// name

@@ -3,14 +3,11 @@
 #include "vesk_hdl/model/Messages.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/Netlist.h"
-#include "vesk_hdl/text/Raise.h"
-#include "vesk_hdl/text/basis/OrEmpty.h"
 
 #define RAISE(...) VESK_HDL_RAISE("HdlModel", __VA_ARGS__)
 
 namespace Vesk_Hdl {
 
-using Basis::OrEmpty;
 using Basis::StringBase;
 
 /// Names are shared by components, instances and signals; those of pins and attributes are not.
@@ -20,7 +17,7 @@ bool Model::AddComponent(char const *name) {
     if (!name)
         RAISE(Messages::INVALID_NAME);
     if (IsNamedUsed(name))
-        RAISE(Messages::IDENTIFIER_DEFINED, name);
+        RAISE(Messages::NAME_TAKEN, name);
     GetNetlist()->Add(new Component(name));
     SetModifiedFlag(true);
     return true;
@@ -32,9 +29,9 @@ bool Model::AddPin(char const *pinName, Polarity const &polarity, char const *co
         RAISE(Messages::INVALID_NAME);
     Component *const component = GetComponent(componentName);
     if (!component)
-        RAISE(Messages::COMPONENT_NOT_FOUND, OrEmpty(componentName));
+        RAISE(Messages::COMPONENT_NOT_FOUND, componentName);
     if (component->GetPin(pinName))
-        RAISE(Messages::COMPONENT_HAS_PIN, OrEmpty(componentName), pinName);
+        RAISE(Messages::PIN_TAKEN, componentName, pinName);
     component->AddPin(pinName, polarity, initialValue);
     SetModifiedFlag(true);
     return true;
@@ -46,10 +43,10 @@ bool Model::AddInstance(char const *instanceName, char const *componentName) {
     Netlist &netlist = *GetNetlist();
     Names::Key const key(instanceName);
     if (netlist.IsNameUsed(key))
-        RAISE(Messages::IDENTIFIER_DEFINED, instanceName);
+        RAISE(Messages::NAME_TAKEN, instanceName);
     Component *const component = GetComponent(componentName);
     if (!component)
-        RAISE(Messages::COMPONENT_NOT_FOUND, OrEmpty(componentName));
+        RAISE(Messages::COMPONENT_NOT_FOUND, componentName);
     if (netlist.FindInstance(key)) // a guard: the identifier check has caught this
         RAISE(Messages::INSTANCE_EXISTS, instanceName);
     netlist.Add(new Instance(instanceName, component));
@@ -63,10 +60,10 @@ bool Model::AddSignal(char const *name) {
     Netlist &netlist = *GetNetlist();
     Names::Key const key(name);
     if (netlist.IsNameUsed(key))
-        RAISE(Messages::IDENTIFIER_DEFINED, name);
+        RAISE(Messages::NAME_TAKEN, name);
     if (Names::IsBusName(key.View())) {
         if (netlist.GetParentBus(name))
-            RAISE(Messages::SIGNAL_DECLARED, name);
+            RAISE(Messages::BUS_DECLARED, name);
         netlist.Add(new Bus(name));
     } else {
         netlist.Add(new ScalarSignal(name));

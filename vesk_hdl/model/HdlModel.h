@@ -44,7 +44,7 @@ class VESK_HDL_API Model {
 public:
     /// The factory makes the commands; it is not owned and must outlive the model. Without one no
     /// line can run: each raises "Command not find.\n".
-    explicit Model(CommandFactory *factory = nullptr);
+    Model(CommandFactory *factory = nullptr);
     virtual ~Model();
     Model(Model const &) = delete;
     Model &operator=(Model const &) = delete;

@@ -1,47 +1,52 @@
 // Model's attributes and comments, set out as a grid: an owner a block, an operation a line. Each
-// line finds the owner, with the owner's own message, and calls a base operation.
+// line finds the owner, with the message for that owner, and calls a base operation.
 
 #include "vesk_hdl/model/HdlModel.h"
 
 #include "vesk_hdl/model/Messages.h"
 #include "vesk_hdl/netlist/Netlist.h"
-#include "vesk_hdl/text/Raise.h"
-#include "vesk_hdl/text/basis/OrEmpty.h"
 
 #define RAISE(...) VESK_HDL_RAISE("HdlModel", __VA_ARGS__)
 
 using namespace Vesk_Hdl;
-using Basis::OrEmpty;
 
 namespace {
 
 // The finders: never null, but an exception.
 
-template <class T> T *Found(T *object, char const *message, char const *name) {
+template <class T, class... Names> T *Found(T *object, Message const &message, Names... names) {
     if (!object)
-        RAISE(message, OrEmpty(name));
+        RAISE(message, names...);
     return object;
 }
 
 Component *FindComponent(Model const &model, char const *name) {
-    return Found(model.GetComponent(name), Messages::OWNER_NOT_FOUND, name);
+    return Found(model.GetComponent(name), Messages::COMPONENT_MISSING, name);
 }
 
 Instance *FindInstance(Model const &model, char const *name) {
-    return Found(model.GetInstance(name), Messages::OWNER_NOT_FOUND, name);
+    return Found(model.GetInstance(name), Messages::INSTANCE_MISSING, name);
+}
+
+/// Required of the operations that set options: a missing instance is a missing attribute.
+Instance *FindInstanceToSet(Model const &model, char const *name, char const *attribute) {
+    return Found(model.GetInstance(name), Messages::INSTANCE_OF_ATTRIBUTE_MISSING, attribute, name);
 }
 
 Signal *FindSignal(Model const &model, char const *name) {
-    return Found(model.GetSignal(name), Messages::OWNER_NOT_FOUND, name);
+    return Found(model.GetSignal(name), Messages::SIGNAL_MISSING, name);
 }
 
-/// A missing owner of the pin is told as a missing pin.
 Pin *FindComponentPin(Model const &model, char const *component, char const *pin) {
-    return Found(model.GetPin(pin, model.GetComponent(component)), Messages::PIN_NOT_FOUND, pin);
+    auto *const owner =
+        Found(model.GetComponent(component), Messages::COMPONENT_OF_PIN_MISSING, pin, component);
+    return Found(owner->GetPin(pin), Messages::PIN_NOT_FOUND, pin);
 }
 
 Pin *FindInstancePin(Model const &model, char const *instance, char const *pin) {
-    return Found(model.GetPin(pin, model.GetInstance(instance)), Messages::PIN_NOT_FOUND, pin);
+    auto *const owner =
+        Found(model.GetInstance(instance), Messages::INSTANCE_OF_PIN_MISSING, pin, instance);
+    return Found(owner->GetPin(pin), Messages::PIN_NOT_FOUND, pin);
 }
 
 Attribute *FindAttr(AttributeHolder const *holder, char const *name) {
@@ -53,15 +58,20 @@ void RequireName(char const *name) {
         RAISE(Messages::INVALID_NAME);
 }
 
-void RequireWord(bool known) {
-    if (!known)
-        RAISE(Messages::INVALID_GENERIC_VALUE);
+void SetGeneric(Attribute &attribute, char const *word) {
+    if (!attribute.SetGeneric(word))
+        RAISE(Messages::INVALID_GENERIC_WORD, word);
+}
+
+void SetSynAttr(Attribute &attribute, char const *word) {
+    if (!attribute.SetSynAttr(word))
+        RAISE(Messages::INVALID_SYNTHESIS_WORD, word);
 }
 
 void SetUserTypeOf(Attribute *attribute, char const *userType) {
     auto *const user = dynamic_cast<AttributeUser *>(attribute);
     if (!user)
-        RAISE(Messages::INVALID_ATTRIBUTE_TYPE);
+        RAISE(Messages::NOT_A_USER_ATTRIBUTE, attribute->GetNameRef());
     user->SetUserType(userType);
 }
 
@@ -91,7 +101,7 @@ void Model::AddAttr(AttributeHolder *holder, char const *name, char const *value
     } else {
         Attribute *const added = AttributeFactory::GetInstance().CreateAttribute(type, name, value);
         if (!added)
-            RAISE(Messages::INVALID_ATTRIBUTE_TYPE);
+            RAISE(Messages::INVALID_ATTRIBUTE_TYPE, type);
         holder->AddAttr(added);
     }
     SetModifiedFlag(true);
@@ -100,14 +110,14 @@ void Model::AddAttr(AttributeHolder *holder, char const *name, char const *value
 void Model::SetGenericAttrValue(AttributeHolder *holder, char const *name, char const *word) {
     if (!holder)
         return;
-    RequireWord(FindAttr(holder, name)->SetGeneric(word));
+    SetGeneric(*FindAttr(holder, name), word);
     SetModifiedFlag(true);
 }
 
 void Model::SetSynAttrValue(AttributeHolder *holder, char const *name, char const *word) {
     if (!holder)
         return;
-    RequireWord(FindAttr(holder, name)->SetSynAttr(word));
+    SetSynAttr(*FindAttr(holder, name), word);
     SetModifiedFlag(true);
 }
 
@@ -173,8 +183,7 @@ void Model::AddComponentComment(char const *component, char const *text) {
         FindComponent(*this, component)->AddComment(text);
 }
 
-// An instance. A missing one is told as itself by two of the operations and as a missing attribute
-// by the two that set options: meant so.
+// An instance.
 
 Attribute *Model::GetInstanceOrComponentAttr(char const *name, Instance *instance) const {
     if (!instance)
@@ -189,13 +198,13 @@ void Model::AddInstanceAttr(char const *instance, char const *name, char const *
     AddAttr(FindInstance(*this, instance), name, value, type);
 }
 void Model::SetInstanceGenericAttrValue(char const *instance, char const *name, char const *word) {
-    Instance *const owner = GetInstance(instance);
-    RequireWord(OwnAttr(owner, GetInstanceOrComponentAttr(name, owner), name)->SetGeneric(word));
+    Instance *const owner = FindInstanceToSet(*this, instance, name);
+    SetGeneric(*OwnAttr(owner, GetInstanceOrComponentAttr(name, owner), name), word);
     SetModifiedFlag(true);
 }
 void Model::SetInstanceSynAttrValue(char const *instance, char const *name, char const *word) {
-    Instance *const owner = GetInstance(instance);
-    RequireWord(OwnAttr(owner, GetInstanceOrComponentAttr(name, owner), name)->SetSynAttr(word));
+    Instance *const owner = FindInstanceToSet(*this, instance, name);
+    SetSynAttr(*OwnAttr(owner, GetInstanceOrComponentAttr(name, owner), name), word);
     SetModifiedFlag(true);
 }
 void Model::SetInstanceAttrValue(char const *instance, char const *name, char const *value) {

@@ -6,7 +6,6 @@
 #include "vesk_hdl/model/Messages.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/Netlist.h"
-#include "vesk_hdl/text/Raise.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
 
 #define RAISE(...) VESK_HDL_RAISE("HdlModel", __VA_ARGS__)
@@ -182,17 +181,13 @@ bool Model::ConnectSignalToPin(char const *signalName, char const *instanceName,
     InHand inHand;
     Signal *const signal = GetOrCreateSignal(signalName, inHand);
     if (!signal)
-        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(signalName));
+        RAISE(Messages::SIGNAL_NOT_FOUND, signalName);
     Instance const *const instance = GetInstance(instanceName);
-    if (!instance) // the word "Signal" is meant
-        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(instanceName));
+    if (!instance)
+        RAISE(Messages::CONNECTED_INSTANCE_NOT_FOUND, instanceName);
     Pin *const pin = instance->GetPin(pinName);
-    if (!pin) {
-        Text joined(instanceName);
-        joined += '.';
-        joined += pinName;
-        RAISE(Messages::PIN_NOT_FOUND, joined.GetText());
-    }
+    if (!pin)
+        RAISE(Messages::INSTANCE_PIN_NOT_FOUND, instanceName, pinName);
     return Connect(signal, pin);
 }
 
@@ -201,7 +196,7 @@ bool Model::ConnectSignals(char const *left, char const *right) {
     InHand inHand;
     inHand.Add(GetOrCreateSignal(left, inHand));
     if (!inHand.GetAt(0))
-        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(left));
+        RAISE(Messages::SIGNAL_NOT_FOUND, left);
     Signal *const source = GetOrCreateSignal(sourceName, inHand);
     if (!source)
         RAISE(Messages::SIGNAL_NOT_FOUND, sourceName.GetText());
@@ -210,11 +205,11 @@ bool Model::ConnectSignals(char const *left, char const *right) {
 
 bool Model::AssignConstantToPin(char const *instanceName, char const *pinName, char const *value) {
     Instance const *const instance = GetInstance(instanceName);
-    if (!instance) // the word "Signal" is meant
-        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(instanceName));
+    if (!instance)
+        RAISE(Messages::CONNECTED_INSTANCE_NOT_FOUND, instanceName);
     Pin *const pin = instance->GetPin(pinName);
     if (!pin)
-        RAISE(Messages::PIN_NOT_FOUND, OrEmpty(pinName));
+        RAISE(Messages::PIN_NOT_FOUND, pinName);
     return AssignConstant(pin, value, instanceName);
 }
 
@@ -222,7 +217,7 @@ bool Model::AssignConstantToSignal(char const *signalName, char const *value) {
     InHand inHand;
     Signal *const signal = GetOrCreateSignal(signalName, inHand);
     if (!signal)
-        RAISE(Messages::SIGNAL_NOT_FOUND, OrEmpty(signalName));
+        RAISE(Messages::SIGNAL_NOT_FOUND, signalName);
     return AssignConstant(signal, value);
 }
 

@@ -1,20 +1,10 @@
 #include "vesk_hdl/model/HdlOptions.h"
 
-#include "vesk_hdl/text/basis/Functions.h"
+#include <algorithm>
+
+#include "vesk_hdl/netlist/Vocabulary.h"
 
 namespace Vesk_Hdl {
-
-namespace {
-
-/// The index of a word, ignoring case; 0 if it is none of them.
-template <std::size_t Count> int IndexOfWord(char const *const (&words)[Count], char const *word) {
-    for (std::size_t i = 0; i < Count; ++i)
-        if (Basis::stricmp(words[i], word) == 0)
-            return static_cast<int>(i);
-    return 0;
-}
-
-} // namespace
 
 HdlOptions::VhdlOption::VhdlOption()
     : suppressConfiguration(false), flattenBus(false), useDefaultLibrary(true), useAttrType(false),
@@ -31,14 +21,13 @@ HdlOptions::VerilogOption::~VerilogOption() = default;
 HdlOptions::VerilogOption &HdlOptions::VerilogOption::operator=(VerilogOption &other) = default;
 
 void HdlOptions::VerilogOption::SetSynthesisType(char const *word) {
-    static char const *const WORDS[] = {"QRT",      "EXEMPLAR",    "SYNPLICITY",
-                                        "SYNOPSYS", "VERILOG2001", "PRECISION"};
-    synthesisType = static_cast<SynthesisType>(IndexOfWord(WORDS, word));
+    int const tool = Vocabulary::IndexOf(Vocabulary::SYNTHESIS_TOOLS, word);
+    synthesisType = static_cast<SynthesisType>(std::max(tool, 0)); // any other word is QRT
 }
 
 HdlOptions::VerilogOption::CaseType HdlOptions::VerilogOption::GetCaseType(char const *word) const {
-    static char const *const WORDS[] = {"DEFSULT", "UPPERCASE", "LOWERCASE"};
-    return static_cast<CaseType>(CASE_DEFAULT + IndexOfWord(WORDS, word));
+    int const nameCase = Vocabulary::IndexOf(Vocabulary::NAME_CASES, word);
+    return static_cast<CaseType>(CASE_DEFAULT + std::max(nameCase, 0));
 }
 
 bool HdlOptions::VerilogOption::IsSemiColonWrittenBeforeAttr() const {

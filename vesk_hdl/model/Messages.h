@@ -1,22 +1,56 @@
 #pragma once
 
-/// The messages of refused operations on a Model, as printf formats. They are part of the
-/// interface: clients compare them. "Signal ... not found" is also what a missing instance of a
-/// connection is told by, and the generic value what a bad synthesis word is told by; kept as they
-/// stand, like "already exist" without its full stop.
+#include "vesk_hdl/text/Raise.h"
+
+/// The messages of the library, each with its kind of refusal. The texts are part of the interface:
+/// clients compare them. They are kept as they are where one text serves several kinds, and where
+/// they are misspelled or lack a full stop.
 namespace Vesk_Hdl::Messages {
 
-inline constexpr char INVALID_NAME[] = "Invalid Name.\n";
-inline constexpr char IDENTIFIER_DEFINED[] = "Identifier \"%s\" already defined.\n";
-inline constexpr char COMPONENT_NOT_FOUND[] = "Component \"%s\" not found.\n";
-inline constexpr char COMPONENT_HAS_PIN[] = "Component \"%s\" already has pin \"%s\".\n";
-inline constexpr char INSTANCE_EXISTS[] = "Instance \"%s\" already exist\n";
-inline constexpr char SIGNAL_DECLARED[] = "Signal \"%s\" already declared.\n";
-inline constexpr char SIGNAL_NOT_FOUND[] = "Signal \"%s\" not found.\n";
-inline constexpr char PIN_NOT_FOUND[] = "Pin \"%s\" not found.\n";
-inline constexpr char OWNER_NOT_FOUND[] = "\"%s\" not found.\n";
-inline constexpr char ATTRIBUTE_NOT_FOUND[] = "Attribute \"%s\" not found.\n";
-inline constexpr char INVALID_ATTRIBUTE_TYPE[] = "Invalid attribute type.\n";
-inline constexpr char INVALID_GENERIC_VALUE[] = "Invalid generic value.\n";
+using E = Exception;
+
+// Command lines.
+inline constexpr Message MISSING_MODEL = {"Missing Model.\n", E::MISSING_MODEL};
+inline constexpr Message UNKNOWN_COMMAND = {"Command not find.\n", E::UNKNOWN_COMMAND};
+inline constexpr Message INVALID_ARGUMENTS = {"%s: Invalid Arguments.\n", E::INVALID_ARGUMENTS};
+
+// Declarations.
+inline constexpr Message INVALID_NAME = {"Invalid Name.\n", E::INVALID_NAME};
+inline constexpr Message NAME_TAKEN = {"Identifier \"%s\" already defined.\n", E::NAME_TAKEN};
+inline constexpr Message INSTANCE_EXISTS = {"Instance \"%s\" already exist\n", E::NAME_TAKEN};
+inline constexpr Message BUS_DECLARED = {"Signal \"%s\" already declared.\n", E::BUS_DECLARED};
+inline constexpr Message PIN_TAKEN = {"Component \"%s\" already has pin \"%s\".\n", E::PIN_TAKEN};
+inline constexpr Message COMPONENT_NOT_FOUND = {"Component \"%s\" not found.\n",
+                                                E::COMPONENT_NOT_FOUND};
+
+// Connections. A missing instance is reported as a signal, and in one operation a missing pin with
+// its instance in front of it.
+inline constexpr Message SIGNAL_NOT_FOUND = {"Signal \"%s\" not found.\n", E::SIGNAL_NOT_FOUND};
+inline constexpr Message CONNECTED_INSTANCE_NOT_FOUND = {"Signal \"%s\" not found.\n",
+                                                         E::INSTANCE_NOT_FOUND};
+inline constexpr Message PIN_NOT_FOUND = {"Pin \"%s\" not found.\n", E::PIN_NOT_FOUND};
+inline constexpr Message INSTANCE_PIN_NOT_FOUND = {"Pin \"%s.%s\" not found.\n", E::PIN_NOT_FOUND};
+
+// Owners of attributes and comments. That of a pin is reported as the pin, and an instance whose
+// attribute gets an option as the attribute; the owner's own name follows as the subject.
+inline constexpr Message COMPONENT_MISSING = {"\"%s\" not found.\n", E::COMPONENT_NOT_FOUND};
+inline constexpr Message INSTANCE_MISSING = {"\"%s\" not found.\n", E::INSTANCE_NOT_FOUND};
+inline constexpr Message SIGNAL_MISSING = {"\"%s\" not found.\n", E::SIGNAL_NOT_FOUND};
+inline constexpr Message COMPONENT_OF_PIN_MISSING = {PIN_NOT_FOUND.text, E::COMPONENT_NOT_FOUND};
+inline constexpr Message INSTANCE_OF_PIN_MISSING = {PIN_NOT_FOUND.text, E::INSTANCE_NOT_FOUND};
+inline constexpr Message INSTANCE_OF_ATTRIBUTE_MISSING = {"Attribute \"%s\" not found.\n",
+                                                          E::INSTANCE_NOT_FOUND};
+
+// Attributes. One text serves both options.
+inline constexpr Message ATTRIBUTE_NOT_FOUND = {"Attribute \"%s\" not found.\n",
+                                                E::ATTRIBUTE_NOT_FOUND};
+inline constexpr Message INVALID_ATTRIBUTE_TYPE = {"Invalid attribute type.\n",
+                                                   E::INVALID_ATTRIBUTE_TYPE};
+inline constexpr Message NOT_A_USER_ATTRIBUTE = {"Invalid attribute type.\n",
+                                                 E::NOT_A_USER_ATTRIBUTE};
+inline constexpr Message INVALID_GENERIC_WORD = {"Invalid generic value.\n",
+                                                 E::INVALID_GENERIC_WORD};
+inline constexpr Message INVALID_SYNTHESIS_WORD = {"Invalid generic value.\n",
+                                                   E::INVALID_SYNTHESIS_WORD};
 
 } // namespace Vesk_Hdl::Messages

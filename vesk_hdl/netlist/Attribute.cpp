@@ -4,8 +4,8 @@
 #include <cstdlib>
 #include <locale.h>
 
+#include "vesk_hdl/netlist/Vocabulary.h"
 #include "vesk_hdl/text/StringArray.h"
-#include "vesk_hdl/text/basis/Functions.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
 
 namespace Vesk_Hdl {
@@ -18,22 +18,21 @@ namespace {
 /// The words of an option; the index is the value of its two bits in the flags.
 struct Option {
     unsigned int shift;
-    char const *words[3];
+    Vocabulary::Words words;
 };
-constexpr Option GENERIC = {0, {"NONE", "NOSYN", "SYN"}};
-constexpr Option SYNTHESIS = {2, {"NONE", "ASSIGN", "ASSIGNNODEC"}};
+constexpr Option GENERIC = {0, Vocabulary::GENERIC_WORDS};
+constexpr Option SYNTHESIS = {2, Vocabulary::SYNTHESIS_WORDS};
 
 unsigned int GetOption(unsigned int flags, Option const &option) {
     return (flags >> option.shift) & 3U;
 }
 
 bool SetOption(unsigned int &flags, Option const &option, char const *word) {
-    for (unsigned int value = 0; value < 3; ++value)
-        if (Basis::stricmp(word, option.words[value]) == 0) {
-            flags = (flags & ~(3U << option.shift)) | (value << option.shift);
-            return true;
-        }
-    return false;
+    int const value = Vocabulary::IndexOf(option.words, word);
+    if (value < 0)
+        return false;
+    flags = (flags & ~(3U << option.shift)) | (static_cast<unsigned int>(value) << option.shift);
+    return true;
 }
 
 /// Numbers are read and written with a decimal point whatever the client's locale says.
@@ -56,7 +55,7 @@ private:
 
 unsigned int const Attribute::DEFAULT_GENERIC = 0;
 unsigned int const Attribute::DEFAULT_SYNATTR = 0;
-char const *const Attribute::DEFAULT_ATTRTYPE = "String";
+char const *const Attribute::DEFAULT_ATTRTYPE = Vocabulary::ATTRIBUTE_TYPES[VALUE_STRING];
 
 struct Attribute::Record {
     unsigned int flags = DEFAULT_GENERIC << GENERIC.shift | DEFAULT_SYNATTR << SYNTHESIS.shift;
@@ -93,9 +92,7 @@ bool Attribute::operator==(Attribute const &other) const {
 }
 
 StringBase<char> Attribute::GetValueTypeName() const {
-    static char const *const NAMES[] = {"String", "Integer",   "Float", "Boolean",
-                                        "Bit",    "BitVector", "User"};
-    return NAMES[GetValueType()];
+    return Vocabulary::ATTRIBUTE_TYPES[GetValueType()];
 }
 
 StringBase<char> Attribute::GetGeneric() const {
@@ -206,7 +203,7 @@ StringBase<char> AttributeFloat::GetValueString() const {
 double AttributeFloat::GetValue() const { return record->value; }
 
 void AttributeBoolean::SetValue(char const *text) {
-    record->value = Basis::stricmp(text, "true") == 0;
+    record->value = Basis::stricmp(text, Vocabulary::BOOLEANS[true]) == 0;
 }
 StringBase<char> AttributeBoolean::GetValueString() const {
     return record->value ? "TRUE" : "FALSE";
@@ -287,13 +284,14 @@ bool AttributeHolder::HasAttrs() const { return record && !record->attributes.Is
 
 AttributeFactory::AttributeFactory()
     : creators(std::make_unique<IStringPtrMap<AttributeCreator>>()) {
-    creators->Add("String", AttributeString::CreateAttribute);
-    creators->Add("Integer", AttributeInteger::CreateAttribute);
-    creators->Add("Float", AttributeFloat::CreateAttribute);
-    creators->Add("Boolean", AttributeBoolean::CreateAttribute);
-    creators->Add("Bit", AttributeBit::CreateAttribute);
-    creators->Add("BitVector", AttributeBitVector::CreateAttribute);
-    creators->Add("User", AttributeUser::CreateAttribute);
+    static constexpr AttributeCreator CREATORS[] = {
+        // by ValueType
+        AttributeString::CreateAttribute, AttributeInteger::CreateAttribute,
+        AttributeFloat::CreateAttribute,  AttributeBoolean::CreateAttribute,
+        AttributeBit::CreateAttribute,    AttributeBitVector::CreateAttribute,
+        AttributeUser::CreateAttribute};
+    for (std::size_t type = 0; type < std::size(CREATORS); ++type)
+        creators->Add(Vocabulary::ATTRIBUTE_TYPES[type], CREATORS[type]);
 }
 
 AttributeFactory::~AttributeFactory() = default;

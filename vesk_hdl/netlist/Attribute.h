@@ -27,7 +27,7 @@ public:
     static unsigned int const DEFAULT_SYNATTR; ///< 0, "NONE"
     static char const *const DEFAULT_ATTRTYPE; ///< "String"
 
-    explicit Attribute(char const *name);
+    Attribute(char const *name);
     Attribute(Attribute const &other);
     ~Attribute() override;
     ObjectType GetObjectType() const override;

@@ -22,7 +22,7 @@ public:
     static char const DEFAULT_NETLIST_NAME[]; ///< "HDL_NETLIST"
 
     /// Null makes a netlist called "hdlNetlist".
-    explicit Netlist(char const *name);
+    Netlist(char const *name);
     ~Netlist() override;
     ObjectType GetObjectType() const override;
     void AcceptObject(ObjectVisitor &visitor) override;

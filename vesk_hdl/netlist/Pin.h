@@ -123,7 +123,7 @@ public:
 /// owns.
 class VESK_HDL_API Component : public Object, public AttributeHolder {
 public:
-    explicit Component(char const *name);
+    Component(char const *name);
     ~Component() override;
     ObjectType GetObjectType() const override;
     void AcceptObject(ObjectVisitor &visitor) override;

@@ -73,7 +73,7 @@ public:
 
 protected:
     Signal();
-    explicit Signal(char const *name);
+    Signal(char const *name);
 
 private:
     friend class Netlist;
@@ -96,7 +96,7 @@ private:
 /// One net.
 class VESK_HDL_API ScalarSignal : public Signal {
 public:
-    explicit ScalarSignal(char const *name);
+    ScalarSignal(char const *name);
     ~ScalarSignal() override;
     SignalType GetSignalType() const override;
     void SetPortPolarity(Polarity const &polarity) override;
@@ -119,7 +119,7 @@ private:
 /// A declared vector, BASE(LEFT:RIGHT).
 class VESK_HDL_API Bus : public Signal {
 public:
-    explicit Bus(char const *name);
+    Bus(char const *name);
     ~Bus() override;
     SignalType GetSignalType() const override;
     void SetPortPolarity(Polarity const &polarity) override;
@@ -250,7 +250,7 @@ private:
 /// nothing.
 class VESK_HDL_API CompoundBus : public Signal {
 public:
-    explicit CompoundBus(char const *name);
+    CompoundBus(char const *name);
     CompoundBus(char const *name, PtrArray<Signal *> const &members);
     ~CompoundBus() override;
     SignalType GetSignalType() const override;

@@ -3,18 +3,12 @@
 #include <cstdlib>
 #include <cstring>
 
+#include "vesk_hdl/netlist/Vocabulary.h"
 #include "vesk_hdl/text/StringArray.h"
-#include "vesk_hdl/text/basis/Functions.h"
 
 namespace Vesk_Hdl {
 
 using Basis::StringBase;
-
-namespace {
-
-char const *const POLARITY_NAMES[] = {"Input", "Output", "BiDirectional"};
-
-} // namespace
 
 Polarity::Polarity(char const *text) : value(GetValue(text)) {}
 
@@ -25,7 +19,7 @@ Polarity::Value Polarity::GetValue(char const *text) {
     if (length == 0)
         return INVALID;
     for (int i = INPUT; i <= BIDIRECTIONAL; ++i)
-        if (Basis::strnicmp(POLARITY_NAMES[i], text, length) == 0)
+        if (Basis::strnicmp(Vocabulary::POLARITIES[i], text, length) == 0)
             return static_cast<Value>(i);
     return INVALID;
 }
@@ -35,7 +29,7 @@ bool Polarity::IsValidValue(Value value) {
 }
 
 StringBase<char> Polarity::GetValueName() const {
-    return IsValidValue(value) ? POLARITY_NAMES[value] : "Output";
+    return IsValidValue(value) ? Vocabulary::POLARITIES[value] : "Output";
 }
 
 struct BitVectorValue::Record {

@@ -35,7 +35,7 @@ public:
     enum Operand : int { NEW_LINE = 0, FLUSH = 1 };
 
     /// Takes over the destination, which must not be null.
-    explicit OutStream(StreamDst *destination);
+    OutStream(StreamDst *destination);
     virtual ~OutStream();
     OutStream(OutStream const &) = delete;
     OutStream &operator=(OutStream const &) = delete;
@@ -88,7 +88,7 @@ public:
 class VESK_HDL_API TextMemOutStream : public OutStream {
 public:
     /// Begins with `value`, or with nothing if that is null.
-    explicit TextMemOutStream(char const *value = nullptr);
+    TextMemOutStream(char const *value = nullptr);
     Basis::StringBase<char> GetValue() const;
     void SetValue(char const *value);
 };

@@ -107,7 +107,7 @@ public:
 template <class T> class Iterator {
 public:
     /// A null array is one without elements.
-    explicit Iterator(PtrArray<T> const *walked = nullptr) : array(walked), position(0) {}
+    Iterator(PtrArray<T> const *walked = nullptr) : array(walked), position(0) {}
     Iterator(Iterator const &other) : array(other.array), position(0) {}
     virtual ~Iterator() = default;
     Iterator &operator=(Iterator const &other) {

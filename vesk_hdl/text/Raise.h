@@ -1,12 +1,25 @@
 #pragma once
 
+#include <initializer_list>
+
+#include "vesk_hdl/text/Exception.h"
+
 namespace Vesk_Hdl {
 
-/// Throws an Exception from line `line` of `sourceFile` with a printf-formatted description.
-[[noreturn]] void Raise(char const *sourceFile, int line, char const *format, ...)
-    __attribute__((format(printf, 3, 4)));
+/// A message of a refusal: its text, in which each "%s" is the place of a name, and its kind.
+struct Message {
+    char const *text;
+    Exception::Kind kind;
+};
+
+/// Throws an Exception from line `line` of `sourceFile`. The names replace the "%s" of the text in
+/// order; null is an empty name. The last name is the subject of the exception, also if the text
+/// does not show it.
+[[noreturn]] void Raise(char const *sourceFile, int line, Message const &message,
+                        std::initializer_list<char const *> names);
 
 } // namespace Vesk_Hdl
 
-/// A throw site: VESK_HDL_RAISE("HdlModel", Messages::INVALID_NAME).
-#define VESK_HDL_RAISE(sourceFile, ...) ::Vesk_Hdl::Raise(sourceFile, __LINE__, __VA_ARGS__)
+/// A throw site: VESK_HDL_RAISE("HdlModel", Messages::SIGNAL_NOT_FOUND, name).
+#define VESK_HDL_RAISE(sourceFile, message, ...)                                                   \
+    ::Vesk_Hdl::Raise(sourceFile, __LINE__, message, {__VA_ARGS__})

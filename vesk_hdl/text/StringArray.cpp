@@ -1,7 +1,6 @@
 #include "vesk_hdl/text/StringArray.h"
 
 #include <string>
-#include <utility>
 #include <vector>
 
 #include "vesk_hdl/text/IntroSort.h"
@@ -307,9 +306,9 @@ StringBase<char> StringArray::Concatenate(StringBase<char> const &separator) con
 
 bool StringArray::GetIntAt(int index, int &value, int seed) const {
     long number = seed;
-    if (!Basis::strtol(At(index), number) || !std::in_range<int>(number))
+    if (!Basis::strtol(At(index), number))
         return false;
-    value = static_cast<int>(number);
+    value = static_cast<int>(number); // required: a number beyond int is converted, not refused
     return true;
 }
 

@@ -63,7 +63,8 @@ public:
     /// All strings in order with `separator` between them.
     Basis::StringBase<char> Concatenate(Basis::StringBase<char> const &separator) const;
     /// Reads the string at the index as a decimal integer into `value`; false, and `value` as it
-    /// was, if it is none that an int holds. `seed` plays no part in the result.
+    /// was, if Basis::strtol reads no number there. A number that fits `long` and not `int` is
+    /// converted as a cast does. `seed` plays no part in the result.
     bool GetIntAt(int index, int &value, int seed) const;
 
     /// Sorts by unsigned bytes, a prefix before what it begins. Not stable.

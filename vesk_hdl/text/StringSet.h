@@ -10,7 +10,7 @@ class VESK_HDL_API StringSetIterator {
 public:
     StringSetIterator();
     /// For StringSet: takes over a position. Null, all that a client can pass, stands nowhere.
-    explicit StringSetIterator(void *cell);
+    StringSetIterator(void *cell);
     StringSetIterator(StringSetIterator const &other);
     ~StringSetIterator();
     StringSetIterator &operator=(StringSetIterator const &other);

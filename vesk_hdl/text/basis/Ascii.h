@@ -19,6 +19,14 @@ constexpr bool EqualIgnoringCase(std::string_view a, std::string_view b) {
     return true;
 }
 
+/// Below, equal to or above 0 as `a` comes before, with or after `b`, both of one length.
+constexpr int CompareIgnoringCase(std::string_view a, std::string_view b) {
+    for (std::size_t i = 0; i < a.size(); ++i)
+        if (int const order = ToUpper(a[i]) - ToUpper(b[i]); order != 0)
+            return order;
+    return 0;
+}
+
 constexpr bool EndsWithIgnoringCase(std::string_view text, std::string_view end) {
     return text.size() >= end.size() &&
            EqualIgnoringCase(text.substr(text.size() - end.size()), end);

@@ -14,11 +14,13 @@ struct Exception::Record {
     int line;
     std::string description;
     std::wstring localized;
+    int kind;
+    std::string subject;
 };
 
 Exception::Exception(char const *module, char const *sourceFile, char const *revision, int line)
     : record(new Record{
-          OrEmpty(module), OrEmpty(sourceFile), OrEmpty(revision), line, std::string(), {}}) {}
+          OrEmpty(module), OrEmpty(sourceFile), OrEmpty(revision), line, {}, {}, 0, {}}) {}
 
 Exception::Exception(Exception const &other) : record(new Record(*other.record)) {}
 
@@ -46,7 +48,15 @@ Exception &Exception::setDescription(char const *format, ...) {
     return *this;
 }
 
+Exception &Exception::setKind(int kind, char const *subject) {
+    record->kind = kind;
+    record->subject = OrEmpty(subject);
+    return *this;
+}
+
 char const *Exception::getDescription() const { return record->description.c_str(); }
+int Exception::getKind() const { return record->kind; }
+char const *Exception::getSubject() const { return record->subject.c_str(); }
 char const *Exception::getModule() const { return record->module.c_str(); }
 char const *Exception::getSourceFile() const { return record->sourceFile.c_str(); }
 int Exception::getLine() const { return record->line; }

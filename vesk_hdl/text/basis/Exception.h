@@ -25,6 +25,13 @@ public:
     /// The description, never null, valid as long as the exception keeps it. Not virtual, so that
     /// the virtual slots stay the three above.
     char const *getDescription() const;
+    /// Why it was thrown, as a number of the library that throws, so that nobody needs to read the
+    /// description; and the name that it is about, never null, valid as the description is. An
+    /// exception has kind 0 and no name until they are set. Null counts as no name.
+    int getKind() const;
+    char const *getSubject() const;
+    Exception &setKind(int kind, char const *subject);
+    /// The place of the throw, as given to the constructor. The texts are never null.
     char const *getModule() const;
     char const *getSourceFile() const;
     int getLine() const;

@@ -58,7 +58,7 @@ public:
 /// The name of a file as a path.
 class VESK_HDL_API FileName {
 public:
-    explicit FileName(char const *name);
+    FileName(char const *name);
     virtual ~FileName();
     FileName(FileName const &) = default;
     FileName &operator=(FileName const &) = default;

@@ -7,7 +7,7 @@
 /// behind it. Matching takes one pass over the text, however long. Not copyable.
 class VESK_HDL_API Basis_Regexp {
 public:
-    explicit Basis_Regexp(char const *pattern);
+    Basis_Regexp(char const *pattern);
     ~Basis_Regexp();
     Basis_Regexp(Basis_Regexp const &) = delete;
     Basis_Regexp &operator=(Basis_Regexp const &) = delete;

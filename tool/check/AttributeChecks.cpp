@@ -36,7 +36,8 @@ namespace {
 class AttributeChecker {
 public:
     explicit AttributeChecker(Design const &checked)
-        : design(checked), useAttrType(checked.options.vhdlOption.useAttrType) {
+        : design(checked), useAttrType(checked.options.vhdlOption.useAttrType),
+          usesPackages(UsesPackages(checked.options.vhdlOption.useLibraries)) {
         ForEachAttribute(design, [this](AttributeUse const &use) {
             if (use.generic)
                 return;
@@ -65,6 +66,17 @@ public:
     }
 
 private:
+    /// Whether a use clause names a package of the user's: those of ieee and std declare none of
+    /// the attributes.
+    static bool UsesPackages(StringArray const &clauses) {
+        for (int i = 0; i < clauses.GetSize(); ++i) {
+            std::string const clause = Lowercase(clauses.At(i).View());
+            if (clause.compare(0, 5, "ieee.") != 0 && clause.compare(0, 4, "std.") != 0)
+                return true;
+        }
+        return false;
+    }
+
     static bool IsPort(AttributeUse const &use) {
         return use.kind == AttributeUse::SIGNAL && static_cast<Signal const *>(use.owner)->IsPort();
     }
@@ -126,12 +138,13 @@ private:
         Attribute const *declaration = findIn(declaredByPorts);
         if (!declaration && !IsPort(use))
             declaration = findIn(declared);
-        if (declaration && useAttrType && VhdlTypeOf(*declaration) != VhdlTypeOf(*use.attribute))
-            Add(Id::ATTRIBUTE_TYPE, use, VHDL,
-                VhdlTypeOf(*use.attribute) + " for " + VhdlTypeOf(*declaration));
+        bool const isTyped = declaration && useAttrType;
+        std::string const type = isTyped ? VhdlTypeOf(*use.attribute) : "";
+        std::string const declaredType = isTyped ? VhdlTypeOf(*declaration) : "";
+        if (type != declaredType && !type.empty() && !declaredType.empty())
+            Add(Id::ATTRIBUTE_TYPE, use, VHDL, type + " for " + declaredType);
         bool const tooEarly = ComesTooEarly(use, name);
-        if ((!declaration || tooEarly) && !IsLeftOut(use) &&
-            design.options.vhdlOption.useLibraries.IsEmpty())
+        if ((!declaration || tooEarly) && !IsLeftOut(use) && !usesPackages)
             Add(Id::UNDECLARED_ATTRIBUTE, use, VHDL,
                 tooEarly ? "the port that declares it comes later in the entity" : "");
     }
@@ -372,6 +385,7 @@ private:
 
     Design const &design;
     bool useAttrType;
+    bool usesPackages;
     std::unordered_map<std::string, Attribute const *> declared; ///< by name, the first
     std::unordered_map<std::string, Attribute const *> declaredByPorts;
     bool hasUndeclaredOfPorts = false;

@@ -63,6 +63,7 @@ public:
         });
         CheckInheritedFolds();
         FindUnwritten();
+        CheckLibraries(design, typed);
     }
 
 private:
@@ -139,8 +140,12 @@ private:
         if (!declaration && !IsPort(use))
             declaration = findIn(declared);
         bool const isTyped = declaration && useAttrType;
-        std::string const type = isTyped ? VhdlTypeOf(*use.attribute) : "";
-        std::string const declaredType = isTyped ? VhdlTypeOf(*declaration) : "";
+        auto const typeOf = [](Attribute const &attribute) {
+            std::string const type = VhdlTypeOf(attribute);
+            return type.substr(type.rfind('.') + 1); // in whatever package
+        };
+        std::string const type = isTyped ? typeOf(*use.attribute) : "";
+        std::string const declaredType = isTyped ? typeOf(*declaration) : "";
         if (type != declaredType && !type.empty() && !declaredType.empty())
             Add(Id::ATTRIBUTE_TYPE, use, VHDL, type + " for " + declaredType);
         bool const tooEarly = ComesTooEarly(use, name);
@@ -171,10 +176,14 @@ private:
 
     /// A type of the user's has a name of its own, which VHDL alone writes.
     void CheckType(AttributeUse const &use) {
-        bool const isTyped = use.generic && use.kind != AttributeUse::INSTANCE;
-        bool const isDeclared = !use.generic && useAttrType && use.attribute->IsSynDeclared();
-        if ((isTyped || isDeclared) && !IsLeftOut(use) && VhdlTypeOf(*use.attribute).empty())
+        if (use.attribute->GetValueType() != Attribute::VALUE_USER)
+            return;
+        bool const isDeclared = use.generic ? use.kind != AttributeUse::INSTANCE && !IsLeftOut(use)
+                                            : useAttrType && use.attribute->IsSynDeclared();
+        if (isDeclared && VhdlTypeOf(*use.attribute).empty())
             Add(Id::ATTRIBUTE_WITHOUT_TYPE, use, VHDL);
+        else if (isDeclared)
+            typed.push_back(use);
     }
 
     /// The languages that refuse the value of a vector of bits, or take it for another one.
@@ -388,6 +397,7 @@ private:
     bool usesPackages;
     std::unordered_map<std::string, Attribute const *> declared; ///< by name, the first
     std::unordered_map<std::string, Attribute const *> declaredByPorts;
+    std::vector<AttributeUse> typed; ///< with types of the user's
     bool hasUndeclaredOfPorts = false;
     std::unordered_map<Object const *, std::size_t> placeOfPort; ///< in the entity
     std::unordered_map<std::string, std::size_t> firstPlace;     ///< that declares an attribute

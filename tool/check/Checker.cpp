@@ -100,7 +100,6 @@ void Checker::CheckDesign(Languages languages) {
     CheckConstants(design);
     CheckAttributes(design);
     CheckMacro(design);
-    CheckLibraries(design);
     CheckTexts(design);
 }
 

@@ -122,9 +122,10 @@ private:
     void FindUsedTypes() {
         ForEachAttribute(design, [this](AttributeUse const &use) {
             bool const isTyped = use.generic || design.options.vhdlOption.useAttrType;
-            std::string const type = isTyped ? VhdlTypeOf(*use.attribute) : "string";
-            (IsOuter(use) ? outerTypes : innerTypes)
-                .insert(type.substr(0, type.find_first_of(" .(")));
+            std::string type = isTyped ? VhdlTypeOf(*use.attribute) : "string";
+            if (use.attribute->GetValueType() == Attribute::VALUE_USER)
+                type.resize(std::min(type.find_first_of(" .("), type.size()));
+            (IsOuter(use) ? outerTypes : innerTypes).insert(std::move(type));
         });
         pinTypes.insert("std_logic");
         bool hasVectors = false;

@@ -37,7 +37,8 @@ namespace {
 class AttributeChecker {
 public:
     explicit AttributeChecker(Design const &checked)
-        : design(checked), useAttrType(checked.options.vhdlOption.useAttrType) {
+        : design(checked), useAttrType(checked.options.vhdlOption.useAttrType),
+          usesPackages(UsesPackages(checked.options.vhdlOption.useLibraries)) {
         ForEachAttribute(design, [this](AttributeUse const &use) {
             if (use.generic)
                 return;
@@ -63,9 +64,21 @@ public:
         });
         CheckInheritedFolds();
         FindUnwritten();
+        CheckLibraries(design, typed);
     }
 
 private:
+    /// Whether a use clause names a package of the user's: those of ieee and std declare none of
+    /// the attributes.
+    static bool UsesPackages(StringArray const &clauses) {
+        for (int i = 0; i < clauses.GetSize(); ++i) {
+            std::string const clause = Lowercase(clauses.At(i).View());
+            if (clause.compare(0, 5, "ieee.") != 0 && clause.compare(0, 4, "std.") != 0)
+                return true;
+        }
+        return false;
+    }
+
     static bool IsPort(AttributeUse const &use) {
         return use.kind == AttributeUse::SIGNAL && static_cast<Signal const *>(use.owner)->IsPort();
     }
@@ -127,12 +140,17 @@ private:
         Attribute const *declaration = findIn(declaredByPorts);
         if (!declaration && !IsPort(use))
             declaration = findIn(declared);
-        if (declaration && useAttrType && VhdlTypeOf(*declaration) != VhdlTypeOf(*use.attribute))
-            Add(Id::ATTRIBUTE_TYPE, use, VHDL,
-                VhdlTypeOf(*use.attribute) + " for " + VhdlTypeOf(*declaration));
+        bool const isTyped = declaration && useAttrType;
+        auto const typeOf = [](Attribute const &attribute) {
+            std::string const type = VhdlTypeOf(attribute);
+            return type.substr(type.rfind('.') + 1); // in whatever package
+        };
+        std::string const type = isTyped ? typeOf(*use.attribute) : "";
+        std::string const declaredType = isTyped ? typeOf(*declaration) : "";
+        if (type != declaredType && !type.empty() && !declaredType.empty())
+            Add(Id::ATTRIBUTE_TYPE, use, VHDL, type + " for " + declaredType);
         bool const tooEarly = ComesTooEarly(use, name);
-        if ((!declaration || tooEarly) && !IsLeftOut(use) &&
-            design.options.vhdlOption.useLibraries.IsEmpty())
+        if ((!declaration || tooEarly) && !IsLeftOut(use) && !usesPackages)
             Add(Id::UNDECLARED_ATTRIBUTE, use, VHDL,
                 tooEarly ? "the port that declares it comes later in the entity" : "");
     }
@@ -159,10 +177,14 @@ private:
 
     /// A type of the user's has a name of its own, which VHDL alone writes.
     void CheckType(AttributeUse const &use) {
-        bool const isTyped = use.generic && use.kind != AttributeUse::INSTANCE;
-        bool const isDeclared = !use.generic && useAttrType && use.attribute->IsSynDeclared();
-        if ((isTyped || isDeclared) && !IsLeftOut(use) && VhdlTypeOf(*use.attribute).empty())
+        if (use.attribute->GetValueType() != Attribute::VALUE_USER)
+            return;
+        bool const isDeclared = use.generic ? use.kind != AttributeUse::INSTANCE && !IsLeftOut(use)
+                                            : useAttrType && use.attribute->IsSynDeclared();
+        if (isDeclared && VhdlTypeOf(*use.attribute).empty())
             Add(Id::ATTRIBUTE_WITHOUT_TYPE, use, VHDL);
+        else if (isDeclared)
+            typed.push_back(use);
     }
 
     /// The languages that refuse the value of a vector of bits, or take it for another one.
@@ -402,9 +424,11 @@ private:
 
     Design const &design;
     bool useAttrType;
+    bool usesPackages;
     Clause clause; ///< of the generic that was looked at last
     std::unordered_map<std::string, Attribute const *, SeededHash> declared; ///< by name, the first
     std::unordered_map<std::string, Attribute const *, SeededHash> declaredByPorts;
+    std::vector<AttributeUse> typed; ///< with types of the user's
     bool hasUndeclaredOfPorts = false;
     std::unordered_map<Object const *, std::size_t> placeOfPort; ///< in the entity
     std::unordered_map<std::string, std::size_t, SeededHash>

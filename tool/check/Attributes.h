@@ -31,6 +31,10 @@ bool IsConfigured(Design const &design, Vesk_Hdl::Component const &component);
 /// of the instance's own.
 bool TakesInitOfMacro(Design const &design, Vesk_Hdl::Component const &component);
 
+/// Checks library and use clauses, and the types of the user's that declarations name: those of
+/// `typed`.
+void CheckLibraries(Design const &design, std::vector<AttributeUse> const &typed);
+
 /// Calls `act` with each use that is written: those of the module's generics, of components with
 /// instances, of instances, and of nets that are declared. Attributes that a write adds are among
 /// them.

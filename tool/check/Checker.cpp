@@ -101,7 +101,6 @@ void Checker::CheckDesign(Languages languages) {
     CheckConstants(design);
     CheckAttributes(design);
     CheckMacro(design);
-    CheckLibraries(design);
     CheckTexts(design);
 }
 

@@ -109,7 +109,7 @@ struct Row {
     Id id;
     char const *name;
     Languages languages;  ///< that it can concern; a finding may concern fewer
-    char const *sentence; ///< goes on behind the name of what was found
+    char const *sentence; ///< follows the name of what was found
     char const *hint;
 };
 

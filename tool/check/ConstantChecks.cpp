@@ -65,7 +65,7 @@ private:
                                 (fitsVerilog ? NO_LANGUAGE : VERILOG);
         if (wrong != NO_LANGUAGE)
             Add(Id::CONSTANT_WIDTH, wrong,
-                "digits: " + std::to_string(digits.GetWidth()) + ", told: " +
+                "digits: " + std::to_string(digits.GetWidth()) + ", stated: " +
                     std::to_string(value.GetLength()) + ", width: " + std::to_string(width));
     }
 

@@ -139,7 +139,6 @@ void CheckConnections(Design const &design);
 void CheckConstants(Design const &design);
 void CheckAttributes(Design const &design);
 void CheckMacro(Design const &design);
-void CheckLibraries(Design const &design);
 void CheckTexts(Design const &design);
 
 } // namespace Checks

@@ -5,11 +5,11 @@
 namespace Checks {
 
 /// A line as a written file folds it at 80 columns, just as far as to tell whether a quoted text is
-/// broken in two. A piece that does not fit sends what stands behind the last blank, or else the
+/// broken in two. A piece that does not fit sends what follows the last blank, or else the
 /// last comma, to the next line; a line with a comment mark does not fold.
 class Fold {
 public:
-    /// `level` is how deep the statement stands.
+    /// `level` is the depth of the statement.
     explicit Fold(std::size_t level) : indentation(3 * level), length(indentation) {}
 
     Fold &Put(std::string_view piece, bool isQuoted = false) {

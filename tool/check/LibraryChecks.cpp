@@ -48,7 +48,7 @@ public:
     explicit LibraryChecker(Design const &checked)
         : design(checked), vhdl(checked.options.vhdlOption) {}
 
-    void Run() {
+    void Run(std::vector<AttributeUse> const &typed) {
         CheckLibraries();
         CheckUseClauses();
         if (vhdl.useDefaultLibrary) {
@@ -58,7 +58,8 @@ public:
             types.insert(NUMERIC_STD_TYPES.begin(), NUMERIC_STD_TYPES.end());
         }
         CheckStdLogic();
-        ForEachAttribute(design, [this](AttributeUse const &use) { CheckType(use); });
+        for (AttributeUse const &use : typed)
+            CheckType(use);
     }
 
 private:
@@ -142,17 +143,9 @@ private:
                                  "design " + Quoted(design.netlist.GetNameRef().View())});
     }
 
-    /// A type of the user's, where a generic or an attribute is declared with it.
     void CheckType(AttributeUse const &use) {
-        auto const *const user = dynamic_cast<AttributeUser const *>(use.attribute);
-        bool const isDeclared = use.generic ? use.kind != AttributeUse::INSTANCE
-                                            : vhdl.useAttrType && use.attribute->IsSynDeclared();
-        if (!user || !isDeclared ||
-            (use.generic && use.kind == AttributeUse::COMPONENT && vhdl.suppressComponent))
-            return;
-        std::string const type(user->GetUserType().View());
-        if (type.empty())
-            return; // another check's
+        std::string const type(
+            static_cast<AttributeUser const &>(*use.attribute).GetUserType().View());
         std::string const folded = Lowercase(Trimmed(type));
         std::size_t const end = std::min(folded.find_first_of(" ("), folded.size());
         std::vector<std::string> const mark = Split(folded.substr(0, end), '.');
@@ -189,6 +182,8 @@ private:
 
 } // namespace
 
-void CheckLibraries(Design const &design) { LibraryChecker(design).Run(); }
+void CheckLibraries(Design const &design, std::vector<AttributeUse> const &typed) {
+    LibraryChecker(design).Run(typed);
+}
 
 } // namespace Checks

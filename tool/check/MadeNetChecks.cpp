@@ -44,7 +44,8 @@ private:
             return {signal, true};
         if (Instance const *const instance = netlist.GetInstance(name.c_str()))
             return {instance, true};
-        Attribute const *const generic = netlist.GetAttr(name.c_str());
+        Attribute const *const generic =
+            netlist.HasAttrs() ? netlist.GetAttr(name.c_str()) : nullptr;
         if (generic && (generic->IsGenericSyn() || generic->IsGenericNoSyn()))
             return {generic, true};
         Component const *const component = netlist.GetComponent(name.c_str());
@@ -62,7 +63,7 @@ private:
                                            use.attribute);
             });
         attributesAreKnown = true;
-        auto const found = attributes.find(Lowercase(name));
+        auto const found = attributes.empty() ? attributes.end() : attributes.find(Lowercase(name));
         return found == attributes.end() ? nullptr : found->second;
     }
 

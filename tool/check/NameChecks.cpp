@@ -24,6 +24,7 @@ struct WrittenName {
     Languages languages = BOTH;
     std::string_view shown = {};  ///< where it differs from the name
     std::string owner = {};       ///< with a point, of a pin
+    bool inEntity = false;        ///< declared there
     bool inConfiguration = false; ///< visible in a configuration that takes components from work
 
     std::string Subject() const {
@@ -73,6 +74,11 @@ public:
         design.ForEachUsedComponent([this](Component const *component) {
             isConfigured |= IsConfigured(design, *component);
         });
+        HdlOptions::VhdlOption const &vhdl = design.options.vhdlOption;
+        if (vhdl.useDefaultLibrary)
+            libraries = {"ieee", "korbal"};
+        for (int i = 0; i < vhdl.libraries.GetSize(); ++i)
+            libraries.insert(Lowercase(vhdl.libraries.At(i).View()));
     }
 
     void Run() {
@@ -99,21 +105,29 @@ public:
         ForEachAttribute(design, [this](AttributeUse const &use) {
             WrittenName name{use.attribute->GetNameRef().View(), "attribute", use.attribute,
                              VerilogOption::CASE_DEFAULT, use.generic ? BOTH : VHDL};
+            bool const isOuter = IsOuter(use);
+            name.inEntity = isOuter && (use.generic || use.attribute->IsSynDeclared());
             name.inConfiguration = IsInConfiguration(use);
             Check(name);
         });
     }
 
 private:
+    /// Whether it is written in the entity.
+    static bool IsOuter(AttributeUse const &use) {
+        return use.kind == AttributeUse::MODULE ||
+               (use.kind == AttributeUse::SIGNAL &&
+                static_cast<Signal const *>(use.owner)->IsPort());
+    }
+
     /// The types that declarations of the entity and of the architecture name.
     void FindUsedTypes() {
         ForEachAttribute(design, [this](AttributeUse const &use) {
-            bool const isOuter = use.kind == AttributeUse::MODULE ||
-                                 (use.kind == AttributeUse::SIGNAL &&
-                                  static_cast<Signal const *>(use.owner)->IsPort());
             bool const isTyped = use.generic || design.options.vhdlOption.useAttrType;
-            std::string const type = isTyped ? VhdlTypeOf(*use.attribute) : "string";
-            (isOuter ? outerTypes : innerTypes).insert(type.substr(0, type.find_first_of(" .(")));
+            std::string type = isTyped ? VhdlTypeOf(*use.attribute) : "string";
+            if (use.attribute->GetValueType() == Attribute::VALUE_USER)
+                type.resize(std::min(type.find_first_of(" .("), type.size()));
+            (IsOuter(use) ? outerTypes : innerTypes).insert(std::move(type));
         });
         pinTypes.insert("std_logic");
         bool hasVectors = false;
@@ -148,9 +162,25 @@ private:
         Languages const illegal = Of(!IsVhdlIdentifier(name.name), !IsVerilogIdentifier(name.name));
         if (illegal != NO_LANGUAGE)
             Add(Id::ILLEGAL_NAME, name, illegal);
-        if (illegal == BOTH || name.name.size() > LONGEST_WORD)
+        if (illegal != BOTH && name.name.size() <= LONGEST_WORD)
+            CheckWords(name, illegal);
+        CheckLibrary(name);
+    }
+
+    /// The design may not be called like a library that the file names, or VHDL does for every file
+    /// (IEEE 1076-1993, 11.2).
+    void CheckLibrary(WrittenName const &name) {
+        bool const isDesign = name.object == &design.netlist;
+        if (!isDesign && !name.inEntity && !name.inConfiguration)
             return;
-        CheckWords(name, illegal);
+        bool const isWork = SameIgnoringCase(name.name, "work");
+        bool const isNamed =
+            (isDesign || name.inEntity) && libraries.count(Lowercase(name.name)) > 0;
+        if (isDesign && (isNamed || isWork || SameIgnoringCase(name.name, "std")))
+            Add(Id::LIBRARY_NAME, name, VHDL);
+        bool const isRead = name.inEntity && !design.options.vhdlOption.suppressConfiguration;
+        if ((isRead && isNamed) || (name.inConfiguration && isWork))
+            Add(Id::HIDDEN_LIBRARY, name, VHDL);
     }
 
     void CheckWords(WrittenName const &name, Languages illegal) {
@@ -177,26 +207,13 @@ private:
         if ((name.what == "pin" ? pinTypes : innerTypes).count(vhdl) > 0 ||
             (isOuter && outerTypes.count(vhdl) > 0))
             Add(Id::STANDARD_NAME, name, VHDL);
-        if (name.what == "design" && IsLibrary(vhdl))
-            Add(Id::LIBRARY_NAME, name, VHDL);
-        if (name.inConfiguration && vhdl == "work")
-            Add(Id::HIDDEN_LIBRARY, name, VHDL);
-    }
-
-    /// Whether the file names a library so, or VHDL does for every file (IEEE 1076-1993, 11.2).
-    bool IsLibrary(std::string const &folded) const {
-        HdlOptions::VhdlOption const &vhdl = design.options.vhdlOption;
-        for (int i = 0; i < vhdl.libraries.GetSize(); ++i)
-            if (SameIgnoringCase(vhdl.libraries.At(i).View(), folded))
-                return true;
-        return folded == "std" || folded == "work" ||
-               (vhdl.useDefaultLibrary && (folded == "ieee" || folded == "korbal"));
     }
 
     void CheckSignal(Signal const &signal) {
         WrittenName name{BaseOf(signal), signal.IsPort() ? "port" : "net", &signal,
                          design.options.verilogOption.signalCase};
         name.shown = signal.GetNameRef().View();
+        name.inEntity = signal.IsPort();
         name.inConfiguration = isConfigured;
         if (SameIgnoringCase(name.shown, "open"))
             return Add(Id::OPEN_NAME, name, BOTH);
@@ -245,7 +262,8 @@ private:
     }
 
     Design const &design;
-    bool isConfigured = false; ///< some component
+    bool isConfigured = false;                             ///< some component
+    std::unordered_set<std::string, SeededHash> libraries; ///< that clauses name
     std::unordered_set<std::string, SeededHash> pinTypes;
     std::unordered_set<std::string, SeededHash> innerTypes; ///< of the architecture
     std::unordered_set<std::string, SeededHash> outerTypes; ///< of the entity
@@ -303,7 +321,7 @@ private:
         std::string const base = Cased(BaseOf(bus), nameCase);
         std::string const partBase =
             isInside ? Cased(BaseOf(part), nameCase) : std::string(BaseOf(part));
-        // The dummy of a part is inside and stands in its place.
+        // The dummy of a part is inside and takes its place.
         bool const isReplaced = !isInside && design.DummyOf(&bus);
         if (base == partBase || isReplaced || !design.IsWritten(part))
             return;

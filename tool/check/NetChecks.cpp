@@ -145,10 +145,10 @@ private:
     }
 
     void AddDrivers(std::vector<BitUse> const &drivers, long long bit) {
-        constexpr std::size_t MOST_TOLD = 8;
+        constexpr std::size_t MOST_SHOWN = 8;
         std::vector<Related> related;
         for (BitUse const &driver : drivers)
-            if (driver.bits.Holds({bit, bit}) && related.size() < MOST_TOLD)
+            if (driver.bits.Holds({bit, bit}) && related.size() < MOST_SHOWN)
                 for (Related &one : WhoDoes(driver))
                     related.push_back(std::move(one));
         Add(Id::SEVERAL_DRIVERS, BitName(bit), std::move(related));

@@ -9,6 +9,10 @@ namespace {
 constexpr char const *CONNECT = "CONNECT SIGNAL";
 constexpr char const *ASSIGN = "ASSIGN CONSTANT";
 
+bool EndsIn(std::string_view text, std::string_view end) {
+    return text.size() >= end.size() && text.substr(text.size() - end.size()) == end;
+}
+
 bool Contains(std::string_view text, std::string_view part) {
     return text.find(part) != std::string_view::npos;
 }
@@ -306,10 +310,10 @@ void Recorder::RecordAttribute() {
 
 /// What the line gave a comment, or the option that it set or added to; null for other lines.
 void const *Recorder::OwnerOfText() const {
-    if (Contains(keyword, "COMMENT") || keyword == "ADD NOTES")
+    if (EndsIn(keyword, " COMMENT") || keyword == "ADD NOTES")
         return dynamic_cast<Object const *>(HolderOf(firstArgument, keyword));
     HdlOptions const &options = *model.GetOptions();
-    std::pair<char const *, void const *> const rows[] = {
+    std::pair<std::string_view, void const *> const rows[] = {
         {"ADD LIBRARY", &options.vhdlOption.libraries},
         {"ADD USE LIBRARY", &options.vhdlOption.useLibraries},
         {"ADD INCLUDE", &options.verilogOption.includes},

@@ -13,7 +13,7 @@ namespace Checks {
 
 using Text = Basis::StringBase<char>;
 
-/// What stands in front of the brackets of a net's name, if it has any; no copy.
+/// A net's name up to its brackets, if it has any; no copy.
 inline std::string_view BaseOf(std::string_view name) {
     std::size_t const open = name.find('(');
     bool const plain = open == std::string_view::npos || name.find(')') == std::string_view::npos ||

@@ -51,7 +51,7 @@ public:
         design.ForEachInstance(
             [&](Instance const *instance) { CheckComment(*instance, "instance", BOTH); });
         design.ForEachSignal([&](Signal const *signal) {
-            if (signal->IsNeededToDeclared())
+            if (signal->HasComment() && signal->IsNeededToDeclared())
                 CheckComment(*signal, signal->IsPort() ? "port" : "net",
                              signal->IsPort() ? VERILOG : BOTH);
         });
@@ -122,6 +122,12 @@ private:
         CheckSentences(options.reference, "the reference in the header");
     }
 
+    /// Whether a text needs a closer look, which most do not.
+    static bool IsDoubtful(std::string_view text) {
+        return std::any_of(text.begin(), text.end(),
+                           [](char c) { return c < ' ' || c > '~' || c == '*'; });
+    }
+
     /// Free texts of the header are wrapped: any word may come first on a line.
     void CheckSentences(Text const &text, char const *subject) {
         constexpr std::size_t FIRST_COLUMN = 6;
@@ -144,6 +150,8 @@ private:
             type != Attribute::VALUE_BIT_VECTOR)
             return; // the text of a number
         Text const value = attribute.GetValueString();
+        if (!IsDoubtful(value.View()) && !IsDoubtful(attribute.GetNameRef().View()))
+            return;
         Spot spot = design.MadeAt(&attribute);
         if (spot.line == 0)
             spot = design.MadeAt(use.owner);

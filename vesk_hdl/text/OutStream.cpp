@@ -41,10 +41,14 @@ public:
     void WriteNewLine() override {
         if (file)
             EndLine();
+        else
+            Drop();
     }
 
     void Write(char const *text) override {
-        if (file && !line.AppendShort(text))
+        if (!file)
+            Drop();
+        else if (!line.AppendShort(text))
             WriteAny(text);
     }
     void Write(int value) override {
@@ -77,6 +81,12 @@ public:
         file = nullptr;
     }
 
+    void SetGuard(Stream::Guard *wanted) {
+        guard = wanted;
+        if (file)
+            file->SetGuard(guard);
+    }
+
     bool IsOpen() const { return file != nullptr; }
     int GetError() const { return file ? file->GetError() : error; }
     Basis::StringBase<char> const &GetFileName() const { return fileName; }
@@ -85,6 +95,8 @@ private:
     bool Take(Stream *opened) {
         file = opened;
         error = file ? 0 : errno;
+        if (file)
+            file->SetGuard(guard);
         return file != nullptr;
     }
 
@@ -99,6 +111,12 @@ private:
             EndLine();
             ++text;
         }
+    }
+
+    /// Text that has no file to go to.
+    [[gnu::noinline]] void Drop() {
+        if (guard)
+            guard->Failed();
     }
 
     std::size_t Indentation() { return 3 * static_cast<std::size_t>(GetIndentLevel()); }
@@ -117,6 +135,7 @@ private:
     FoldingLine line;
     Basis::StringBase<char> fileName;
     int error = 0;
+    Stream::Guard *guard = nullptr;
 };
 
 class TextMemDst : public StreamDst {
@@ -186,6 +205,10 @@ Basis::StringBase<char> TextFileOutStream::GetFileName() const {
 }
 
 int TextFileOutStream::GetError() const { return static_cast<TextFileDst *>(dst)->GetError(); }
+
+void TextFileOutStream::SetGuard(Stream::Guard *guard) {
+    static_cast<TextFileDst *>(dst)->SetGuard(guard);
+}
 
 TextMemOutStream::TextMemOutStream(char const *value) : OutStream(new TextMemDst(value)) {}
 

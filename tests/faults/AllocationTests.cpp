@@ -11,6 +11,7 @@
 #include "tests/support/MemoryFile.h"
 
 extern long allocationsLeft; // of FailingNew.cpp
+extern bool allLaterFail;
 
 namespace {
 
@@ -46,7 +47,8 @@ struct Counting : Capture {
     int canceled = 0;
 };
 
-/// Runs the design; the allocation of that number fails once. False if it was never reached.
+/// Runs the design; the allocation of that number fails, and those until the failure has passed to
+/// us. False if it was never reached.
 bool RunWithFailure(Lines const &lines, long number, int &canceledWrites) {
     allocationsLeft = number;
     bool failed = false;
@@ -60,6 +62,7 @@ bool RunWithFailure(Lines const &lines, long number, int &canceledWrites) {
             model = new Model(factory);
         } catch (std::bad_alloc const &) {
             failed = true;
+            allocationsLeft = -1;
         }
     }
     model->SetWriteOpener(&capture);
@@ -69,6 +72,7 @@ bool RunWithFailure(Lines const &lines, long number, int &canceledWrites) {
             model->Execute(line.c_str());
         } catch (std::bad_alloc const &) {
             failed = true;
+            allocationsLeft = -1;
             EXPECT_EQ(capture.open, 0) << number << ": " << line;
             EXPECT_EQ(Inconsistency(*model->GetNetlist()), "") << number << ": " << line;
             --i; // once more: what is there already is refused, everything else is done
@@ -87,12 +91,15 @@ bool RunWithFailure(Lines const &lines, long number, int &canceledWrites) {
 
 TEST(Faults, AnAllocationFails) {
     Lines const lines = AllFamilies();
-    long number = 0;
-    int canceledWrites = 0;
-    while (RunWithFailure(lines, number, canceledWrites) && !HasFailure())
-        ++number;
-    EXPECT_GT(number, 300);
-    EXPECT_GT(canceledWrites, 30);
+    for (bool const all : {false, true}) {
+        allLaterFail = all;
+        long number = 0;
+        int canceledWrites = 0;
+        while (RunWithFailure(lines, number, canceledWrites) && !HasFailure())
+            ++number;
+        EXPECT_GT(number, 300) << all;
+        EXPECT_GT(canceledWrites, 30) << all;
+    }
 }
 
 } // namespace

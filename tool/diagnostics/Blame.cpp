@@ -402,13 +402,15 @@ Diagnostic BlameRefusal(std::string const &line, Place const &place, std::string
     return Refusal(line, place, std::move(text), model).Explain();
 }
 
+std::string FailureOf(WriteStatus const &write) {
+    return write.reason.IsEmpty() ? std::strerror(write.error) : write.reason.GetText();
+}
+
 Diagnostic BlameWrite(std::string const &line, Place const &place, WriteStatus const &write) {
     LineTokens const tokens(line);
     Diagnostic diagnostic = At(line, place);
     std::string const file(write.fileName.View());
-    diagnostic.message = "cannot write " + file + ": " +
-                         (write.error == EXDEV ? "it lies outside the folder that --restrict names"
-                                               : std::strerror(write.error));
+    diagnostic.message = "cannot write " + file + ": " + FailureOf(write);
     for (int token = 2; token < tokens.GetSize(); ++token)
         if (tokens.At(token) == file) {
             diagnostic.place.column = tokens.GetColumn(token);

@@ -13,6 +13,9 @@
 Diagnostic BlameRefusal(std::string const &line, Place const &place, std::string text,
                         Vesk_Hdl::Model const &model);
 
+/// Why a write failed, as the opener of its file or else the system says it.
+std::string FailureOf(Vesk_Hdl::WriteStatus const &write);
+
 /// A write command whose file did not reach the disk whole.
 Diagnostic BlameWrite(std::string const &line, Place const &place,
                       Vesk_Hdl::WriteStatus const &write);

@@ -2,6 +2,7 @@
 // netlist and options to a writer.
 
 #include <cerrno>
+#include <new>
 #include <unistd.h>
 #include <utility>
 
@@ -60,7 +61,13 @@ public:
     }
     CommandFile(CommandFile const &) = delete;
     CommandFile &operator=(CommandFile const &) = delete;
-    ~CommandFile() override { Finish(); }
+    ~CommandFile() override {
+        try {
+            stream.Close();
+        } catch (std::bad_alloc const &) { // as what ends the command, most likely
+        }
+        Finish();
+    }
 
     /// Calls `write` with the stream; what it throws passes on, but not TextIsLost. The netlist is
     /// rewritten before the first text is written, so that it is the same after a failed write.
@@ -97,7 +104,6 @@ private:
         }
     }
     void Finish() {
-        stream.Close();
         if (WriteOpener *const asked = std::exchange(opener, nullptr))
             asked->Finish(status);
     }

@@ -2,7 +2,9 @@
 
 #include <cerrno>
 #include <charconv>
+#include <new>
 #include <string>
+#include <utility>
 
 #include "vesk_hdl/text/FoldingLine.h"
 
@@ -28,7 +30,12 @@ public:
     explicit TextFileDst(char const *name) : fileName(name) {}
     TextFileDst(TextFileDst const &) = delete;
     TextFileDst &operator=(TextFileDst const &) = delete;
-    ~TextFileDst() override { Close(); }
+    ~TextFileDst() override {
+        try {
+            Close();
+        } catch (std::bad_alloc const &) { // it is closed all the same
+        }
+    }
 
     void Flush() override {
         if (!file)
@@ -75,10 +82,14 @@ public:
     void Close() {
         if (!file)
             return;
+        struct Closing {
+            TextFileDst &dst;
+            ~Closing() {
+                if (!File::close(std::exchange(dst.file, nullptr)))
+                    dst.error = errno;
+            }
+        } const closing{*this};
         Flush();
-        if (!File::close(file))
-            error = errno;
-        file = nullptr;
     }
 
     void SetGuard(Stream::Guard *wanted) {

@@ -32,8 +32,9 @@ int ParseAndRun(int argc, char **argv) {
     app.set_version_flag("--version",
                          std::string("vesk-hdl ") + Vesk_Hdl::HdlUtilities::GetVersion().GetText());
     app.require_subcommand(1);
-    app.footer("Exit codes: 0 all went well; 1 a line was refused, a file could not be read or an "
-               "output\ncould not be written; 2 the command line is wrong.");
+    app.footer("Exit codes: 0 all went well; 1 a line was refused, a file could not be read, an "
+               "output\ncould not be written or a limit was met; 2 the command line is wrong; 128 "
+               "and the\nnumber of a signal that ended the run.");
     Action action;
     AddRunCommand(app, action);
     AddCheckCommand(app, action);

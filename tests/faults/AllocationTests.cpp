@@ -1,6 +1,7 @@
 // Memory that runs out at any single place of a design's life: the failure passes to the client,
 // nothing leaks (the address sanitizer looks), nothing dangles, and the engine goes on.
 
+#include <cerrno>
 #include <new>
 
 #include <gtest/gtest.h>
@@ -10,6 +11,7 @@
 #include "tests/support/MemoryFile.h"
 
 extern long allocationsLeft; // of FailingNew.cpp
+extern bool allLaterFail;
 
 namespace {
 
@@ -31,13 +33,28 @@ Lines AllFamilies() {
     return lines;
 }
 
-/// Runs the design; the allocation of that number fails once. False if it was never reached.
-bool RunWithFailure(Lines const &lines, long number) {
+/// Counts what each opening comes to.
+struct Counting : Capture {
+    int Open(char const *name, bool append) override {
+        ++open;
+        return Capture::Open(name, append);
+    }
+    void Finish(WriteStatus &status) override {
+        --open;
+        canceled += status.error == ECANCELED;
+    }
+    int open = 0;
+    int canceled = 0;
+};
+
+/// Runs the design; the allocation of that number fails, and those until the failure has passed to
+/// us. False if it was never reached.
+bool RunWithFailure(Lines const &lines, long number, int &canceledWrites) {
     allocationsLeft = number;
     bool failed = false;
     CommandFactory *factory = nullptr;
     Model *model = nullptr;
-    Capture capture;
+    Counting capture;
     while (!model) {
         try {
             if (!factory)
@@ -45,6 +62,7 @@ bool RunWithFailure(Lines const &lines, long number) {
             model = new Model(factory);
         } catch (std::bad_alloc const &) {
             failed = true;
+            allocationsLeft = -1;
         }
     }
     model->SetWriteOpener(&capture);
@@ -54,6 +72,8 @@ bool RunWithFailure(Lines const &lines, long number) {
             model->Execute(line.c_str());
         } catch (std::bad_alloc const &) {
             failed = true;
+            allocationsLeft = -1;
+            EXPECT_EQ(capture.open, 0) << number << ": " << line;
             EXPECT_EQ(Inconsistency(*model->GetNetlist()), "") << number << ": " << line;
             --i; // once more: what is there already is refused, everything else is done
         } catch (Exception const &refusal) {
@@ -65,15 +85,21 @@ bool RunWithFailure(Lines const &lines, long number) {
     EXPECT_EQ(Inconsistency(*model->GetNetlist()), "") << number;
     delete model;
     delete factory;
+    canceledWrites += capture.canceled;
     return reached;
 }
 
 TEST(Faults, AnAllocationFails) {
     Lines const lines = AllFamilies();
-    long number = 0;
-    while (RunWithFailure(lines, number) && !HasFailure())
-        ++number;
-    EXPECT_GT(number, 300);
+    for (bool const all : {false, true}) {
+        allLaterFail = all;
+        long number = 0;
+        int canceledWrites = 0;
+        while (RunWithFailure(lines, number, canceledWrites) && !HasFailure())
+            ++number;
+        EXPECT_GT(number, 300) << all;
+        EXPECT_GT(canceledWrites, 30) << all;
+    }
 }
 
 } // namespace

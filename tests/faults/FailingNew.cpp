@@ -4,10 +4,13 @@
 #include <new>
 
 long allocationsLeft = -1; ///< until the one that fails; negative: none does
+bool allLaterFail = false; ///< and not that one alone
 
 void *operator new(std::size_t size) {
-    if (allocationsLeft >= 0 && allocationsLeft-- == 0)
+    if (allocationsLeft >= 0 && allocationsLeft-- == 0) {
+        allocationsLeft += allLaterFail ? 1 : 0;
         throw std::bad_alloc();
+    }
     if (void *const block = std::malloc(size ? size : 1))
         return block;
     throw std::bad_alloc();

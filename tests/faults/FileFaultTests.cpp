@@ -8,7 +8,9 @@
 
 #include <gtest/gtest.h>
 
+#include "tests/support/Consistency.h"
 #include "tests/support/Lines.h"
+#include "tests/support/MemoryFile.h"
 #include "tests/support/ReadFile.h"
 #include "tests/support/TempDir.h"
 
@@ -111,6 +113,87 @@ TEST(Faults, AClientOpensTheFiles) {
     design.model.Execute("WRITE VERILOG -APPEND elsewhere");
     EXPECT_EQ(opener.asked, "/no/where elsewhere+ ");
     EXPECT_STREQ(design.model.GetLastWrite().fileName, "elsewhere");
+}
+
+/// Lets blocks pass until it has enough, and keeps what it is asked and told.
+struct Rationing : WriteOpener {
+    int Open(char const *, bool) override {
+        asked += "open ";
+        if (!opens)
+            errno = EPERM;
+        return opens ? file.Open() : -1;
+    }
+    int Allow(std::size_t bytes) override {
+        allowed += bytes;
+        return allowed > most ? EDQUOT : 0;
+    }
+    void Finish(WriteStatus &status) override {
+        asked += "finish " + std::to_string(status.error);
+        if (status.error != 0)
+            status.reason = "enough";
+    }
+
+    MemoryFile file;
+    bool opens = true;
+    std::size_t most = SIZE_MAX;
+    std::size_t allowed = 0;
+    std::string asked;
+};
+
+/// A port map of 2^31 bits would take hours: it ends where the text fails to get anywhere.
+TEST(Faults, AFailedBlockEndsTheGeneration) {
+    struct Row {
+        char const *name;
+        bool opens;
+        std::size_t most;
+        int error;
+    };
+    for (Row const &row :
+         {Row{"refused", true, 1 << 20, EDQUOT}, Row{"refused at once", true, 0, EDQUOT},
+          Row{"not opened", false, SIZE_MAX, EPERM}}) {
+        SCOPED_TRACE(row.name);
+        Design design(CellsAnd("a u1.A; port q out; q u1.Y; q u2.A"));
+        for (char const *const line : {"ADD COMPONENT WIDE", "ADD PIN WIDE D(2147483645:0) in",
+                                       "ADD INSTANCE WIDE w", "ADD SIGNAL huge(2147483646:0)",
+                                       "CONNECT SIGNAL huge(0:2147483645) w.D(2147483645:0)"})
+            design.model.Execute(line);
+        Rationing opener;
+        opener.opens = row.opens;
+        opener.most = row.most;
+        design.model.SetWriteOpener(&opener);
+        std::size_t const open = OpenDescriptors();
+        design.model.Execute("WRITE VHDL x");
+        EXPECT_EQ(opener.asked, "open finish " + std::to_string(row.error));
+        EXPECT_EQ(OpenDescriptors(), open);
+        EXPECT_EQ(design.model.GetLastWrite().error, row.error);
+        EXPECT_STREQ(design.model.GetLastWrite().reason, "enough");
+        // The rewriting is done and the netlist is whole.
+        EXPECT_TRUE(design.netlist.GetSignal("q_DUMMY"));
+        EXPECT_EQ(Inconsistency(design.netlist), "");
+    }
+}
+
+/// Without a write command a stream drops what cannot be written, as before, unless its guard
+/// throws.
+TEST(Faults, AStreamAsksItsGuard) {
+    struct Guard : Basis::Stream::Guard {
+        int Allow(std::size_t bytes) override { return (allowed += bytes) > 5 ? EDQUOT : 0; }
+        void Failed() override { ++failures; }
+        std::size_t allowed = 0;
+        int failures = 0;
+    } guard;
+    MemoryFile file;
+    TextFileOutStream stream(nullptr);
+    stream.SetGuard(&guard);
+    stream << "nowhere";
+    EXPECT_EQ(guard.failures, 1);
+    stream.Adopt(file.Open());
+    for (int i = 0; i < 3; ++i)
+        stream << "abc\n" << OutStream::FLUSH;
+    stream.Close();
+    EXPECT_EQ(stream.GetError(), EDQUOT);
+    EXPECT_EQ(guard.failures, 2);
+    EXPECT_EQ(file.Take(), "abc\n");
 }
 
 } // namespace

@@ -50,6 +50,20 @@ TEST(NetlistHeader, StandsAloneInAFile) {
     EXPECT_EQ(expected.substr(time + 19), written.substr(time + 19));
 }
 
+TEST(NetlistHeader, ShowsTheTimeOfTheOptions) {
+    for (auto const &[moment, shown] :
+         {std::pair<std::time_t, char const *>{0, "01/01/1970 00:00:00"},
+          {1700000000, "11/14/2023 22:13:20"},
+          {253402300799, "12/31/9999 23:59:59"}}) {
+        Design design;
+        design.model.GetOptions()->headerTime = moment;
+        TextMemOutStream stream;
+        HdlUtilities::WriteHeader("top", true, *design.model.GetOptions(), stream);
+        EXPECT_NE(std::string(stream.GetValue()).find(std::string("Timestamp : ") + shown + "\n"),
+                  std::string::npos);
+    }
+}
+
 TEST(HdlUtilities, Texts) {
     for (auto const &[quoted, bare] :
          Pairs(R"(=; a'b=a'b; "a b"=a b; 'a'=a; "a="a; 'a"='a"; "'a'"='a'; '"a"'="a"; ''a''=a;)"

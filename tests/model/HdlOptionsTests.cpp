@@ -42,6 +42,7 @@ TEST(HdlOptions, CopiesTakeAllButTheMacroFlag) {
     HdlOptions &o = *design.model.GetOptions();
     o.writeHeader = o.portOnePerLine = false;
     o.macroNetlist = true;
+    o.headerTime = 1;
     HdlOptions const copy(o);
     HdlOptions assigned;
     assigned = o;
@@ -53,6 +54,7 @@ TEST(HdlOptions, CopiesTakeAllButTheMacroFlag) {
                   "device=d purpose=p reference=r",
                   Changed(*each));
         EXPECT_FALSE(each->macroNetlist);
+        EXPECT_EQ(each->headerTime, 1);
     }
     EXPECT_TRUE(o.macroNetlist && o.vhdlOption.libraries.GetSize() == 2);
 }

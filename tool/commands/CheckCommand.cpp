@@ -4,12 +4,15 @@
 #include <cstring>
 #include <iostream>
 #include <memory>
+#include <new>
+#include <streambuf>
 #include <tuple>
 
 #include <CLI/CLI.hpp>
 
 #include "tool/check/Checker.h"
 #include "tool/session/LineReader.h"
+#include "tool/session/Signals.h"
 
 namespace {
 
@@ -23,6 +26,7 @@ struct CheckOptions {
     bool strict = false;
     bool list = false;
     bool markdown = false;
+    LimitOptions limits;
     ReportOptions report;
 };
 
@@ -34,12 +38,37 @@ bool IsOff(CheckOptions const &options, Checks::Row const &row) {
     return isIn(options.off) || (!options.only.empty() && !isIn(options.only));
 }
 
-int Check(CheckOptions const &options) {
+/// Standard error up to a limit. A message beyond it is left out, and so are all that follow.
+class LimitedError : public std::streambuf {
+public:
+    /// The most bytes; 0 for no limit.
+    explicit LimitedError(unsigned long long bytes) : most(bytes) {}
+    bool IsBeyondLimit() const { return beyondLimit; }
+
+protected:
+    std::streamsize xsputn(char const *text, std::streamsize size) override {
+        written += static_cast<unsigned long long>(size);
+        beyondLimit |= most > 0 && written > most;
+        return beyondLimit ? size : std::cerr.rdbuf()->sputn(text, size);
+    }
+    int overflow(int c) override {
+        char const text = static_cast<char>(c);
+        return xsputn(&text, 1) == 1 ? c : EOF;
+    }
+
+private:
+    unsigned long long most;
+    unsigned long long written = 0;
+    bool beyondLimit = false;
+};
+
+int CheckFiles(CheckOptions const &options, LimitedError &output, Place &place) {
     Checks::Languages const requested = options.language == "vhdl"      ? Checks::VHDL
                                         : options.language == "verilog" ? Checks::VERILOG
                                         : options.language == "both"    ? Checks::BOTH
                                                                         : Checks::NO_LANGUAGE;
-    Reporter reporter(std::cerr, options.report.GetStyle());
+    std::ostream stream(&output);
+    Reporter reporter(stream, options.report.GetStyle());
     Checks::Checker checker(options.modelName, requested);
     for (Checks::Row const &row : Checks::All())
         if (IsOff(options, row))
@@ -48,10 +77,10 @@ int Check(CheckOptions const &options) {
     auto const refuse = [&reporter](Diagnostic const &diagnostic) { reporter.Report(diagnostic); };
     for (std::string const &file : options.files) {
         LineReader reader(file);
-        Place place{file == STANDARD_STREAM ? "<stdin>" : file};
+        place = {file == STANDARD_STREAM ? "<stdin>" : file};
         checker.BeginFile(file, place.file);
         std::string line;
-        while (reader.Next(line)) {
+        while (!output.IsBeyondLimit() && reader.Next(line)) {
             ++place.line;
             if (auto const diagnostic = checker.RunLine(line, place))
                 refuse(*diagnostic);
@@ -68,6 +97,31 @@ int Check(CheckOptions const &options) {
     if (reporter.GetErrorCount() + reporter.GetWarningCount() > 0)
         reporter.ReportCount();
     return reporter.GetErrorCount() > 0 ? SOMETHING_REFUSED : ALL_WELL;
+}
+
+int Check(CheckOptions const &options) {
+    ReportStyle const style = options.report.GetStyle();
+    Signals::EndProgram(EndMessages(style, "", ""));
+    Reporter reporter(std::cerr, style);
+    LimitedError output(options.limits.output);
+    MemoryLimit memory(options.limits.memory);
+    Place place;
+    int exitCode = SOMETHING_REFUSED;
+    try {
+        memory.Apply();
+        exitCode = CheckFiles(options, output, place);
+    } catch (std::bad_alloc const &) {
+        memory.Lift();
+        reporter.Report(OutOfMemory(place, memory));
+    }
+    memory.Lift();
+    if (!output.IsBeyondLimit())
+        return exitCode;
+    reporter.Report(About("vesk-hdl", "the messages would pass the " +
+                                          SizeText(options.limits.output) +
+                                          " that --max-output allows; allow more, or leave "
+                                          "findings out with --off"));
+    return SOMETHING_REFUSED;
 }
 
 int List(bool asMarkdown) {
@@ -118,6 +172,7 @@ void AddCheckCommand(CLI::App &app, Action &action) {
             ->check(isName);
     check.add_flag("--list", options->list, "List all checks and do nothing else");
     check.add_flag("--markdown", options->markdown, "List them as a page")->needs("--list");
+    AddLimitOptions(check, options->limits);
     AddReportOptions(check, options->report);
     check.callback([options, &action] {
         if (!options->list && options->files.empty())

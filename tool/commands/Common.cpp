@@ -1,7 +1,10 @@
 #include "tool/commands/Common.h"
 
+#include <charconv>
 #include <cstdlib>
 #include <cstring>
+#include <sstream>
+#include <tuple>
 #include <unistd.h>
 
 #include <CLI/CLI.hpp>
@@ -44,6 +47,58 @@ void AddOutputDirOption(CLI::App &command, std::string &folder) {
                     "Folder that relative names in WRITE lines are taken from")
         ->check(CLI::ExistingDirectory)
         ->default_str(".");
+}
+
+void AddLimitOptions(CLI::App &command, LimitOptions &options) {
+    for (auto const &[name, size, what] :
+         {std::tuple{"--max-memory", &options.memory, "End the run when it needs more memory"},
+          std::tuple{"--max-output", &options.output, "End the run when it would write more"}})
+        command
+            .add_option(name, *size,
+                        std::string(what) + ": bytes, or with k, M, G, T in units of 1024")
+            ->transform(CLI::AsSizeValue(false).description(""))
+            ->check(CLI::Validator(
+                [](std::string const &bytes) {
+                    return bytes == "0" || bytes[0] == '-' ? "a size is greater than 0" : "";
+                },
+                ""))
+            ->type_name("SIZE");
+}
+
+std::optional<std::time_t> HeaderTime() {
+    constexpr char NAME[] = "SOURCE_DATE_EPOCH";
+    constexpr std::time_t LAST = 253402300799; // of the year 9999: the header has four digits
+    char const *const text = std::getenv(NAME);
+    if (!text || !*text)
+        return std::nullopt;
+    std::string_view const digits(text);
+    std::time_t moment = 0;
+    auto const [end, error] = std::from_chars(digits.begin(), digits.end(), moment);
+    if (error != std::errc() || end != digits.end() || moment < 0 || moment > LAST)
+        throw CLI::ValidationError(NAME, "is no number of seconds since 1970 up to the year 9999");
+    return moment;
+}
+
+std::function<std::string(char const *)> EndMessages(ReportStyle style, char const *eraser,
+                                                     char const *consequence) {
+    return [=](char const *signal) {
+        std::ostringstream text;
+        text << eraser;
+        Reporter(text, style)
+            .Report(About("vesk-hdl", std::string("ended by ") + signal + consequence));
+        return text.str();
+    };
+}
+
+Diagnostic OutOfMemory(Place const &place, MemoryLimit const &limit) {
+    Diagnostic diagnostic;
+    diagnostic.place = place;
+    diagnostic.message = limit.GetSize() == 0
+                             ? "out of memory"
+                             : "out of memory: the run would pass the " +
+                                   SizeText(limit.GetSize()) +
+                                   " that --max-memory allows; allow more, or split the design";
+    return diagnostic;
 }
 
 Diagnostic About(std::string const &file, std::string const &message) {

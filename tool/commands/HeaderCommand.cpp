@@ -1,12 +1,13 @@
 #include "tool/commands/HeaderCommand.h"
 
-#include <cstring>
 #include <iostream>
 #include <memory>
-#include <unistd.h>
 
 #include <CLI/CLI.hpp>
 
+#include "tool/diagnostics/RefusalExplainer.h"
+#include "tool/session/OutputFiles.h"
+#include "tool/session/Signals.h"
 #include "vesk_hdl/Vesk_Hdl.h"
 
 using namespace Vesk_Hdl;
@@ -17,23 +18,29 @@ struct HeaderOptions {
     std::string file;
     std::string application, command, design, device, purpose, reference;
     bool verilog = false;
+    std::optional<std::time_t> time; ///< in place of the present one
 };
 
 int WriteHeader(HeaderOptions const &options) {
-    bool const toStandardOutput = options.file == STANDARD_STREAM;
-    TextFileOutStream stream(toStandardOutput ? nullptr : options.file.c_str(), false);
-    if (toStandardOutput)
-        stream.Adopt(::dup(STDOUT_FILENO));
-    NetlistHeader(options.application.c_str(), options.file.c_str(), options.command.c_str(),
-                  options.design.c_str(), options.device.c_str(), options.purpose.c_str(),
-                  options.reference.c_str(), !options.verilog, stream)
-        .Write();
+    ReportStyle const style = ReportOptions().GetStyle();
+    Signals::EndProgram(EndMessages(style, "", "; the file is as it was before"));
+    OutputFiles outputs;
+    if (options.file == STANDARD_STREAM)
+        outputs.SendNextToStandardOutput();
+    TextFileOutStream stream(options.file.c_str());
+    stream.Adopt(outputs.Open(options.file.c_str(), false));
+    NetlistHeader header(options.application.c_str(), options.file.c_str(), options.command.c_str(),
+                         options.design.c_str(), options.device.c_str(), options.purpose.c_str(),
+                         options.reference.c_str(), !options.verilog, stream);
+    header.Write(options.time ? HdlUtilities::TimeString(*options.time)
+                              : HdlUtilities::CurrentTimeString());
     stream.Close();
-    if (stream.GetError() == 0)
+    WriteStatus status;
+    status.error = stream.GetError();
+    outputs.Finish(status);
+    if (status.error == 0)
         return ALL_WELL;
-    Reporter(std::cerr, ReportOptions().GetStyle())
-        .Report(
-            About(options.file, std::string("cannot write: ") + std::strerror(stream.GetError())));
+    Reporter(std::cerr, style).Report(About(options.file, "cannot write: " + FailureOf(status)));
     return SOMETHING_REFUSED;
 }
 
@@ -53,5 +60,8 @@ void AddHeaderCommand(CLI::App &app, Action &action) {
           {"--purpose", &options->purpose, "What the file is for"},
           {"--reference", &options->reference, "What to read about it"}})
         header.add_option(name, *field, what);
-    header.callback([options, &action] { action = [options] { return WriteHeader(*options); }; });
+    header.callback([options, &action] {
+        options->time = HeaderTime();
+        action = [options] { return WriteHeader(*options); };
+    });
 }

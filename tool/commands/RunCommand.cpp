@@ -4,30 +4,35 @@
 #include <filesystem>
 #include <iostream>
 #include <memory>
+#include <new>
 #include <sys/resource.h>
 #include <system_error>
 
 #include <CLI/CLI.hpp>
 
 #include "tool/diagnostics/Format.h"
+#include "tool/diagnostics/RefusalExplainer.h"
 #include "tool/session/LineReader.h"
 #include "tool/session/OutputFiles.h"
 #include "tool/session/Progress.h"
 #include "tool/session/Session.h"
+#include "tool/session/Signals.h"
 
 using namespace Vesk_Hdl;
 namespace fs = std::filesystem;
 
 namespace {
 
+/// The memory, and the output, of a restricted run: several times what a design of a million
+/// instances takes.
+constexpr unsigned long long RESTRICTED_LIMIT = 4ULL << 30;
+
 /// What `vesk-hdl run` was asked for.
-struct RunOptions {
+struct RunOptions : SessionOptions {
     std::vector<std::string> files; ///< in order
-    std::string modelName;
-    std::string outputDir; ///< empty for the current folder
     std::string vhdlFile;
     std::string verilogFile;
-    std::string confinement; ///< empty for none
+    Restriction restriction;
     std::string progress = "auto";
     bool keepGoing = false;
     bool stats = false;
@@ -37,7 +42,11 @@ struct RunOptions {
 
 /// A name of a file that stays right when the current folder changes.
 std::string Lasting(std::string const &file) {
-    return file.empty() || file == STANDARD_STREAM ? file : fs::absolute(file).string();
+    if (file.empty() || file == STANDARD_STREAM)
+        return file;
+    std::error_code error;
+    fs::path const path = fs::absolute(file, error);
+    return error ? file : path.string();
 }
 
 /// The bytes of all files, 0 if one of them has no size that is known.
@@ -55,21 +64,13 @@ unsigned long long SizeOf(std::vector<std::string> const &files) {
 
 /// The file of --vhdl or --verilog is neither an input nor the other one.
 void RefuseToOverwrite(RunOptions const &options) {
-    auto const same = [](std::string const &left, std::string const &right) {
-        std::error_code error;
-        return fs::equivalent(left, right, error) ||
-               fs::absolute(left).lexically_normal() == fs::absolute(right).lexically_normal();
-    };
-    for (std::string const &output : {options.vhdlFile, options.verilogFile}) {
-        if (output.empty() || output == STANDARD_STREAM || fs::is_character_file(output))
-            continue;
-        for (std::string const &input : options.files)
-            if (input != STANDARD_STREAM && same(output, input))
-                throw CLI::ValidationError(output, "is an input, too");
-    }
-    if (!options.vhdlFile.empty() && options.vhdlFile != STANDARD_STREAM &&
-        !options.verilogFile.empty() && !fs::is_character_file(options.vhdlFile) &&
-        same(options.vhdlFile, options.verilogFile))
+    InputFiles inputs;
+    for (std::string const &file : options.files)
+        inputs.Add(file);
+    for (std::string const &output : {options.vhdlFile, options.verilogFile})
+        if (output != STANDARD_STREAM && inputs.Holds(output))
+            throw CLI::ValidationError(output, "is an input, too");
+    if (IsSamePlace(options.vhdlFile, options.verilogFile))
         throw CLI::ValidationError(options.verilogFile, "is to hold the VHDL, too");
 }
 
@@ -78,12 +79,24 @@ class Runner {
 public:
     explicit Runner(RunOptions const &runOptions)
         : options(runOptions), reporter(std::cerr, StyleOf(runOptions)),
-          progress(WhenOf(runOptions), SizeOf(runOptions.files)) {}
+          progress(WhenOf(runOptions), SizeOf(runOptions.files)), memory(runOptions.limits.memory) {
+    }
 
     int Run() {
-        bool good = Prepare() && RunFiles();
-        if (good || (session && options.keepGoing))
-            good &= WriteFiles();
+        Signals::EndProgram(
+            EndMessages(StyleOf(options), progress.GetEraser(),
+                        "; files that were complete stay, others are as they were"));
+        bool good = false;
+        try {
+            memory.Apply();
+            good = Prepare() && RunFiles();
+            if (good || (session && options.keepGoing && !outputs.IsBeyondLimit()))
+                good &= WriteFiles();
+        } catch (std::bad_alloc const &) {
+            memory.Lift();
+            good = Fail(OutOfMemory(place, memory));
+        }
+        memory.Lift();
         progress.Clear();
         if (options.keepGoing && reporter.GetErrorCount() > 0 && !options.quiet)
             reporter.ReportCount();
@@ -118,12 +131,17 @@ private:
         options.vhdlFile = Lasting(options.vhdlFile);
         options.verilogFile = Lasting(options.verilogFile);
         try {
-            if (!options.confinement.empty())
-                outputs.Confine(options.confinement);
+            if (!options.restriction.folder.empty())
+                outputs.Restrict(options.restriction);
         } catch (std::system_error const &error) {
-            return Fail(About(options.confinement,
+            return Fail(About(options.restriction.folder,
                               "cannot confine files to it: " + error.code().message()));
         }
+        for (std::string const &path : paths)
+            inputs.Add(path);
+        outputs.Protect(&inputs);
+        if (options.limits.output > 0)
+            outputs.SetLimit(options.limits.output);
         std::error_code error;
         if (!options.outputDir.empty())
             fs::current_path(options.outputDir, error);
@@ -137,24 +155,28 @@ private:
         session->SetHints(!options.quiet);
         outputs.SetListener([this](char const *file) { progress.TellWrite(file); });
         session->GetModel().SetWriteOpener(&outputs);
+        session->GetModel().GetOptions()->headerTime = options.headerTime;
         return true;
     }
 
     bool RunFiles() {
         bool good = true;
-        for (std::size_t i = 0; i < paths.size() && (good || options.keepGoing); ++i) {
+        for (std::size_t i = 0; i < paths.size() && GoesOn(good); ++i) {
             std::string const &file = options.files[i];
-            good &= RunFile(paths[i], {file == STANDARD_STREAM ? "<stdin>" : file});
+            place = {file == STANDARD_STREAM ? "<stdin>" : file};
+            good &= RunFile(paths[i]);
         }
         return good;
     }
 
+    bool GoesOn(bool good) const { return good || (options.keepGoing && !outputs.IsBeyondLimit()); }
+
     /// The lines of one file, up to the first refused one unless we are to keep going.
-    bool RunFile(std::string const &path, Place place) {
+    bool RunFile(std::string const &path) {
         LineReader reader(path);
         std::string line;
         bool good = true;
-        while ((good || options.keepGoing) && reader.Next(line)) {
+        while (GoesOn(good) && reader.Next(line)) {
             ++place.line;
             progress.CountLine(line.size() + 1);
             if (std::optional<Diagnostic> const diagnostic = session->RunLine(line, place))
@@ -169,18 +191,18 @@ private:
     /// What --vhdl and --verilog ask for. The user named these files, so that they may lie
     /// anywhere.
     bool WriteFiles() {
-        OutputFiles unconfined;
-        session->GetModel().SetWriteOpener(&unconfined);
+        outputs.Unrestrict();
         bool good = true;
         for (auto const &[language, file] :
              {std::pair{"VHDL", &options.vhdlFile}, std::pair{"VERILOG", &options.verilogFile}}) {
-            if (file->empty())
+            if (file->empty() || outputs.IsBeyondLimit())
                 continue;
             if (*file == STANDARD_STREAM)
-                unconfined.SendNextToStandardOutput();
-            progress.TellWrite(file->c_str());
-            if (int const error = session->Write(language, *file))
-                good = Fail(About(*file, std::string("cannot write: ") + std::strerror(error)));
+                outputs.SendNextToStandardOutput();
+            place = {*file};
+            WriteStatus const &write = session->Write(language, *file);
+            if (write.error != 0)
+                good = Fail(About(*file, "cannot write: " + FailureOf(write)));
         }
         return good;
     }
@@ -215,8 +237,11 @@ private:
     RunOptions options;
     std::vector<std::string> paths; ///< of the files, absolute
     Reporter reporter;
+    InputFiles inputs;
     OutputFiles outputs;
     Progress progress;
+    MemoryLimit memory;
+    Place place; ///< of the line that runs, or a file that is written
     Session *session = nullptr;
 };
 
@@ -232,9 +257,27 @@ void AddRunCommand(CLI::App &app, Action &action) {
                    "Write the design as VHDL behind the last line; '-' is standard output");
     run.add_option("--verilog", options->verilogFile, "The same as Verilog");
     AddOutputDirOption(run, options->outputDir);
-    run.add_option("--restrict", options->confinement,
-                   "Refuse WRITE lines whose file lies outside this folder, links resolved")
-        ->check(CLI::ExistingDirectory);
+    CLI::Option *const restrict =
+        run.add_option(
+               "--restrict", options->restriction.folder,
+               "For files from strangers: WRITE lines may only make new HDL files, and only "
+               "in this folder")
+            ->check(CLI::ExistingDirectory);
+    run.add_flag("--restrict-overwrite", options->restriction.overwrite,
+                 "Let them write over files of the folder, too")
+        ->needs(restrict);
+    run.add_option("--restrict-suffix", options->restriction.suffixes,
+                   "Further suffixes that their files may have, such as .txt")
+        ->allow_extra_args(false)
+        ->delimiter(',')
+        ->check(CLI::Validator(
+            [](std::string const &text) {
+                return text.size() > 1 && text[0] == '.' ? ""
+                                                         : text + ": a suffix begins with a point";
+            },
+            "SUFFIX"))
+        ->needs(restrict);
+    AddLimitOptions(run, options->limits);
     run.add_flag("--keep-going", options->keepGoing,
                  "Go on after a refused line; the exit code still tells of it");
     run.add_flag("--stats", options->stats, "Tell the size of the design, time and memory");
@@ -246,14 +289,18 @@ void AddRunCommand(CLI::App &app, Action &action) {
     AddReportOptions(run, options->report);
     run.callback([options, &action] {
         RefuseToOverwrite(*options);
+        options->headerTime = HeaderTime();
+        LimitOptions &limits = options->limits;
+        if (!options->restriction.folder.empty())
+            for (unsigned long long *const limit : {&limits.memory, &limits.output})
+                *limit = *limit == 0 ? RESTRICTED_LIMIT : *limit;
         action = [options] { return Runner(*options).Run(); };
     });
 }
 
-int RunStandardInput(std::string const &modelName, std::string const &outputDir) {
+int RunStandardInput(SessionOptions const &given) {
     RunOptions options;
     options.files = {STANDARD_STREAM};
-    options.modelName = modelName;
-    options.outputDir = outputDir;
+    static_cast<SessionOptions &>(options) = given;
     return Runner(options).Run();
 }

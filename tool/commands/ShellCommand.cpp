@@ -1,9 +1,11 @@
 #include "tool/commands/ShellCommand.h"
 
+#include <cstdio>
 #include <cstdlib>
 #include <filesystem>
 #include <iostream>
 #include <memory>
+#include <new>
 #include <system_error>
 #include <unistd.h>
 
@@ -15,6 +17,7 @@
 #include "tool/diagnostics/Words.h"
 #include "tool/session/OutputFiles.h"
 #include "tool/session/Session.h"
+#include "tool/session/Signals.h"
 #include "tool/shell/LineEditor.h"
 
 using namespace Vesk_Hdl;
@@ -28,7 +31,9 @@ constexpr char HELP[] =
     "  show THING       netlist, components, instances, signals, ports, options, pins NAME\n"
     "  quit             leaves; so do exit and Ctrl-D\n"
     "TAB completes keywords, names in the design and files; the arrow keys and Ctrl-R go through\n"
-    "the history; Ctrl-C gives the line up.\n";
+    "the history; Ctrl-C gives the line up, or ends the command that runs.\n";
+/// What the message of a signal says.
+constexpr char LOST[] = "; the design is gone, files that were complete stay";
 
 /// $XDG_STATE_HOME/vesk-hdl/history, in a folder that is made; empty if there can be none.
 std::string HistoryFile() {
@@ -51,34 +56,77 @@ char const *DirectionOf(Signal const &signal) {
                                            : "inout";
 }
 
+/// Calls `act` with each object until Ctrl-C.
+template <class T, class Act> void Visit(Iterator<T> objects, Act act) {
+    for (; objects.HasMore() && !Signals::IsInterrupted(); objects.Advance())
+        if (T const object = objects.Current())
+            act(object);
+}
+
 class Shell {
 public:
-    explicit Shell(std::string const &modelName)
-        : session(modelName), model(session.GetModel()),
-          reporter(std::cerr, ReportOptions().GetStyle()) {
+    explicit Shell(SessionOptions const &options)
+        : session(options.modelName), model(session.GetModel()), memory(options.limits.memory),
+          outputDir(options.outputDir), reporter(std::cerr, ReportOptions().GetStyle()) {
         model.SetWriteOpener(&outputs);
+        model.GetOptions()->headerTime = options.headerTime;
+        if (options.limits.output > 0)
+            outputs.SetLimit(options.limits.output);
     }
 
     int Run() {
+        std::error_code error;
+        if (!outputDir.empty())
+            fs::current_path(outputDir, error);
+        if (error) {
+            reporter.Report(About(outputDir, "cannot enter the output folder: " + error.message()));
+            return SOMETHING_REFUSED;
+        }
+        Signals::MarkInterrupts(EndMessages(ReportOptions().GetStyle(), "\n", LOST));
         std::cout << "vesk-hdl " << HdlUtilities::GetVersion() << ", \"help\" tells more\n";
         LineEditor editor("vesk-hdl> ", HistoryFile(),
                           [this](std::string_view line) { return Complete(line, model); });
-        while (std::optional<std::string> const line = editor.Next()) {
+        for (;;) {
+            std::optional<std::string> const line = editor.Next();
+            bool const interrupted = Signals::IsInterrupted(); // by a signal that no key sent
+            Signals::ClearInterrupt();
+            if (!line && !interrupted)
+                break;
+            if (!line) {
+                std::cout << '\n';
+                continue;
+            }
             std::vector<std::string> const words = WordsOf(*line);
             if (!words.empty() &&
                 (SameIgnoringCase(words[0], "quit") || SameIgnoringCase(words[0], "exit")))
                 return ALL_WELL;
             ++place.line;
-            if (words.empty() || RunOwn(words))
-                continue;
-            if (std::optional<Diagnostic> const diagnostic = session.RunLine(*line, place))
-                reporter.Report(*diagnostic);
+            if (!words.empty() && !RunOwn(words))
+                RunLine(*line);
+            std::cout.clear(); // an interrupt may have kept it from writing
+            std::clearerr(stdout);
+            Signals::ClearInterrupt();
         }
         std::cout << '\n';
         return ALL_WELL;
     }
 
 private:
+    /// The limit is for the design; the editor of lines is not made to fail.
+    void RunLine(std::string const &line) {
+        std::optional<Diagnostic> diagnostic;
+        try {
+            memory.Apply();
+            diagnostic = session.RunLine(line, place);
+            memory.Lift();
+        } catch (std::bad_alloc const &) {
+            memory.Lift();
+            diagnostic = OutOfMemory(place, memory);
+        }
+        if (diagnostic)
+            reporter.Report(*diagnostic);
+    }
+
     /// A line of the shell itself; false if it is none.
     bool RunOwn(std::vector<std::string> const &words) {
         std::string const first = Lowercase(words[0]);
@@ -103,15 +151,15 @@ private:
         if (thing == "netlist")
             ShowNetlist();
         else if (thing == "components")
-            ForEach(netlist.GetComponentIterator(),
-                    [](Component *component) { std::cout << component->GetName() << '\n'; });
+            Visit(netlist.GetComponentIterator(),
+                  [](Component *component) { std::cout << component->GetName() << '\n'; });
         else if (thing == "instances")
-            ForEach(netlist.GetInstanceIterator(), [](Instance *instance) {
+            Visit(netlist.GetInstanceIterator(), [](Instance *instance) {
                 std::cout << instance->GetName() << " : " << instance->GetComponent()->GetName()
                           << '\n';
             });
         else if (thing == "signals" || thing == "ports")
-            ForEach(netlist.GetSignalIterator(), [&](Signal *signal) {
+            Visit(netlist.GetSignalIterator(), [&](Signal *signal) {
                 if (thing == "signals" || (signal->IsPort() && signal->IsNeededToDeclared()))
                     ShowSignal(*signal);
             });
@@ -128,7 +176,7 @@ private:
         Netlist const &netlist = *model.GetNetlist();
         auto const count = [](auto objects) {
             unsigned long number = 0;
-            ForEach(objects, [&number](auto) { ++number; });
+            Visit(objects, [&number](auto) { ++number; });
             return number;
         };
         std::cout << netlist.GetName() << ": " << count(netlist.GetComponentIterator())
@@ -153,9 +201,9 @@ private:
             std::cout << '\n';
         };
         if (Instance const *const instance = model.GetInstance(name.c_str()))
-            ForEach(instance->GetPinIterator(), show);
+            Visit(instance->GetPinIterator(), show);
         else if (Component const *const component = model.GetComponent(name.c_str()))
-            ForEach(component->GetPinIterator(), show);
+            Visit(component->GetPinIterator(), show);
         else
             std::cout << "there is no instance or component " << Quoted(name) << '\n';
     }
@@ -178,6 +226,8 @@ private:
     Session session;
     Model &model;
     OutputFiles outputs;
+    MemoryLimit memory;
+    std::string outputDir; ///< empty for the current folder
     Reporter reporter;
     Place place{"<shell>"};
 };
@@ -187,20 +237,16 @@ private:
 void AddShellCommand(CLI::App &app, Action &action) {
     CLI::App &shell = *app.add_subcommand(
         "shell", "An interactive session; runs standard input if that is no terminal");
-    struct Options {
-        std::string modelName;
-        std::string outputDir;
-    };
-    auto const options = std::make_shared<Options>();
+    auto const options = std::make_shared<SessionOptions>();
     AddModelOption(shell, options->modelName);
     AddOutputDirOption(shell, options->outputDir);
+    AddLimitOptions(shell, options->limits);
     shell.callback([options, &action] {
+        options->headerTime = HeaderTime();
         action = [options] {
             if (::isatty(STDIN_FILENO) == 0 || ::isatty(STDOUT_FILENO) == 0)
-                return RunStandardInput(options->modelName, options->outputDir);
-            if (!options->outputDir.empty())
-                fs::current_path(options->outputDir);
-            return Shell(options->modelName).Run();
+                return RunStandardInput(*options);
+            return Shell(*options).Run();
         };
     });
 }

@@ -14,16 +14,18 @@ _vesk_hdl() {
         --off | --only)
             mapfile -t COMPREPLY < <(compgen -W "$(vesk-hdl check --list 2> /dev/null |
                 awk '{ print $1 }')" -- "$word") ;;
-        --model | --application | --command | --design | --device | --purpose | --reference) ;;
+        --model | --max-memory | --max-output | --restrict-suffix) ;;
+        --application | --command | --design | --device | --purpose | --reference) ;;
         *)
             local options='--help'
             case $command in
                 '') options='--help --version run check shell commands header' ;;
-                run) options+=' --model --vhdl --verilog --output-dir --restrict --keep-going --stats
-                    --quiet --progress --diagnostics --color' ;;
+                run) options+=' --model --vhdl --verilog --output-dir --restrict
+                    --restrict-overwrite --restrict-suffix --max-memory --max-output --keep-going
+                    --stats --quiet --progress --diagnostics --color' ;;
                 check) options+=' --model --language --strict --off --only --list --markdown
-                    --diagnostics --color' ;;
-                shell) options+=' --model --output-dir' ;;
+                    --max-memory --max-output --diagnostics --color' ;;
+                shell) options+=' --model --output-dir --max-memory --max-output' ;;
                 commands) options+=' --markdown' ;;
                 header) options+=' --verilog --vhdl --design --application --command --device
                     --purpose --reference' ;;

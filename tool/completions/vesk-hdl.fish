@@ -19,6 +19,8 @@ end
 
 for command in run check shell
     __vesk_hdl_option $command model -x -d 'Name of the design'
+    __vesk_hdl_option $command max-memory -x -d 'End when more memory is needed'
+    __vesk_hdl_option $command max-output -x -d 'End when more would be written'
 end
 for command in run check
     __vesk_hdl_option $command diagnostics -x -a 'text json' -d 'Form of messages'
@@ -29,7 +31,9 @@ for command in run shell
 end
 __vesk_hdl_option run vhdl -r -F -d 'Write the design as VHDL'
 __vesk_hdl_option run verilog -r -F -d 'Write the design as Verilog'
-__vesk_hdl_option run restrict -x -a '(__fish_complete_directories)' -d 'Refuse files outside of it'
+__vesk_hdl_option run restrict -x -a '(__fish_complete_directories)' -d 'Only new HDL files, only in it'
+__vesk_hdl_option run restrict-overwrite -d 'Replace files of that folder, too'
+__vesk_hdl_option run restrict-suffix -x -d 'Further suffixes of files'
 __vesk_hdl_option run keep-going -d 'Go on after a refused line'
 __vesk_hdl_option run stats -d 'Tell the size of the design, time and memory'
 __vesk_hdl_option run quiet -d 'Errors a line each and nothing else'

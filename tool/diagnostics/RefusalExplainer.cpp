@@ -246,10 +246,7 @@ public:
 
     Diagnostic ExplainWrite(WriteStatus const &write) {
         std::string const file(write.fileName.View());
-        diagnostic.message =
-            "cannot write " + file + ": " +
-            (write.error == EXDEV ? "it lies outside the folder that --restrict names"
-                                  : std::strerror(write.error));
+        diagnostic.message = "cannot write " + file + ": " + FailureOf(write);
         CommandHelp const *const command = CommandReference::FindFor(tokens.GetTokens());
         for (int token = command ? command->words : 0; token < tokens.GetSize(); ++token)
             if (tokens.At(token) == file)
@@ -270,6 +267,10 @@ public:
 Diagnostic ExplainRefusal(std::string const &line, Place const &place,
                           Basis::Exception const &refusal, Model const &model, bool withHints) {
     return RefusalExplainer(line, place, refusal, model, withHints).Explain();
+}
+
+std::string FailureOf(WriteStatus const &write) {
+    return write.reason.IsEmpty() ? std::strerror(write.error) : write.reason.GetText();
 }
 
 Diagnostic ExplainWrite(std::string const &line, Place const &place, WriteStatus const &write) {

@@ -14,6 +14,9 @@ Diagnostic ExplainRefusal(std::string const &line, Place const &place,
                           Basis::Exception const &refusal, Vesk_Hdl::Model const &model,
                           bool withHints = true);
 
+/// Why a write failed, as the opener of its file or else the system says it.
+std::string FailureOf(Vesk_Hdl::WriteStatus const &write);
+
 /// A write command whose file did not reach the disk whole.
 Diagnostic ExplainWrite(std::string const &line, Place const &place,
                         Vesk_Hdl::WriteStatus const &write);

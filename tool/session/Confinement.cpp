@@ -1,8 +1,6 @@
 #include "tool/session/Confinement.h"
 
-#include <array>
 #include <cerrno>
-#include <climits>
 #include <deque>
 #include <fcntl.h>
 #include <filesystem>
@@ -10,54 +8,33 @@
 #include <sys/stat.h>
 #include <system_error>
 #include <unistd.h>
-#include <utility>
 #include <vector>
 
 namespace {
-
-constexpr int MOST_LINKS = 40; // as the kernel counts
-
-/// An open descriptor.
-class Descriptor {
-public:
-    explicit Descriptor(int opened) : number(opened) {}
-    Descriptor(Descriptor &&other) noexcept : number(std::exchange(other.number, -1)) {}
-    Descriptor(Descriptor const &) = delete;
-    Descriptor &operator=(Descriptor const &) = delete;
-    Descriptor &operator=(Descriptor &&) = delete;
-    ~Descriptor() {
-        int const error = errno;
-        if (number >= 0)
-            ::close(number);
-        errno = error;
-    }
-    int Get() const { return number; }
-
-private:
-    int number;
-};
 
 /// A walk from the root to the folder of a file. The stack of folders is the real way there, so
 /// that ".." leads back along it whatever links were on it.
 class Walk {
 public:
-    /// False with errno set if a component cannot be entered. On success `rest` is the last
-    /// component, not looked at yet.
+    /// False with errno set if a component cannot be entered or the last one cannot be looked at.
     bool ToFolderOf(std::string const &path) {
         Push(path);
         return Root() && Enter();
     }
 
-    /// Opens the last component; a link there goes on the walk.
-    int OpenLast(bool append) {
-        constexpr mode_t MODE = 0666;
-        int const flags =
-            O_WRONLY | O_CREAT | O_CLOEXEC | O_NOFOLLOW | (append ? O_APPEND : O_TRUNC);
-        return ::openat(Folder(), last.c_str(), flags, MODE);
+    /// Follows the last component, which is a link.
+    bool FollowLast(FilePlace &place) {
+        folders.push_back(std::move(place.folder));
+        return Follow(place.name) && Enter();
     }
 
-    /// Follows the last component, which is a link.
-    bool FollowLast() { return Follow(last) && Enter(); }
+    /// The last component in its folder, which leaves the walk.
+    bool TakeLast(FilePlace &place) {
+        place.folder = std::move(folders.back());
+        folders.pop_back();
+        place.name = last;
+        return place.Look();
+    }
 
     bool IsBelow(dev_t device, ino_t inode) const {
         for (Descriptor const &folder : folders) {
@@ -99,17 +76,15 @@ private:
     }
 
     bool Follow(std::string const &link) {
-        std::array<char, PATH_MAX> target = {};
-        ssize_t const length = ::readlinkat(Folder(), link.c_str(), target.data(), target.size());
-        if (length < 0)
+        std::string const target = ReadLink(Folder(), link);
+        if (target.empty())
             return false;
-        if (++links > MOST_LINKS) {
+        if (++links > FilePlace::MOST_LINKS) {
             errno = ELOOP;
             return false;
         }
-        std::string_view const text(target.data(), static_cast<std::size_t>(length));
-        Push(text);
-        return text.substr(0, 1) != "/" || Root();
+        Push(target);
+        return target[0] != '/' || Root();
     }
 
     /// Enters folders until one component is left.
@@ -154,32 +129,30 @@ Confinement::Confinement(std::string const &folder) : device(0), inode(0) {
     inode = status.st_ino;
 }
 
-int Confinement::Open(std::string const &name, bool append) const {
+bool Confinement::Find(std::string const &name, FilePlace &place) const {
     if (name.empty() || name.back() == '/') {
         errno = name.empty() ? ENOENT : EISDIR;
-        return -1;
+        return false;
     }
     std::error_code error;
     std::filesystem::path const here = std::filesystem::current_path(error);
     if (error) {
         errno = error.value();
-        return -1;
+        return false;
     }
     Walk walk;
     if (!walk.ToFolderOf(name[0] == '/' ? name : here.string() + "/" + name))
-        return -1;
+        return false;
     for (;;) {
         if (!walk.IsBelow(device, inode)) {
             errno = EXDEV;
-            return -1;
+            return false;
         }
-        int opened = -1;
-        do
-            opened = walk.OpenLast(append);
-        while (opened < 0 && errno == EINTR);
-        if (opened >= 0 || errno != ELOOP)
-            return opened;
-        if (!walk.FollowLast())
-            return -1;
+        if (!walk.TakeLast(place))
+            return false;
+        if (!place.IsLink())
+            return true;
+        if (!walk.FollowLast(place))
+            return false;
     }
 }

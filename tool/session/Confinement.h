@@ -3,6 +3,8 @@
 #include <string>
 #include <sys/types.h>
 
+#include "tool/session/FilePlace.h"
+
 /// A folder that files may not leave: for command files from strangers.
 class Confinement {
 public:
@@ -10,10 +12,10 @@ public:
     /// there is none.
     explicit Confinement(std::string const &folder);
 
-    /// Opens a file for writing. The name is resolved here, a component and a link at a time, and
-    /// each is opened without following links: what somebody exchanges meanwhile leads nowhere
-    /// else. -1 with `errno` set; EXDEV for a file outside the folder.
-    int Open(std::string const &name, bool append) const;
+    /// Finds the place of a file. The name is resolved here, a component and a link at a time, and
+    /// each folder is entered without following links: what somebody exchanges meanwhile leads
+    /// nowhere else. False with `errno` set; EXDEV for a file outside the folder.
+    bool Find(std::string const &name, FilePlace &place) const;
 
 private:
     dev_t device;

@@ -67,7 +67,7 @@ void Progress::TellWrite(char const *fileName) {
 void Progress::Put(std::string const &text) {
     // The last column stays free: a terminal might go on to the next line behind it.
     std::size_t const room = static_cast<std::size_t>(ColumnsOfTerminal()) - 1;
-    std::fprintf(stderr, "\r\033[K%s", text.substr(0, room).c_str());
+    std::fprintf(stderr, "%s%s", ERASER, text.substr(0, room).c_str());
     std::fflush(stderr);
     visible = true;
 }
@@ -75,7 +75,7 @@ void Progress::Put(std::string const &text) {
 void Progress::Clear() {
     if (!visible)
         return;
-    std::fputs("\r\033[K", stderr);
+    std::fputs(ERASER, stderr);
     std::fflush(stderr);
     visible = false;
 }

@@ -27,12 +27,16 @@ public:
     /// Takes the bar off the screen, so that something else can be told.
     void Clear();
 
+    /// What a message begins with that takes the bar off by itself.
+    char const *GetEraser() const { return shown ? ERASER : ""; }
+
     unsigned long long GetLines() const { return lines; }
     double GetSeconds() const;
 
 private:
     using Clock = std::chrono::steady_clock;
     static constexpr unsigned LINES_A_LOOK = 1024;
+    static constexpr char ERASER[] = "\r\033[K";
 
     void Look();
     void Draw();

@@ -30,10 +30,10 @@ std::optional<Diagnostic> Session::RunLine(std::string const &line, Place const 
     return ExplainWrite(line, place, write);
 }
 
-int Session::Write(char const *language, std::string const &file) {
+WriteStatus const &Session::Write(char const *language, std::string const &file) {
     StringArray tokens;
     for (char const *const token : {"WRITE", language, file.c_str()})
         tokens.Add(token);
     model->Execute(tokens);
-    return model->GetLastWrite().error;
+    return model->GetLastWrite();
 }

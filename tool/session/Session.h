@@ -15,9 +15,8 @@ public:
     /// reach the disk whole; the place comes back with the column of the token that is to blame.
     std::optional<Diagnostic> RunLine(std::string const &line, Place const &place);
 
-    /// Writes the design as "VHDL" or "VERILOG". The result is 0 or the `errno` of the first
-    /// failure.
-    int Write(char const *language, std::string const &file);
+    /// Writes the design as "VHDL" or "VERILOG".
+    Vesk_Hdl::WriteStatus const &Write(char const *language, std::string const &file);
 
     /// Whether the diagnostics of refused lines get hints for which the design is searched; they do
     /// unless this turns it off.

@@ -83,10 +83,18 @@ bool Model::Write(char const *) {
 WriteStatus const &Model::GetLastWrite() const { return record->lastWrite; }
 
 void Model::SetLastWrite(char const *fileName, int error) {
-    record->lastWrite = {record->lastWrite.number + 1, fileName, error};
+    SetLastWrite({0, fileName, error, {}});
+}
+
+void Model::SetLastWrite(WriteStatus const &status) {
+    int const number = record->lastWrite.number + 1;
+    record->lastWrite = status;
+    record->lastWrite.number = number;
 }
 
 WriteOpener::~WriteOpener() = default;
+int WriteOpener::Allow(std::size_t) { return 0; }
+void WriteOpener::Finish(WriteStatus &) {}
 void Model::SetWriteOpener(WriteOpener *opener) { record->writeOpener = opener; }
 WriteOpener *Model::GetWriteOpener() const { return record->writeOpener; }
 

@@ -1,5 +1,10 @@
 #include "vesk_hdl/engine/WriteCommands.h"
 
+#include <cerrno>
+#include <new>
+#include <unistd.h>
+#include <utility>
+
 #include "vesk_hdl/hdl/VerilogNetlister.h"
 #include "vesk_hdl/hdl/VhdlNetlister.h"
 #include "vesk_hdl/model/HdlModel.h"
@@ -12,19 +17,87 @@ namespace Vesk_Hdl::Commands {
 
 namespace {
 
+/// Thrown where text fails to reach the file, so that the writers do not go on for nothing. One
+/// statement may hold a port map of 2^31 bits: no check between statements would do.
+struct TextIsLost {};
+
+/// The file of a write command, from the opening to the report to the opener.
+class CommandFile : private Basis::Stream::Guard {
+public:
+    CommandFile(Model &model, WriteArguments const &arguments)
+        : opener(model.GetWriteOpener()), stream(arguments.fileName) {
+        status.fileName = arguments.fileName;
+        status.error = ECANCELED; // until the text is written
+        stream.SetGuard(this);
+        if (opener)
+            Adopt(opener->Open(arguments.fileName, arguments.append));
+        else
+            stream.Open(arguments.fileName, arguments.append);
+    }
+    CommandFile(CommandFile const &) = delete;
+    CommandFile &operator=(CommandFile const &) = delete;
+    ~CommandFile() override {
+        try {
+            stream.Close();
+        } catch (std::bad_alloc const &) { // as what ends the command, most likely
+        }
+        Finish();
+    }
+
+    /// Calls `write` with the stream; what it throws passes on, but not TextIsLost. The netlist is
+    /// rewritten before the first text is written, so that it is the same after a failed write.
+    template <class Write> WriteStatus const &Run(Write write) {
+        try {
+            generating = true;
+            write(stream);
+        } catch (TextIsLost const &) {
+        } catch (...) {
+            generating = false;
+            throw;
+        }
+        generating = false;
+        stream.Close();
+        status.error = stream.GetError();
+        Finish();
+        return status;
+    }
+
+private:
+    int Allow(std::size_t bytes) override { return opener ? opener->Allow(bytes) : 0; }
+    void Failed() override {
+        if (generating)
+            throw TextIsLost();
+    }
+
+    void Adopt(int descriptor) {
+        try {
+            stream.Adopt(descriptor);
+        } catch (...) {
+            ::close(descriptor);
+            Finish();
+            throw;
+        }
+    }
+    void Finish() {
+        if (WriteOpener *const asked = std::exchange(opener, nullptr))
+            asked->Finish(status);
+    }
+
+    WriteOpener *opener; ///< null when there is none, or none to report to any more
+    TextFileOutStream stream;
+    WriteStatus status;
+    bool generating = false;
+};
+
 /// Writes the model's netlist. A file that cannot be written raises nothing: the model remembers
 /// what became of the write.
 template <class Write>
 void WriteFile(Model &model, WriteArguments const &arguments, Write writeNetlist) {
-    TextFileOutStream stream(arguments.fileName);
-    if (WriteOpener *const opener = model.GetWriteOpener())
-        stream.Adopt(opener->Open(arguments.fileName, arguments.append));
-    else
-        stream.Open(arguments.fileName, arguments.append);
+    CommandFile file(model, arguments);
     model.GetOptions()->writeHeader = arguments.writeHeader;
-    writeNetlist(stream, model.GetNetlist(), *model.GetOptions());
-    stream.Close();
-    model.SetLastWrite(arguments.fileName, stream.GetError());
+    model.SetLastWrite(file.Run([&model, writeNetlist](OutStream &stream) {
+        writeNetlist(stream, model.GetNetlist(), *model.GetOptions());
+    }));
 }
 
 } // namespace

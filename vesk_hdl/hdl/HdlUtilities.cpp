@@ -11,21 +11,27 @@ namespace Vesk_Hdl {
 
 using Text = Basis::StringBase<char>;
 
-Text HdlUtilities::CurrentTimeString() {
-    TP_TIMESTAMP const now;
-    Text text = now.getTimeStampMonthNumber();
+namespace {
+
+Text Join(TP_TIMESTAMP const &stamp) {
+    Text text = stamp.getTimeStampMonthNumber();
     text += '/';
-    text += now.getTimeStampMonthDay();
+    text += stamp.getTimeStampMonthDay();
     text += '/';
-    text += now.getTimeStampYear();
+    text += stamp.getTimeStampYear();
     text += ' ';
-    text += now.getTimeStampHour();
+    text += stamp.getTimeStampHour();
     text += ':';
-    text += now.getTimeStampMinute();
+    text += stamp.getTimeStampMinute();
     text += ':';
-    text += now.getTimeStampSecond();
+    text += stamp.getTimeStampSecond();
     return text;
 }
+
+} // namespace
+
+Text HdlUtilities::CurrentTimeString() { return Join(TP_TIMESTAMP()); }
+Text HdlUtilities::TimeString(std::time_t moment) { return Join(TP_TIMESTAMP(moment)); }
 
 Text HdlUtilities::ConvertVhdlBase(int base) { return base == 2 ? "b" : base == 8 ? "o" : "x"; }
 Text HdlUtilities::ConvertVerilogBase(int base) { return base == 2 ? "b" : base == 8 ? "o" : "h"; }
@@ -72,9 +78,10 @@ StringArray HdlUtilities::GetAttrNames(Instance const *instance) {
 void HdlUtilities::WriteHeader(Text const &designName, bool isVhdl, HdlOptions const &options,
                                OutStream &stream) {
     auto const *const file = dynamic_cast<TextFileOutStream const *>(&stream);
-    NetlistHeader(options.application, file ? file->GetFileName() : Text(), options.commandStr,
-                  designName, options.device, options.purpose, options.reference, isVhdl, stream)
-        .Write();
+    NetlistHeader header(options.application, file ? file->GetFileName() : Text(),
+                         options.commandStr, designName, options.device, options.purpose,
+                         options.reference, isVhdl, stream);
+    header.Write(options.headerTime ? TimeString(*options.headerTime) : CurrentTimeString());
 }
 
 } // namespace Vesk_Hdl

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <ctime>
+
 #include "vesk_hdl/netlist/NetlistFwd.h"
 #include "vesk_hdl/text/StringArray.h"
 
@@ -13,6 +15,8 @@ class VESK_HDL_API HdlUtilities {
 public:
     /// Local date and time, MM/DD/YYYY hh:mm:ss.
     static Basis::StringBase<char> CurrentTimeString();
+    /// The date and time of a moment in UTC, in the same form.
+    static Basis::StringBase<char> TimeString(std::time_t moment);
     /// The letter of a bit string literal: "b" for 2, "o" for 8, otherwise "x" in VHDL and "h" in
     /// Verilog.
     static Basis::StringBase<char> ConvertVhdlBase(int base);
@@ -28,7 +32,8 @@ public:
     /// reported. Null gives an empty array.
     static StringArray GetAttrNames(Instance const *instance);
     /// Writes the file header with the fields of the options, in the comment syntax of the
-    /// language. The file name is that of a TextFileOutStream, otherwise empty.
+    /// language. The file name is that of a TextFileOutStream, otherwise empty. The time is that
+    /// of the options, otherwise the present one.
     static void WriteHeader(Basis::StringBase<char> const &designName, bool isVhdl,
                             HdlOptions const &options, OutStream &stream);
 };

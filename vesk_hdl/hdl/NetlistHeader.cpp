@@ -27,10 +27,24 @@ NetlistHeader::NetlistHeader(Text const &applicationText, Text const &fileNameTe
 NetlistHeader::~NetlistHeader() = default;
 
 void NetlistHeader::Write() {
+    WriteHead();
+    WriteLogo(application, fileName);
+    WriteFields();
+}
+
+void NetlistHeader::Write(Text const &timestamp) {
+    WriteHead();
+    WriteLogo(application, fileName, timestamp);
+    WriteFields();
+}
+
+void NetlistHeader::WriteHead() {
     WriteDivider();
     WriteCopyright();
     WriteDivider();
-    WriteLogo(application, fileName);
+}
+
+void NetlistHeader::WriteFields() {
     WriteCommand();
     WriteDesignName();
     WriteDevice();
@@ -49,19 +63,23 @@ void NetlistHeader::WriteCopyright() {
     Put(stream, commentPrefix, " ", "Copyright (c) Orvane. All rights reserved.", EOL);
 }
 
-/// The drawing keeps to 16 columns behind the comment mark; the fields begin in column 17.
 void NetlistHeader::WriteLogo(Text const &applicationText, Text const &fileNameText) {
+    WriteLogo(applicationText, fileNameText, HdlUtilities::CurrentTimeString());
+}
+
+/// The drawing keeps to 16 columns behind the comment mark; the fields begin in column 17.
+void NetlistHeader::WriteLogo(Text const &applicationText, Text const &fileNameText,
+                              Text const &timestamp) {
     Text const &P = commentPrefix;
     Text const version = HdlUtilities::GetVersion();
     Text const tail = Basis::FileName(fileNameText).GetTail();
-    Text const now = HdlUtilities::CurrentTimeString();
     Put(stream, P, "##          ##", EOL);
     Put(stream, P, "###        ###", EOL);
     Put(stream, P, " ###      ###   ", "Vendor: Orvane ", EOL);
     Put(stream, P, "  ###    ###    ", "Version : ", version, EOL);
     Put(stream, P, "   ###  ###     ", "Application : ", applicationText, EOL);
     Put(stream, P, "    ######      ", "Filename : ", tail, EOL);
-    Put(stream, P, "     ####       ", "Timestamp : ", now, EOL);
+    Put(stream, P, "     ####       ", "Timestamp : ", timestamp, EOL);
     Put(stream, P, "  ===========", EOL);
     Put(stream, P, " =============", EOL);
     Put(stream, P, EOL);

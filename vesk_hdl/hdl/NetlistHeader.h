@@ -23,13 +23,21 @@ public:
     NetlistHeader(NetlistHeader const &) = delete;
     NetlistHeader &operator=(NetlistHeader const &) = delete;
 
+    /// Writes the block with the present local time.
     void Write();
+    /// Writes it with that text in the place of the time.
+    void Write(Basis::StringBase<char> const &timestamp);
 
 private:
+    void WriteHead();
+    void WriteFields();
     void WriteDivider();
     void WriteCopyright();
     void WriteLogo(Basis::StringBase<char> const &application,
                    Basis::StringBase<char> const &fileName);
+    void WriteLogo(Basis::StringBase<char> const &application,
+                   Basis::StringBase<char> const &fileName,
+                   Basis::StringBase<char> const &timestamp);
     void WriteCommand();
     void WriteDesignName();
     void WriteDevice();

@@ -19,6 +19,8 @@ struct WriteStatus {
     int number = 0;                   ///< the how many-th write of the model it was, from 1
     Basis::StringBase<char> fileName; ///< as the command named it
     int error = 0; ///< `errno` of the first failure to open, write or close, or 0
+    /// What the opener says of the failure, without an end of line; empty if `error` says it all.
+    Basis::StringBase<char> reason;
 };
 
 /// Opens the files of a model's write commands in place of the library: derived by a client that
@@ -29,6 +31,14 @@ public:
     /// A descriptor open for writing, which the library closes; or -1 with `errno` set, and the
     /// text is dropped as for a file that cannot be opened. The name is as the command gave it.
     virtual int Open(char const *fileName, bool append) = 0;
+    /// Asked before each block of text goes to the file: 0 to let so many bytes pass, as by
+    /// default, or the `errno` that the write fails with. The generation of the text then ends.
+    /// Asked with 0 bytes when a signal interrupted a write that had to wait. It must not throw.
+    virtual int Allow(std::size_t bytes);
+    /// Called once after each Open, when the descriptor is closed: the text is in the file whole
+    /// unless the status has an error, which is ECANCELED when an exception ends the command. The
+    /// opener may set an error and a reason; by default it does nothing. It must not throw.
+    virtual void Finish(WriteStatus &status);
 };
 
 /// One design, and the object that commands run against: every change by name goes through it.
@@ -81,8 +91,9 @@ public:
 
     /// What the last write command did. A file that cannot be written raises nothing: ask here.
     WriteStatus const &GetLastWrite() const;
-    /// For write commands.
+    /// For write commands. The second form takes everything but the number, which is counted here.
     void SetLastWrite(char const *fileName, int error);
+    void SetLastWrite(WriteStatus const &status);
     /// Who opens the files of write commands; null, as at first, for the library itself. Not owned.
     void SetWriteOpener(WriteOpener *opener);
     WriteOpener *GetWriteOpener() const;

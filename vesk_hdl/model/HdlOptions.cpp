@@ -40,7 +40,7 @@ HdlOptions::HdlOptions(HdlOptions &other)
     : vhdlOption(other.vhdlOption), verilogOption(other.verilogOption),
       writeHeader(other.writeHeader), application(other.application), commandStr(other.commandStr),
       device(other.device), purpose(other.purpose), reference(other.reference),
-      portOnePerLine(other.portOnePerLine), macroNetlist(false) {}
+      portOnePerLine(other.portOnePerLine), macroNetlist(false), headerTime(other.headerTime) {}
 
 HdlOptions::~HdlOptions() = default;
 
@@ -54,6 +54,7 @@ HdlOptions &HdlOptions::operator=(HdlOptions &other) {
     purpose = other.purpose;
     reference = other.reference;
     portOnePerLine = other.portOnePerLine;
+    headerTime = other.headerTime;
     return *this;
 }
 

@@ -1,5 +1,8 @@
 #pragma once
 
+#include <ctime>
+#include <optional>
+
 #include "vesk_hdl/text/StringArray.h"
 
 namespace Vesk_Hdl {
@@ -78,6 +81,8 @@ public:
     /// The netlist is a macro that takes INIT as a generic of its own. Each write computes it, also
     /// through a const reference, and nobody copies it.
     mutable bool macroNetlist;
+    /// The moment that the header shows, in UTC; without one it shows the local time of the write.
+    std::optional<std::time_t> headerTime;
 };
 
 } // namespace Vesk_Hdl

@@ -2,7 +2,9 @@
 
 #include <cerrno>
 #include <charconv>
+#include <new>
 #include <string>
+#include <utility>
 
 #include "vesk_hdl/text/FoldingLine.h"
 
@@ -28,7 +30,12 @@ public:
     explicit TextFileDst(char const *name) : fileName(name) {}
     TextFileDst(TextFileDst const &) = delete;
     TextFileDst &operator=(TextFileDst const &) = delete;
-    ~TextFileDst() override { Close(); }
+    ~TextFileDst() override {
+        try {
+            Close();
+        } catch (std::bad_alloc const &) { // it is closed all the same
+        }
+    }
 
     void Flush() override {
         if (!file)
@@ -41,10 +48,14 @@ public:
     void WriteNewLine() override {
         if (file)
             EndLine();
+        else
+            Drop();
     }
 
     void Write(char const *text) override {
-        if (file && !line.AppendShort(text))
+        if (!file)
+            Drop();
+        else if (!line.AppendShort(text))
             WriteAny(text);
     }
     void Write(int value) override {
@@ -71,10 +82,20 @@ public:
     void Close() {
         if (!file)
             return;
+        struct Closing {
+            TextFileDst &dst;
+            ~Closing() {
+                if (!File::close(std::exchange(dst.file, nullptr)))
+                    dst.error = errno;
+            }
+        } const closing{*this};
         Flush();
-        if (!File::close(file))
-            error = errno;
-        file = nullptr;
+    }
+
+    void SetGuard(Stream::Guard *wanted) {
+        guard = wanted;
+        if (file)
+            file->SetGuard(guard);
     }
 
     bool IsOpen() const { return file != nullptr; }
@@ -85,6 +106,8 @@ private:
     bool Take(Stream *opened) {
         file = opened;
         error = file ? 0 : errno;
+        if (file)
+            file->SetGuard(guard);
         return file != nullptr;
     }
 
@@ -99,6 +122,12 @@ private:
             EndLine();
             ++text;
         }
+    }
+
+    /// Text that has no file to go to.
+    [[gnu::noinline]] void Drop() {
+        if (guard)
+            guard->Failed();
     }
 
     std::size_t Indentation() { return 3 * static_cast<std::size_t>(GetIndentLevel()); }
@@ -117,6 +146,7 @@ private:
     FoldingLine line;
     Basis::StringBase<char> fileName;
     int error = 0;
+    Stream::Guard *guard = nullptr;
 };
 
 class TextMemDst : public StreamDst {
@@ -186,6 +216,10 @@ Basis::StringBase<char> TextFileOutStream::GetFileName() const {
 }
 
 int TextFileOutStream::GetError() const { return static_cast<TextFileDst *>(dst)->GetError(); }
+
+void TextFileOutStream::SetGuard(Stream::Guard *guard) {
+    static_cast<TextFileDst *>(dst)->SetGuard(guard);
+}
 
 TextMemOutStream::TextMemOutStream(char const *value) : OutStream(new TextMemDst(value)) {}
 

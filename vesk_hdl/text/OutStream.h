@@ -1,5 +1,6 @@
 #pragma once
 
+#include "vesk_hdl/text/basis/File.h"
 #include "vesk_hdl/text/basis/StringBase.h"
 
 /// Where the text of an OutStream goes. A client may derive one of its own.
@@ -82,6 +83,9 @@ public:
     /// What kept the text from reaching the disk whole since the last opening: the `errno` of the
     /// first failure to open, write, flush or close, 0 for none so far. Ask after Close.
     int GetError() const;
+    /// Who decides about the blocks of the file, also of one that is opened later; null, as at
+    /// first, for nobody. While no file is open, each piece of text calls Guard::Failed. Not owned.
+    void SetGuard(Basis::Stream::Guard *guard);
 };
 
 /// A stream into memory, without indentation or folding.

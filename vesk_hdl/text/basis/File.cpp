@@ -7,6 +7,7 @@
 #include <memory>
 #include <string>
 #include <unistd.h>
+#include <utility>
 
 #include "vesk_hdl/text/basis/OrEmpty.h"
 
@@ -29,15 +30,18 @@ bool ReadAll(int descriptor, std::string &text) {
     }
 }
 
-int WriteAll(int descriptor, std::string_view text) {
-    while (!text.empty()) {
+int WriteAll(int descriptor, std::string_view text, Stream::Guard *guard) {
+    int error = guard ? guard->Allow(text.size()) : 0;
+    while (error == 0 && !text.empty()) {
         ssize_t const put = ::write(descriptor, text.data(), text.size());
-        if (put < 0 && errno != EINTR)
-            return errno;
-        if (put > 0)
+        if (put >= 0)
             text.remove_prefix(static_cast<std::size_t>(put));
+        else if (errno != EINTR)
+            error = errno;
+        else if (guard)
+            error = guard->Allow(0);
     }
-    return 0;
+    return error;
 }
 
 } // namespace
@@ -45,6 +49,7 @@ int WriteAll(int descriptor, std::string_view text) {
 struct Stream::Record {
     int descriptor = -1; ///< of a file that is written, otherwise -1
     int error = 0;
+    Guard *guard = nullptr;
     std::string text; ///< read: the whole file; written: a block, empty before the first text
     std::size_t position = 0; ///< in the text; what stands before is read, or not yet written
 
@@ -54,12 +59,15 @@ struct Stream::Record {
     ~Record() { Close(); }
 
     void Put(std::string_view whole) {
-        if (descriptor >= 0 && error == 0)
-            error = WriteAll(descriptor, whole);
+        if (descriptor < 0 || error != 0)
+            return;
+        error = WriteAll(descriptor, whole, guard);
+        if (error != 0 && guard)
+            guard->Failed();
     }
     void Flush() {
-        Put(std::string_view(text).substr(0, position));
-        position = 0;
+        if (std::size_t const count = std::exchange(position, 0); count > 0)
+            Put(std::string_view(text).substr(0, count));
     }
     int Close() {
         if (descriptor >= 0) {
@@ -101,6 +109,9 @@ Stream &Stream::flush() {
 }
 
 int Stream::GetError() const { return record->error; }
+void Stream::SetGuard(Guard *guard) { record->guard = guard; }
+
+Stream::Guard::~Guard() = default;
 
 bool Stream::ReadLine(std::string_view &line) {
     if (record->descriptor >= 0 || record->position >= record->text.size())

@@ -10,6 +10,19 @@ class VESK_HDL_API Stream {
 public:
     enum Access : int { ACCESS_READ = 1, ACCESS_REPLACE = 2, ACCESS_APPEND = 6 };
 
+    /// Decides block by block whether text may go to a file. A client may derive one of its own.
+    class VESK_HDL_API Guard {
+    public:
+        virtual ~Guard();
+        /// Asked before each block: 0 if so many bytes may be written, otherwise the `errno` that
+        /// the write then fails with. Asked with 0 bytes when a signal interrupted a write that
+        /// had to wait. It must not throw.
+        virtual int Allow(std::size_t bytes) = 0;
+        /// Called at the first failure, refused blocks included. It may throw to end what is being
+        /// written, unless the stream is being closed or destroyed.
+        virtual void Failed() = 0;
+    };
+
     /// Releases what the stream holds. Text not yet flushed is still written, but a failure goes
     /// unseen: File::close tells it.
     ~Stream();
@@ -22,6 +35,8 @@ public:
     Stream &flush();
     /// The `errno` of the first failed write, 0 while there is none.
     int GetError() const;
+    /// For a stream that is written; null, as at first, for no guard. Not owned.
+    void SetGuard(Guard *guard);
 
     /// The next line without its end, valid as long as the stream; false when none is left.
     bool ReadLine(std::string_view &line);

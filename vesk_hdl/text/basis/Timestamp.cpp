@@ -7,6 +7,12 @@ TP_TIMESTAMP::TP_TIMESTAMP() : moment() {
     localtime_r(&now, &moment);
 }
 
+TP_TIMESTAMP::TP_TIMESTAMP(std::time_t instant) : moment() {
+    std::time_t const epoch = 0;
+    if (!gmtime_r(&instant, &moment))
+        gmtime_r(&epoch, &moment);
+}
+
 TP_TIMESTAMP::~TP_TIMESTAMP() = default;
 
 Text TP_TIMESTAMP::getTimeStampMonthNumber() const {

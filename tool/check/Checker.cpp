@@ -82,12 +82,20 @@ void Checker::CheckWriteLine(LineTokens const &tokens, std::uint32_t number) {
     bool &writeHeader = session.GetModel().GetOptions()->writeHeader;
     writeHeader = true;
     for (int token = FIRST; token < size; ++token) {
-        writeHeader &= token >= file || !SameIgnoringCase(tokens.At(token), "-NOHEADER");
         auto const is = [&](char const *word) { return SameIgnoringCase(tokens.At(token), word); };
+        writeHeader &= token >= file || !is("-NOHEADER");
         bool const known = is("-APPEND") || is("-OVERWRITE") || is("-NOHEADER");
         if (token > file || (token < file && !known))
             add(Id::WRITE_OPTION, token);
     }
+    std::string_view const path = tokens.At(file);
+    Languages const readers = RefusedInComment(path.substr(path.rfind('/') + 1));
+    if (writeHeader && readers != NO_LANGUAGE)
+        findings.Add({Id::TEXT_CHARACTER,
+                      SpotOf(tokens, file, number),
+                      "file name " + Quoted(path) + " in the header",
+                      {},
+                      readers});
 }
 
 void Checker::CheckDesign(Languages languages) {

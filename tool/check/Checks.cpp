@@ -135,7 +135,7 @@ std::vector<Row> const ROWS = {
     {Id::INOUT_IN_COMPOUND, "inout-in-compound", BOTH,
      "cuts an inout port off from its pins: what gets a dummy signal is joined to it in one "
      "direction only",
-     "connect the inout port to pins of its own, or let the compound begin with an inner net"},
+     "connect the inout port to pins of its own, or put an inner net in place of the first port"},
     {Id::BYPASSED_DUMMY, "bypassed-dummy", BOTH,
      "stays on a net whose readers get a dummy signal, which nothing drives",
      "drive an inner net and assign this one from it with CONNECT SIGNAL"},

@@ -140,5 +140,7 @@ void CheckConstants(Design const &design);
 void CheckAttributes(Design const &design);
 void CheckMacro(Design const &design);
 void CheckTexts(Design const &design);
+/// The languages that do not take a text in a comment.
+Languages RefusedInComment(std::string_view text);
 
 } // namespace Checks

@@ -146,10 +146,9 @@ private:
     void CheckAttribute(AttributeUse const &use) {
         Attribute const &attribute = *use.attribute;
         Attribute::ValueType const type = attribute.GetValueType();
-        if (type != Attribute::VALUE_STRING && type != Attribute::VALUE_USER &&
-            type != Attribute::VALUE_BIT_VECTOR)
-            return; // the text of a number
-        Text const value = attribute.GetValueString();
+        bool const isText = type == Attribute::VALUE_STRING || type == Attribute::VALUE_USER ||
+                            type == Attribute::VALUE_BIT_VECTOR;
+        Text const value = isText ? attribute.GetValueString() : Text();
         if (!IsDoubtful(value.View()) && !IsDoubtful(attribute.GetNameRef().View()))
             return;
         Spot spot = design.MadeAt(&attribute);
@@ -198,5 +197,13 @@ private:
 } // namespace
 
 void CheckTexts(Design const &design) { TextChecker(design).Run(); }
+
+Languages RefusedInComment(std::string_view text) {
+    Languages languages = NO_LANGUAGE;
+    for (char const c : text)
+        for (Languages const language : {VHDL, VERILOG})
+            languages |= IsRefused(c, language, false) ? language : NO_LANGUAGE;
+    return languages;
+}
 
 } // namespace Checks

@@ -110,6 +110,29 @@ TEST(Netlisters, NoPortsAndNoPins) {
               written.verilog);
 }
 
+/// An attribute of the instance hides the component's of that name, whether it is written or not.
+TEST(VerilogNetlister, WritesAttributesOfTheComponentUnlessTheInstanceHasThem) {
+    Design design(Short("ADD COMPONENT C; ADD COMPONENT ATTRIBUTE C KEEP v;"
+                        "SET COMPONENT ATTRIBUTE OPTION C KEEP -SYNATTR=ASSIGN;"
+                        "ADD COMPONENT ATTRIBUTE C SIZE 4;"
+                        "SET COMPONENT ATTRIBUTE OPTION C SIZE -GENERIC=SYN;"
+                        "ADD COMPONENT ATTRIBUTE C LATER w; ADD INSTANCE C u1; ADD INSTANCE C u2;"
+                        "ADD INSTANCE C u3; ADD INSTANCE ATTRIBUTE u1 keep x;"
+                        "SET INSTANCE ATTRIBUTE OPTION u1 keep -SYNATTR=NONE -GENERIC=NONE;"
+                        "ADD INSTANCE ATTRIBUTE u2 size 5;"
+                        "SET INSTANCE ATTRIBUTE OPTION u2 size -GENERIC=NONE;"
+                        "SET COMPONENT ATTRIBUTE OPTION C LATER -SYNATTR=ASSIGN"));
+    std::string const text = Written(design).verilog;
+    for (auto const &[line, isThere] : {std::pair{"attribute KEEP of u1", false},
+                                        {"attribute LATER of u1", true},
+                                        {"defparam u1.SIZE", true},
+                                        {"attribute KEEP of u2", true},
+                                        {"defparam u2.", false},
+                                        {"attribute KEEP of u3", true},
+                                        {"defparam u3.SIZE", true}})
+        EXPECT_EQ(isThere, text.find(line) != std::string::npos) << line << " in\n" << text;
+}
+
 TEST(VhdlNetlister, DeclaresAttributesOnceInItsLife) {
     Design design(Short("sig N; ADD SIGNAL ATTRIBUTE N K V;"
                         "SET SIGNAL ATTRIBUTE OPTION N K -SYNATTR=ASSIGN"));

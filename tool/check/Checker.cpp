@@ -14,12 +14,12 @@ namespace Checks {
 
 std::optional<Diagnostic> Checker::RunLine(std::string const &line, Place const &place) {
     std::uint32_t const number = places.NextLine(line);
-    LineTokens const tokens(line);
+    tokens.Read(line);
     CommandHelp const *const command = CommandReference::FindFor(tokens.GetTokens());
     bool const isVhdl = command && std::strcmp(command->keyword, "WRITE VHDL") == 0;
     bool const isVerilog = command && std::strcmp(command->keyword, "WRITE VERILOG") == 0;
     if ((isVhdl || isVerilog) && line.find('\0') == std::string::npos)
-        return PassWrite(line, place, tokens, number, isVhdl ? VHDL : VERILOG);
+        return PassWrite(line, place, number, isVhdl ? VHDL : VERILOG);
     if (tokens.GetSize() > 0) {
         changed = true;
         RewriteDesign();
@@ -27,7 +27,7 @@ std::optional<Diagnostic> Checker::RunLine(std::string const &line, Place const 
     // What happens while lines run concerns whatever will be written.
     findings.SetLanguages(RequestedOr(BOTH));
     recorder.Before(tokens, command, command ? command->words : 0, number);
-    std::optional<Diagnostic> diagnostic = session.RunLine(line, place);
+    std::optional<Diagnostic> diagnostic = session.RunLine(line, tokens.GetTokens(), place);
     recorder.After(!diagnostic);
     return diagnostic;
 }
@@ -40,8 +40,7 @@ void Checker::Finish(std::function<void(Diagnostic &)> const &show) {
 
 /// A line that writes: its arguments are read and what it would write is checked.
 std::optional<Diagnostic> Checker::PassWrite(std::string const &line, Place const &place,
-                                             LineTokens const &tokens, std::uint32_t number,
-                                             Languages language) {
+                                             std::uint32_t number, Languages language) {
     std::unique_ptr<Command> const command(
         factory.CreateCommand(&session.GetModel(), tokens.GetTokens()));
     if (!command->ParseArguments(tokens.GetTokens())) {
@@ -53,7 +52,7 @@ std::optional<Diagnostic> Checker::PassWrite(std::string const &line, Place cons
     written |= language;
     changed = false;
     findings.SetLanguages(RequestedOr(language));
-    CheckWriteLine(tokens, number);
+    CheckWriteLine(number);
     CheckDesign(RequestedOr(language));
     lastWrites.push_back(line);
     writesVhdl |= language == VHDL;
@@ -70,7 +69,7 @@ void Checker::RewriteDesign() {
 
 /// The number of tokens alone tells which one names the file. Each line says whether there is a
 /// header.
-void Checker::CheckWriteLine(LineTokens const &tokens, std::uint32_t number) {
+void Checker::CheckWriteLine(std::uint32_t number) {
     constexpr int FIRST = 2;
     int const size = tokens.GetSize();
     int const file = size == FIRST + 2 || size == FIRST + 3 ? size - 1 : FIRST;

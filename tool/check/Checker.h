@@ -33,10 +33,9 @@ public:
 
 private:
     std::optional<Diagnostic> PassWrite(std::string const &line, Place const &place,
-                                        LineTokens const &tokens, std::uint32_t number,
-                                        Languages language);
+                                        std::uint32_t number, Languages language);
     void RewriteDesign();
-    void CheckWriteLine(LineTokens const &tokens, std::uint32_t number);
+    void CheckWriteLine(std::uint32_t number);
     void CheckDesign(Languages languages);
     Design DesignNow() { return Design(session.GetModel(), places, recorder, findings); }
     Languages RequestedOr(Languages others) const {
@@ -48,6 +47,7 @@ private:
     Places places;
     Findings findings;
     Recorder recorder;
+    LineTokens tokens; ///< of the line that runs
     Languages requested;
     Languages written = NO_LANGUAGE;
     std::vector<std::string> lastWrites; ///< lines for which the design is not yet rewritten

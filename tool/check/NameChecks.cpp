@@ -18,17 +18,18 @@ using VerilogOption = HdlOptions::VerilogOption;
 /// A name as it is going to be written.
 struct WrittenName {
     std::string_view name; ///< without brackets
-    std::string what;      ///< "net", "component", ...
+    std::string_view what; ///< "net", "component", ...
     void const *object;
     VerilogOption::CaseType nameCase = VerilogOption::CASE_DEFAULT;
     Languages languages = BOTH;
     std::string_view shown = {};  ///< where it differs from the name
-    std::string owner = {};       ///< with a point, of a pin
+    std::string_view owner = {};  ///< of a pin
     bool inEntity = false;        ///< declared there
     bool inConfiguration = false; ///< visible in a configuration that takes components from work
 
     std::string Subject() const {
-        return what + " " + Quoted(owner + std::string(shown.empty() ? name : shown));
+        std::string const own = Shortened(shown.empty() ? name : shown);
+        return std::string(what) + " " + Quoted(owner.empty() ? own : Shortened(owner) + "." + own);
     }
 };
 
@@ -185,6 +186,13 @@ private:
 
     void CheckWords(WrittenName const &name, Languages illegal) {
         std::string const vhdl = Lowercase(name.name);
+        // Most names of a large design are numbered, and no reserved word has such a digit.
+        if (vhdl.find_first_of("23456789") == std::string::npos)
+            CheckReserved(name, vhdl, illegal);
+        CheckTypes(name, vhdl);
+    }
+
+    void CheckReserved(WrittenName const &name, std::string const &vhdl, Languages illegal) {
         std::string const verilog = Cased(name.name, name.nameCase);
         // "force" is missing in the library's table and reserved all the same.
         bool const reservedInVerilog =
@@ -202,6 +210,10 @@ private:
                 newer == BOTH   ? "VHDL-2008 and SystemVerilog"
                 : newer == VHDL ? "VHDL-2008"
                                 : "SystemVerilog");
+    }
+
+    /// What the declarations of the file name besides reserved words.
+    void CheckTypes(WrittenName const &name, std::string const &vhdl) {
         bool const isOuter =
             name.what == "port" || name.what == "design" || name.what == "attribute";
         if ((name.what == "pin" ? pinTypes : innerTypes).count(vhdl) > 0 ||
@@ -244,7 +256,7 @@ private:
 
     void CheckPin(Component const &component, Pin const &pin) {
         WrittenName name{BaseOf(pin), "pin", &pin};
-        name.owner = std::string(component.GetNameRef().View()) + ".";
+        name.owner = component.GetNameRef().View();
         name.shown = pin.GetNameRef().View();
         if (!Bus::IsBusName(pin.GetNameRef()) && !BusIndex::IsBusIndexName(pin.GetNameRef()))
             name.name = name.shown; // brackets and all

@@ -179,13 +179,34 @@ private:
     std::vector<BitUse> uses;
 };
 
+/// Whether a scalar has one driver and a reader, or is a port that needs no more than it has: most
+/// nets of a design, about which there is nothing to say.
+bool IsPlain(Design const &design, Signal const &net) {
+    if (net.GetSignalType() != Signal::SIGNAL_SCALAR || net.HasConstantValue() ||
+        !design.FurtherUses(&net).empty())
+        return false;
+    int drivers = 0;
+    int readers = 0;
+    bool hasEither = false;
+    Design::ForEachPinOn(net, [&](Pin const *pin) {
+        Use::Kind const kind = Design::UseOf(pin).kind;
+        ++(kind == Use::DRIVES ? drivers : readers);
+        hasEither |= kind == Use::EITHER;
+    });
+    Polarity const polarity = net.GetPortPolarity();
+    if (hasEither || polarity == Polarity::BIDIRECTIONAL)
+        return false;
+    return polarity == Polarity::INPUT ? drivers == 0
+                                       : drivers == 1 && (readers > 0 || net.IsPort());
+}
+
 } // namespace
 
 void CheckNets(Design const &design) {
     bool hasPorts = false;
     design.ForEachSignal([&](Signal const *signal) {
         hasPorts |= signal->IsPort() && signal->IsNeededToDeclared();
-        if (signal->IsNeededToDeclared())
+        if (signal->IsNeededToDeclared() && !IsPlain(design, *signal))
             NetChecker(design, *signal).Run();
     });
     if (!hasPorts)

@@ -27,22 +27,30 @@ std::uint32_t Places::NextLine(std::string const &text) {
 }
 
 /// The tokens of a line are put from left to right, so that the last one put is behind the others.
-bool Places::IsLess(Entry const &left, Entry const &right) {
+bool Places::Less::operator()(Entry const &left, Entry const &right) const {
     return std::tie(left.key, left.spot.line, left.spot.column) <
            std::tie(right.key, right.spot.line, right.spot.column);
 }
 
+void Places::Sort() const {
+    auto const middle = entries.begin() + static_cast<std::ptrdiff_t>(sortedCount);
+    std::sort(middle, entries.end(), Less());
+    std::inplace_merge(entries.begin(), middle, entries.end(), Less());
+    sortedCount = entries.size();
+    walks = 0;
+}
+
+/// A clean design asks for few places, for which a walk costs less than sorting them all.
 Spot Places::Find(Event event, void const *object, std::uint32_t before) const {
-    if (sortedCount < entries.size()) {
-        auto const middle = entries.begin() + static_cast<std::ptrdiff_t>(sortedCount);
-        std::sort(middle, entries.end(), IsLess);
-        std::inplace_merge(entries.begin(), middle, entries.end(), IsLess);
-        sortedCount = entries.size();
-    }
-    std::uintptr_t const key = KeyOf(event, object);
-    auto const behind =
-        std::lower_bound(entries.begin(), entries.end(), Entry{key, {before, 0, 0}}, IsLess);
-    if (behind == entries.begin() || std::prev(behind)->key != key)
+    if (sortedCount < entries.size() && ++walks > MAX_WALKS)
+        Sort();
+    Entry const end{KeyOf(event, object), {before, 0, 0}};
+    for (std::size_t i = entries.size(); i-- > sortedCount;)
+        if (entries[i].key == end.key && entries[i].spot.line < before)
+            return entries[i].spot;
+    auto const sortedEnd = entries.begin() + static_cast<std::ptrdiff_t>(sortedCount);
+    auto const behind = std::lower_bound(entries.begin(), sortedEnd, end, Less());
+    if (behind == entries.begin() || std::prev(behind)->key != end.key)
         return {};
     return std::prev(behind)->spot;
 }

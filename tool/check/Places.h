@@ -83,7 +83,13 @@ private:
     static std::uintptr_t KeyOf(Event event, void const *object) {
         return reinterpret_cast<std::uintptr_t>(object) | event;
     }
-    static bool IsLess(Entry const &left, Entry const &right);
+    static constexpr int MAX_WALKS = 30; ///< over places that are not sorted yet
+
+    struct Less {
+        bool operator()(Entry const &left, Entry const &right) const;
+    };
+
+    void Sort() const;
     std::size_t FileOf(std::uint32_t line) const;
 
     std::unordered_set<void const *> openNets;
@@ -91,6 +97,7 @@ private:
     std::uint32_t lineCount = 0;
     mutable std::vector<Entry> entries; ///< those in front sorted by key, then by place
     mutable std::size_t sortedCount = 0;
+    mutable int walks = 0; ///< over the others
 };
 
 } // namespace Checks

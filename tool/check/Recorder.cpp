@@ -6,9 +6,6 @@ namespace Checks {
 
 namespace {
 
-constexpr char const *CONNECT = "CONNECT SIGNAL";
-constexpr char const *ASSIGN = "ASSIGN CONSTANT";
-
 bool EndsIn(std::string_view text, std::string_view end) {
     return text.size() >= end.size() && text.substr(text.size() - end.size()) == end;
 }
@@ -32,25 +29,57 @@ void Recorder::Before(LineTokens const &lineTokens, CommandHelp const *command, 
     pin = nullptr;
     holder = nullptr;
     keyword = command ? command->keyword : "";
+    kind = KindOf(command);
     firstArgument = words;
     Text const &first = lineTokens.GetTokens().At(firstArgument);
-    if (keyword == CONNECT) {
+    if (kind == Kind::CONNECT) {
         Name(first, firstArgument);
         NamePin(firstArgument + 1);
-    } else if (keyword == ASSIGN) {
+    } else if (kind == Kind::ASSIGN) {
         NamePin(firstArgument);
-    } else if (keyword == "ADD SIGNAL" || keyword == "ADD PORT") {
+    } else if (kind == Kind::NET) {
         nets.push_back({first, firstArgument, model.GetSignal(first) != nullptr, Origin::DECLARED});
-    } else if (Contains(keyword, " ATTRIBUTE")) {
-        bool const module = Contains(keyword, "MODULE");
-        attributeToken = firstArgument + (module ? 0 : 1);
-        if (keyword.substr(0, 4) == "ADD " &&
-            SameIgnoringCase(lineTokens.At(attributeToken).substr(0, 6), "-TYPE="))
-            ++attributeToken;
-        holder = HolderOf(firstArgument, keyword);
-        if (holder && holder->GetAttr(Normal(lineTokens.At(attributeToken)).c_str()))
-            holder = nullptr;
+    } else if (kind == Kind::ATTRIBUTE) {
+        NameAttribute();
     }
+}
+
+/// Asked for at each line, and answered from memory for all but the first line of a command.
+Recorder::Kind Recorder::KindOf(CommandHelp const *command) {
+    static constexpr std::pair<std::string_view, Kind> ROWS[] = {
+        {"CONNECT SIGNAL", Kind::CONNECT},  {"ASSIGN CONSTANT", Kind::ASSIGN},
+        {"ADD SIGNAL", Kind::NET},          {"ADD PORT", Kind::NET},
+        {"ADD COMPONENT", Kind::COMPONENT}, {"ADD PIN", Kind::PIN},
+        {"ADD INSTANCE", Kind::INSTANCE},   {"SET NETLIST NAME", Kind::NAME},
+        {"ADD LIBRARY", Kind::TEXT},        {"ADD USE LIBRARY", Kind::TEXT},
+        {"ADD INCLUDE", Kind::TEXT},        {"ADD NOTES", Kind::TEXT},
+        {"Set Application", Kind::TEXT},    {"Set Command", Kind::TEXT},
+        {"Set Device", Kind::TEXT},         {"Set Purpose", Kind::TEXT},
+        {"Set Reference", Kind::TEXT},
+    };
+    if (!command)
+        return Kind::OTHER;
+    auto const [known, isNew] = kinds.try_emplace(command, Kind::OTHER);
+    if (!isNew)
+        return known->second;
+    for (auto const &[word, rowKind] : ROWS)
+        if (keyword == word)
+            known->second = rowKind;
+    if (Contains(keyword, " ATTRIBUTE"))
+        known->second = Kind::ATTRIBUTE;
+    else if (Contains(keyword, " COMMENT"))
+        known->second = Kind::TEXT;
+    return known->second;
+}
+
+/// The holder of an attribute that is new.
+void Recorder::NameAttribute() {
+    attributeToken = firstArgument + (Contains(keyword, "MODULE") ? 0 : 1);
+    if (keyword.substr(0, 4) == "ADD " && BeginsWith(tokens->At(attributeToken), "-TYPE="))
+        ++attributeToken;
+    holder = HolderOf(firstArgument);
+    if (holder && holder->GetAttr(Normal(tokens->At(attributeToken)).c_str()))
+        holder = nullptr;
 }
 
 /// A net as CONNECT and ASSIGN name it, who make it if there is none. The form of a name is that of
@@ -128,22 +157,22 @@ void Recorder::NamePin(int token) {
     formerNetName = formerNet ? formerNet->GetNameRef() : Text();
 }
 
-AttributeHolder *Recorder::HolderOf(int token, std::string_view kind) const {
+AttributeHolder *Recorder::HolderOf(int token) const {
     std::string const name(tokens->At(token));
     std::string owner;
     std::string pinName;
-    if (Contains(kind, " PIN ")) {
+    if (Contains(keyword, " PIN ")) {
         if (!SplitPinReference(name, owner, pinName))
             return nullptr;
-        return Contains(kind, "INSTANCE")
+        return Contains(keyword, "INSTANCE")
                    ? model.GetPin(pinName.c_str(), model.GetInstance(owner.c_str()))
                    : model.GetPin(pinName.c_str(), model.GetComponent(owner.c_str()));
     }
-    if (Contains(kind, "COMPONENT"))
+    if (Contains(keyword, "COMPONENT"))
         return model.GetComponent(name.c_str());
-    if (Contains(kind, "INSTANCE"))
+    if (Contains(keyword, "INSTANCE"))
         return model.GetInstance(name.c_str());
-    if (Contains(kind, "SIGNAL"))
+    if (Contains(keyword, "SIGNAL"))
         return model.GetSignal(name.c_str());
     return &netlist;
 }
@@ -155,11 +184,16 @@ void Recorder::After(bool ran) {
             RecordWidening(widened);
     if (!ran)
         return;
-    RecordPin();
-    RecordAssignment();
-    RecordDeclaration();
-    RecordAttribute();
-    RecordText();
+    if (kind == Kind::CONNECT || kind == Kind::ASSIGN) {
+        RecordPin();
+        RecordAssignment();
+    } else if (kind == Kind::ATTRIBUTE) {
+        RecordAttribute();
+    } else if (kind == Kind::TEXT) {
+        RecordText();
+    } else if (kind != Kind::OTHER) {
+        RecordDeclaration();
+    }
 }
 
 void Recorder::RecordNets() {
@@ -200,7 +234,7 @@ void Recorder::RecordPin() {
     if (!pin || !pin->GetSignal())
         return;
     Signal *const net = pin->GetSignal();
-    bool const connects = keyword == CONNECT;
+    bool const connects = kind == Kind::CONNECT;
     int const pinToken = firstArgument + (connects ? 1 : 0);
     if (!connects) {
         if (net != formerNet)
@@ -273,8 +307,8 @@ void Recorder::RecordReturns(Widened const &widened, Signal &slice) {
 }
 
 void Recorder::RecordAssignment() {
-    bool const isAssignment = keyword == CONNECT && netCount >= 2 && !pin;
-    if (isAssignment || (keyword == ASSIGN && !pin && netCount > 0))
+    bool const isAssignment = kind == Kind::CONNECT && netCount >= 2 && !pin;
+    if (isAssignment || (kind == Kind::ASSIGN && !pin && netCount > 0))
         if (Signal const *const target = model.GetSignal(firstNet))
             places.Put(isAssignment ? Places::ASSIGNED : Places::CONSTANT, target,
                        SpotOf(firstArgument));
@@ -286,15 +320,15 @@ void Recorder::RecordDeclaration() {
     };
     Object const *made = nullptr;
     int token = firstArgument;
-    if (keyword == "ADD COMPONENT") {
+    if (kind == Kind::COMPONENT) {
         made = model.GetComponent(argument(0));
-    } else if (keyword == "ADD PIN") {
+    } else if (kind == Kind::PIN) {
         made = model.GetPin(argument(1), model.GetComponent(argument(0)));
         ++token;
-    } else if (keyword == "ADD INSTANCE") {
+    } else if (kind == Kind::INSTANCE) {
         made = model.GetInstance(argument(1));
         ++token;
-    } else if (keyword == "SET NETLIST NAME") {
+    } else if (kind == Kind::NAME) {
         made = &netlist;
     }
     if (made)
@@ -311,7 +345,7 @@ void Recorder::RecordAttribute() {
 /// What the line gave a comment, or the option that it set or added to; null for other lines.
 void const *Recorder::OwnerOfText() const {
     if (EndsIn(keyword, " COMMENT") || keyword == "ADD NOTES")
-        return dynamic_cast<Object const *>(HolderOf(firstArgument, keyword));
+        return dynamic_cast<Object const *>(HolderOf(firstArgument));
     HdlOptions const &options = *model.GetOptions();
     std::pair<std::string_view, void const *> const rows[] = {
         {"ADD LIBRARY", &options.vhdlOption.libraries},
@@ -330,7 +364,7 @@ void const *Recorder::OwnerOfText() const {
 }
 
 void Recorder::RecordText() {
-    if (void const *const owner = keyword == CONNECT ? nullptr : OwnerOfText())
+    if (void const *const owner = OwnerOfText())
         places.Put(Places::TEXT, owner,
                    SpotOf(firstArgument +
                           (Contains(keyword, " COMMENT") && !Contains(keyword, "MODULE") ? 1 : 0)));

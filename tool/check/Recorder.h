@@ -35,6 +35,20 @@ public:
     Origin GetOrigin(Vesk_Hdl::Signal const *signal) const;
 
 private:
+    /// What a command does, as far as the recorder looks at it.
+    enum class Kind {
+        OTHER,
+        CONNECT,
+        ASSIGN,
+        NET,
+        COMPONENT,
+        PIN,
+        INSTANCE,
+        NAME,
+        ATTRIBUTE,
+        TEXT
+    };
+
     /// A net that the line names, if there is something to look at behind the line: it did not
     /// exist, or it is spelled in another way.
     struct Named {
@@ -52,13 +66,15 @@ private:
         int lastToken;
     };
 
+    Kind KindOf(Vesk_Hdl::CommandHelp const *command);
     Spot SpotOf(int token) const { return Checks::SpotOf(*tokens, token, lineNumber); }
     void Name(Text const &name, int token);
     bool NameOne(Text const &name, int token, Origin origin);
     void WatchBus(Text const &name, int token);
     static std::string LossesOf(Vesk_Hdl::Bus const &bus);
     void NamePin(int token);
-    Vesk_Hdl::AttributeHolder *HolderOf(int token, std::string_view kind) const;
+    void NameAttribute();
+    Vesk_Hdl::AttributeHolder *HolderOf(int token) const;
 
     void RecordNets();
     void CompareSpelling(Named const &named, Vesk_Hdl::Signal const &signal);
@@ -80,6 +96,7 @@ private:
     LineTokens const *tokens = nullptr;
     std::uint32_t lineNumber = 0;
     std::string_view keyword;
+    Kind kind = Kind::OTHER;
     int firstArgument = 0;
     std::vector<Named> nets;
     int netCount = 0; ///< of all that the line names
@@ -92,6 +109,7 @@ private:
     Vesk_Hdl::AttributeHolder *holder = nullptr;
     int attributeToken = 0;
 
+    std::unordered_map<Vesk_Hdl::CommandHelp const *, Kind> kinds;
     std::unordered_map<Vesk_Hdl::Signal const *, Origin> origins;
     std::unordered_set<Vesk_Hdl::Signal const *> respelled;
     std::unordered_map<Vesk_Hdl::Pin *, Vesk_Hdl::Signal *> moved; ///< pins and their last nets

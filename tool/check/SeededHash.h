@@ -34,7 +34,11 @@ private:
         std::uint64_t digit = 0;
         if (!bytes.empty())
             std::memcpy(&digit, bytes.data(), bytes.size());
-        return static_cast<std::uint64_t>((Wide(hash) * base + digit) % PRIME);
+        // 2^61 is 1 modulo the prime, so that its multiples fold onto the low bits.
+        Wide const product = Wide(hash) * base + digit;
+        std::uint64_t const sum =
+            static_cast<std::uint64_t>(product & PRIME) + static_cast<std::uint64_t>(product >> 61);
+        return sum >= PRIME ? sum - PRIME : sum;
     }
 };
 

@@ -1,8 +1,6 @@
 #include "tool/diagnostics/LineTokens.h"
 
-LineTokens::LineTokens(std::string const &line) {
-    tokens.Parse(line.c_str(), " ", true, "\"\"''", &places);
-}
+void LineTokens::Read(std::string const &line) { tokens.ParseLine(line.c_str(), &places); }
 
 std::string_view LineTokens::At(int index) const { return tokens.At(index).View(); }
 

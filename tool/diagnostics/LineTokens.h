@@ -8,7 +8,11 @@
 /// A command line as the engine reads it: its tokens, and where in the line each stands.
 class LineTokens {
 public:
-    explicit LineTokens(std::string const &line);
+    LineTokens() = default;
+    explicit LineTokens(std::string const &line) { Read(line); }
+
+    /// Takes the tokens of another line in place of those it has, in the same memory.
+    void Read(std::string const &line);
 
     Vesk_Hdl::StringArray const &GetTokens() const { return tokens; }
     int GetSize() const { return tokens.GetSize(); }

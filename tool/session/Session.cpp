@@ -12,12 +12,16 @@ Session::Session(std::string const &modelName) {
     model = engine.GetCurrentModel();
 }
 
-std::optional<Diagnostic> Session::RunLine(std::string const &line, Place const &place) {
+std::optional<Diagnostic> Session::RunLine(std::string const &line, StringArray const *tokens,
+                                           Place const &place) {
     if (std::size_t const at = line.find('\0'); at != std::string::npos)
         return ExplainNul(line, place, at);
     int const writesBefore = model->GetLastWrite().number;
     try {
-        engine.Execute(line.c_str());
+        if (tokens)
+            model->Execute(*tokens);
+        else
+            engine.Execute(line.c_str());
     } catch (Exception const &refusal) {
         return ExplainRefusal(line, place, refusal, *model, withHints);
     }

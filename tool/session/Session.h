@@ -13,7 +13,14 @@ public:
 
     /// Runs a line. Tells what is wrong if it was refused, or if a file that it writes did not
     /// reach the disk whole; the place comes back with the column of the token that is to blame.
-    std::optional<Diagnostic> RunLine(std::string const &line, Place const &place);
+    std::optional<Diagnostic> RunLine(std::string const &line, Place const &place) {
+        return RunLine(line, nullptr, place);
+    }
+    /// The same with the line's tokens, where the caller has them already.
+    std::optional<Diagnostic> RunLine(std::string const &line, Vesk_Hdl::StringArray const &tokens,
+                                      Place const &place) {
+        return RunLine(line, &tokens, place);
+    }
 
     /// Writes the design as "VHDL" or "VERILOG".
     Vesk_Hdl::WriteStatus const &Write(char const *language, std::string const &file);
@@ -25,6 +32,9 @@ public:
     Vesk_Hdl::Model &GetModel() { return *model; }
 
 private:
+    std::optional<Diagnostic> RunLine(std::string const &line, Vesk_Hdl::StringArray const *tokens,
+                                      Place const &place);
+
     Vesk_Hdl::Engine engine;
     Vesk_Hdl::Model *model; ///< the engine's current one
     bool withHints = true;

@@ -54,7 +54,7 @@ bool Model::Execute(char const *line) {
     std::unique_ptr<StringArray> tokens = std::move(record->spareTokens);
     if (!tokens)
         tokens = std::make_unique<StringArray>();
-    tokens->ParseLine(line);
+    tokens->ParseLine(line, nullptr);
     bool const result = Execute(*tokens);
     record->spareTokens = std::move(tokens);
     return result;

@@ -242,11 +242,18 @@ int StringArray::Parse(char const *text, char const *separators, bool skipEmpty,
     return QuotedParser(set, skipEmpty, quotes, *this, places).Parse(whole);
 }
 
-void StringArray::ParseLine(char const *line) {
+void StringArray::ParseLine(char const *line, std::vector<Basis_Range> *places) {
     static constexpr PlainParser PARSER(BLANK, QUOTES);
     std::vector<StringBase<char>> &strings = record->strings;
     std::size_t count = 0;
-    bool const isPlain = PARSER.ForEachToken(OrEmpty(line), [&](std::string_view token) {
+    char const *const begin = OrEmpty(line);
+    if (places)
+        places->clear();
+    bool const isPlain = PARSER.ForEachToken(begin, [&](std::string_view token) {
+        if (places) {
+            auto const at = static_cast<std::size_t>(token.data() - begin);
+            places->push_back(PlaceOf(at, at + token.size()));
+        }
         if (count == strings.size())
             strings.emplace_back(token);
         else
@@ -255,7 +262,9 @@ void StringArray::ParseLine(char const *line) {
     });
     if (!isPlain) {
         Empty();
-        Parse(line, BLANK, true, QUOTES);
+        if (places)
+            places->clear();
+        Parse(line, BLANK, true, QUOTES, places);
         return;
     }
     while (strings.size() > count)

@@ -74,13 +74,12 @@ public:
                            void *),
               void *context);
 
-private:
-    friend class Model;
-
     /// Empty and Parse of a command line, at blanks and with both kinds of quotes, in one: the
-    /// strings that nobody else holds give their memory to the new ones.
-    void ParseLine(char const *line);
+    /// strings that nobody else holds give their memory to the new ones. A null line is empty. The
+    /// places of the tokens take the place of what is in `places`, which may be null.
+    void ParseLine(char const *line, std::vector<Basis_Range> *places);
 
+private:
     struct Record;
     Record *record;
 };

@@ -195,13 +195,33 @@ def options():
             faults.append(f"{arguments}: exit code {done.returncode}, {found}, refused {refused}")
     if list(pathlib.Path().glob("f.v*")):
         faults.append("something was written")
+    return faults
+
+
+def inputs():
+    """What cannot be read twice gives the same findings with the same lines, also beyond what is
+    kept in memory, and a very long line is shown in part."""
+    filler = "NOOP " + 100 * "x" + "\n"
+    wide = "ADD SIGNAL " + 70000 * "w" + "\n"
+    design = "ADD PORT wire in\r\n" + 12000 * filler + wide + "ADD SIGNAL n\r\r\nADD SIGNAL n"
+    faults = []
     with tempfile.TemporaryDirectory() as folder:
-        file = pathlib.Path(folder) / "f.cmd"
-        file.write_text(design)
-        from_file = subprocess.run([TOOL, "check", file], capture_output=True, text=True)
-        from_input = subprocess.run([TOOL, "check", "-"], input=design, capture_output=True, text=True)
-        if from_input.stderr != from_file.stderr.replace(str(file), "<stdin>"):
-            faults.append(f"from standard input: {from_input.stderr}")
+        file, pipe = pathlib.Path(folder) / "f.cmd", pathlib.Path(folder) / "pipe"
+        file.write_text(design, newline="")
+        wanted = subprocess.run([TOOL, "check", file], capture_output=True, text=True).stderr
+        if wanted.count("ADD SIGNAL n?\n") != 2 or not wanted.count("ADD SIGNAL n\n") or len(wanted) > 3000:
+            faults.append(f"from a file: {wanted[:3000]}")
+        os.mkfifo(pipe)
+        for name, shown in ("-", "<stdin>"), (str(pipe), str(pipe)):
+            tool = subprocess.Popen([TOOL, "check", name], stdin=subprocess.PIPE,
+                                    stderr=subprocess.PIPE, text=True)
+            if name == "-":
+                said = tool.communicate(design, timeout=60)[1]
+            else:
+                pipe.write_text(design, newline="")
+                said = tool.communicate(timeout=60)[1]
+            if said != wanted.replace(str(file), shown):
+                faults.append(f"from {shown}: {said[:3000]}")
     return faults
 
 
@@ -212,7 +232,7 @@ def main():
         return 77
     cases = [case for file in sorted(HERE.glob("*.cases"))
              for case in file.read_text().split("### ")[1:]]
-    faults = folds() + options()
+    faults = folds() + options() + inputs()
     listed = run(HERE, TOOL, "check", "--list", "--markdown").stdout
     if listed != PAGE.read_text():
         faults.append("docs/checks.md: not what `vesk-hdl check --list --markdown` prints")

@@ -17,7 +17,7 @@ bool NamesPin(std::string_view token) {
     return point != token.npos && point + 1 < token.size();
 }
 
-/// Whether one of the choices allows the token. The words behind a prefix are judged by the model.
+/// Whether one of the choices allows the token. What follows a prefix is judged by the model.
 bool IsChosen(std::span<Vocabulary::Choice const> choices, std::string_view token) {
     return std::any_of(choices.begin(), choices.end(), [token](Vocabulary::Choice const &choice) {
         return *choice.prefix ? BeginsWith(token, choice.prefix)

@@ -5,7 +5,7 @@
 
 #include "vesk_hdl/Vesk_Hdl.h"
 
-/// A command line as the engine reads it: its tokens, and where in the line each stands.
+/// A command line as the engine reads it: its tokens, and the place of each in the line.
 class LineTokens {
 public:
     LineTokens() = default;

@@ -141,7 +141,7 @@ void RefusalExplainer::ExplainKind() {
     }
 }
 
-/// Where the keyword goes wrong, and the nearest one if one is near enough to be meant.
+/// Marks the first wrong word of the keyword, or the end if words are missing.
 void RefusalExplainer::ExplainKeyword() {
     std::string const part = KeywordPart(tokens.GetTokens());
     if (std::vector<std::string_view> const words = NextKeywordWords(part); !words.empty()) {

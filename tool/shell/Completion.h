@@ -10,7 +10,7 @@
 struct Completions {
     std::size_t begin = 0;               ///< index of that word in the line; words end at blanks
     std::vector<std::string> candidates; ///< sorted, each the whole word
-    bool wordEnds = true; ///< a blank belongs behind it; not behind a folder or owner
+    bool wordEnds = true;                ///< a blank follows it; none follows a folder or an owner
 };
 
 /// For the line up to the cursor: words of keywords in the user's case, words of the shell, and

@@ -51,7 +51,7 @@ constexpr ArgumentHelp ARGUMENTS[] = {
     {"option", "{words}", WRITE_CHOICES}};
 static_assert(std::size(ARGUMENTS) == ARGUMENT_KINDS);
 
-/// What the library tells of its commands, put together once from the table.
+/// The help of all commands, built from the table at the first use.
 class Reference {
 public:
     Reference() {

@@ -48,7 +48,7 @@ struct Argument {
     ArgumentKind alternative = ArgumentKind::NONE;
 };
 
-/// What a kind of argument is. All texts last as long as the library and are never null.
+/// The description of a kind of argument. All texts last as long as the library and are never null.
 struct ArgumentHelp {
     char const *word = "";    ///< as grammars show it
     char const *meaning = ""; ///< what may be given, a phrase; "" if the word says it
@@ -58,8 +58,8 @@ struct ArgumentHelp {
     bool repeated = false; ///< it takes all words up to the end of the line
 };
 
-/// What a user of the command language is told of one command. All texts last as long as the
-/// library and are never null.
+/// The description of one command for its users. All texts last as long as the library and are
+/// never null.
 struct CommandHelp {
     char const *keyword = ""; ///< as registered; matches in any case
     /// What follows the keyword: words to be replaced, `[` `]` around what may be missing, `|`
@@ -82,8 +82,9 @@ struct CommandHelp {
 /// The commands of the library, in the order of their registration.
 class VESK_HDL_API CommandReference {
 public:
+    /// The number of commands.
     static int GetCount();
-    /// Null for an index outside of 0 to GetCount() - 1.
+    /// The command of that index; null for an index outside of 0 to GetCount() - 1.
     static CommandHelp const *GetAt(int index);
     /// By keyword in any case, its words separated by single blanks; null if there is none.
     static CommandHelp const *Find(char const *keyword);

@@ -13,7 +13,7 @@ struct CommandOwner {
     char const *keyword; ///< its word in keywords
     char const *article; ///< "a component"
     char const *unknown; ///< what is refused if there is no such owner
-    char const *name;    ///< the one of the examples, with a blank behind it
+    char const *name;    ///< its name in the examples, followed by a blank
     char const *lines;   ///< lines that make that one
 };
 

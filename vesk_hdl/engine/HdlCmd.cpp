@@ -29,10 +29,9 @@ struct CommandFactory::Record {
 };
 
 CommandFactory::CommandFactory() : record(nullptr) {
-    auto made = std::make_unique<Record>(); // stays owned until all commands are known
-    record = made.get();
+    auto made = std::make_unique<Record>(); // owned here until all commands are known
     for (CommandSpec const &spec : CommandTable())
-        record->keywords.Add(spec.keyword, spec.create);
+        made->keywords.Add(spec.keyword, spec.create);
     record = made.release();
 }
 

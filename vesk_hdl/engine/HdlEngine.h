@@ -17,32 +17,36 @@ namespace Vesk_Hdl {
 /// from several threads at once.
 class VESK_HDL_API Engine {
 public:
-    /// No models, none current.
+    /// An engine without models; none is current.
     Engine();
-    /// Deletes the models, the last first.
+    /// Deletes the models, the last one first.
     ~Engine();
     Engine(Engine const &) = delete;
     Engine &operator=(Engine const &) = delete;
 
-    /// False if the name is taken. The new model is not made current.
+    /// Adds an empty model, which the engine owns. It does not become the current one. False if a
+    /// model has that name; nothing changes then. A null file name is empty.
     bool CreateAndAddModel(char const *name, char const *sourceFileName);
-    /// Makes a model current; false if there is none of that name, the current one staying.
+    /// Makes the model of that name current. False if there is none; nothing changes then.
     bool UseModel(char const *name);
-    /// Deletes a model; false if there is none. If it was current, none is afterwards.
+    /// Deletes the model of that name and all that it holds. False if there is none. If the model
+    /// was current, none is current afterwards.
     bool RemoveModel(char const *name);
-    /// The model of that name, which the engine goes on owning, or null.
+    /// The model of that name, null if there is none. The engine owns it: the pointer is valid
+    /// until RemoveModel deletes it or the engine dies.
     Model *GetModel(char const *name) const;
-    /// The model on which Execute(line) runs, or null.
+    /// The model on which Execute(line) runs, null if there is none. Valid as that of GetModel.
     Model *GetCurrentModel() const;
 
-    /// Runs a line on the current or on the named model; raises "Missing Model.\n" if there is
-    /// none. Null is the empty line, which runs nothing.
+    /// Runs a line on the current model, or on the named one. Raises the refusal of the line, and
+    /// "Missing Model.\n" if there is no such model. An empty line runs nothing; null is one.
     void Execute(char const *line);
     void Execute(char const *modelName, char const *line);
-    /// Runs a file's lines on the named model, which is made if there is none, with the file as its
-    /// source, and not made current. False if the file cannot be read.
+    /// Runs the lines of a file on the named model. If there is no such model, one is added whose
+    /// source file is this one; it does not become current. False if the file cannot be opened.
+    /// The first refused line raises its refusal and ends the reading; earlier lines stay done.
     bool ReadCommandFile(char const *modelName, char const *fileName);
-    /// Model::Write, which writes nothing; false if there is no model of that name.
+    /// Calls Model::Write, which writes nothing. False if there is no model of that name.
     bool WriteCommandFile(char const *modelName, char const *fileName);
 
     /// Whether the word is reserved in VHDL (IEEE 1076-1993), in any case, or a keyword of Verilog
@@ -50,7 +54,8 @@ public:
     static bool IsVhdlKeyword(char const *word);
     static bool IsVerilogKeyword(char const *word);
 
-    /// Writes a file that holds the vendor header alone, see NetlistHeader. Null is an empty field.
+    /// Writes a file that holds nothing but the vendor header, see NetlistHeader. Null is an empty
+    /// field. A file that cannot be written raises nothing.
     static void WriteOrvaneHeader(char const *application, char const *command,
                                   char const *designName, char const *device, char const *purpose,
                                   char const *reference, bool isVhdl, char const *fileName);

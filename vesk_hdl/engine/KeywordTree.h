@@ -24,7 +24,7 @@ public:
         friend class KeywordTree;
         struct Step {
             std::string word;
-            Place *place; ///< behind the word
+            Place *place; ///< after the word
         };
         /// The length first: most words differ in it.
         struct Less {
@@ -43,8 +43,8 @@ public:
     /// In front of all words.
     Place const &GetRoot() const { return root; }
 
-    /// The place behind all words of a token, of which one that was quoted may hold several; null
-    /// if no keyword goes on like this.
+    /// The place after all words of a token; a quoted token may hold several. Null if no keyword
+    /// continues like this.
     Place const *Follow(Place const &place, std::string_view token) const {
         Place const *at = &place;
         while (at) {

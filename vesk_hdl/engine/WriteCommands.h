@@ -13,8 +13,8 @@ struct WriteArguments {
     bool append = false;
     bool writeHeader = true;
 
-    /// Required: the number of tokens alone tells where the file name is. With more than two
-    /// options there are none, and the file is called after the first of them.
+    /// Required: the number of tokens alone decides which one is the file name. With more than two
+    /// tokens in front of it, none of them is an option, and the first one is the file name.
     bool Parse(StringArray const &tokens, int first);
 };
 

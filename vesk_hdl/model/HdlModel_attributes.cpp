@@ -68,10 +68,10 @@ void SetSynAttr(Attribute &attribute, char const *word) {
         RAISE(Messages::INVALID_SYNTHESIS_WORD, word);
 }
 
-void SetUserTypeOf(Attribute *attribute, char const *userType) {
-    auto *const user = dynamic_cast<AttributeUser *>(attribute);
+void SetUserTypeOf(Attribute &attribute, char const *userType) {
+    auto *const user = dynamic_cast<AttributeUser *>(&attribute);
     if (!user)
-        RAISE(Messages::NOT_A_USER_ATTRIBUTE, attribute->GetNameRef());
+        RAISE(Messages::NOT_A_USER_ATTRIBUTE, attribute.GetNameRef());
     user->SetUserType(userType);
 }
 
@@ -131,7 +131,7 @@ void Model::SetAttrValue(AttributeHolder *holder, char const *name, char const *
 void Model::SetUserType(AttributeHolder *holder, char const *name, char const *userType) {
     if (!holder)
         return;
-    SetUserTypeOf(FindAttr(holder, name), userType);
+    SetUserTypeOf(*FindAttr(holder, name), userType);
     SetModifiedFlag(true);
 }
 
@@ -214,7 +214,7 @@ void Model::SetInstanceAttrValue(char const *instance, char const *name, char co
 }
 void Model::SetInstanceUserType(char const *instance, char const *name, char const *userType) {
     Instance *const owner = FindInstance(*this, instance);
-    SetUserTypeOf(OwnAttr(owner, GetInstanceOrComponentAttr(name, owner), name), userType);
+    SetUserTypeOf(*OwnAttr(owner, GetInstanceOrComponentAttr(name, owner), name), userType);
     SetModifiedFlag(true);
 }
 void Model::AddInstanceComment(char const *instance, char const *text) {

@@ -54,14 +54,17 @@ void AddLimitOptions(CLI::App &command, LimitOptions &options) {
          {std::tuple{"--max-memory", &options.memory, "End the run when it needs more memory"},
           std::tuple{"--max-output", &options.output, "End the run when it would write more"}})
         command
-            .add_option(name, *size,
-                        std::string(what) + ": bytes, or with k, M, G, T in units of 1024")
-            ->transform(CLI::AsSizeValue(false).description(""))
-            ->check(CLI::Validator(
-                [](std::string const &bytes) {
-                    return bytes == "0" || bytes[0] == '-' ? "a size is greater than 0" : "";
+            .add_option(
+                name,
+                [option = name, bytes = size](CLI::results_t const &given) {
+                    *bytes = BytesOf(given.back());
+                    if (*bytes == 0)
+                        throw CLI::ValidationError(option, given.back() +
+                                                               " is no size: give a number above 0 "
+                                                               "such as 500000, 500M or 2G");
+                    return true;
                 },
-                ""))
+                std::string(what) + ": bytes, or with k, M, G, T in units of 1024")
             ->type_name("SIZE");
 }
 

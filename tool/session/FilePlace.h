@@ -17,8 +17,7 @@ struct FilePlace {
     /// Finds the place that a path leads to. False with `errno` set if a folder cannot be entered
     /// or the path names no file.
     bool Find(std::string const &path);
-    /// Looks at what lies there; a link is not followed. False with `errno` set if that cannot be
-    /// told.
+    /// Looks at what lies there; a link is not followed. False with `errno` set if that fails.
     bool Look();
     bool IsLink() const { return exists && S_ISLNK(status.st_mode); }
 

@@ -1,5 +1,9 @@
 #include "tool/session/Limits.h"
 
+#include <charconv>
+#include <limits>
+#include <system_error>
+
 namespace {
 
 // What a sanitizer keeps beside the memory of the program counts as data too: terabytes.
@@ -10,6 +14,9 @@ constexpr bool SANITIZED = __has_feature(address_sanitizer) || __has_feature(thr
 #else
 constexpr bool SANITIZED = false;
 #endif
+
+constexpr std::string_view UNITS = "kMGT";
+constexpr unsigned long long UNIT = 1024; ///< in each, those of the one before
 
 } // namespace
 
@@ -28,13 +35,29 @@ void MemoryLimit::Lift() {
 }
 
 std::string SizeText(unsigned long long bytes) {
-    constexpr char UNITS[] = {'k', 'M', 'G', 'T'};
-    std::string unit;
+    std::string unit = " bytes";
     for (char const larger : UNITS) {
-        if (bytes == 0 || bytes % 1024 != 0)
+        if (bytes == 0 || bytes % UNIT != 0)
             break;
-        bytes /= 1024;
+        bytes /= UNIT;
         unit = larger;
     }
-    return std::to_string(bytes) + (unit.empty() ? " bytes" : unit);
+    return std::to_string(bytes) + unit;
+}
+
+unsigned long long BytesOf(std::string_view text) {
+    char const *const end = text.data() + text.size();
+    unsigned long long size = 0;
+    auto const [rest, error] = std::from_chars(text.data(), end, size);
+    if (error != std::errc())
+        return 0;
+    std::size_t units = 0;
+    if (rest != end) {
+        units = UNITS.find(*rest == 'K' ? 'k' : *rest) + 1;
+        if (rest + 1 != end || units == 0)
+            return 0;
+    }
+    for (; units > 0; --units)
+        size = size > std::numeric_limits<unsigned long long>::max() / UNIT ? 0 : size * UNIT;
+    return size;
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <string>
+#include <string_view>
 #include <sys/resource.h>
 
 /// A limit of the memory that the process asks for. Beyond it allocations fail.
@@ -23,3 +24,6 @@ private:
 
 /// A number of bytes as it is given to an option: 524288000 is "500M".
 std::string SizeText(unsigned long long bytes);
+/// The reverse: a whole number, perhaps with k, M, G or T. 0 for any other text and for
+/// what is too large.
+unsigned long long BytesOf(std::string_view text);

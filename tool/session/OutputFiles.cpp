@@ -45,6 +45,7 @@ int OutputFiles::Open(char const *fileName, bool append) {
     if (listener)
         listener(fileName);
     reason.clear();
+    beyondLimit = false;
     if (std::exchange(nextIsStandardOutput, false))
         return ::fcntl(STDOUT_FILENO, F_DUPFD_CLOEXEC, STDERR_FILENO + 1);
     FilePlace place;
@@ -58,11 +59,10 @@ int OutputFiles::Open(char const *fileName, bool append) {
 
 /// The place of a file that may be written.
 bool OutputFiles::Find(char const *fileName, FilePlace &place) {
-    if (confinement ? !confinement->Find(fileName, place) : !place.Find(fileName)) {
-        if (errno == EXDEV)
-            reason = "it lies outside the folder that --restrict names";
-        return false;
-    }
+    if (confinement ? !confinement->Find(fileName, place) : !place.Find(fileName))
+        return confinement && errno == EXDEV
+                   ? Refuse(EXDEV, "it lies outside the folder that --restrict names")
+                   : false;
     if (inputs && (place.isOpenFile ? inputs->Holds(std::string(fileName))
                                     : place.exists && inputs->Holds(place.status)))
         return Refuse(EBUSY, "it is a command file of this run, which would be lost");
@@ -70,8 +70,7 @@ bool OutputFiles::Find(char const *fileName, FilePlace &place) {
         return IsAllowed(place);
     if (!place.exists || !S_ISREG(place.status.st_mode))
         return true;
-    // A file may be replaced by whoever may write to its folder; one that is protected is not
-    // meant.
+    // The system would let us replace a read-only file if only its folder can be written.
     return ::faccessat(place.folder.Get(), place.name.c_str(), W_OK, AT_EACCESS) == 0;
 }
 
@@ -127,9 +126,9 @@ void OutputFiles::Finish(Vesk_Hdl::WriteStatus &status) {
     if (status.error == 0 && unfinished.IsBegun())
         status.error = PutInPlace();
     unfinished.Undo();
-    if (status.error == 0 || status.error == ECANCELED) // an exception: nobody asks why
+    if (status.error == 0 || status.error == ECANCELED) // an exception says what happened
         return;
-    if (beyondLimit)
+    if (beyondLimit && status.error == EDQUOT)
         reason = "all files together would pass the " + SizeText(most) +
                  " that --max-output allows; allow more, or write less";
     else if (status.error == EINTR)
@@ -137,7 +136,7 @@ void OutputFiles::Finish(Vesk_Hdl::WriteStatus &status) {
     status.reason = reason.c_str();
 }
 
-/// Where names are confined, the file counts as made by this run from now on.
+/// In a restricted run the file counts as made by this run from now on.
 int OutputFiles::PutInPlace() {
     auto const made = IdentityOf(unfinished.GetStatus());
     auto const former = IdentityOf(unfinished.GetFormerStatus());

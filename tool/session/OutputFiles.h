@@ -34,9 +34,9 @@ public:
     void Protect(InputFiles const *files) { inputs = files; }
     /// The most bytes that all files together may get.
     void SetLimit(unsigned long long bytes) { most = bytes; }
-    /// Whether a write failed because it would have passed the limit.
+    /// Whether the last write failed because it would have passed the limit.
     bool IsBeyondLimit() const { return beyondLimit; }
-    /// Called with the name of each file before it is opened.
+    /// `heard` is called with the name of each file before it is opened.
     void SetListener(std::function<void(char const *)> heard) { listener = std::move(heard); }
     /// The next file is standard output, whatever its name.
     void SendNextToStandardOutput() { nextIsStandardOutput = true; }

@@ -13,7 +13,7 @@ namespace Signals {
 /// messages now; it is given the name of each signal.
 void EndProgram(std::function<std::string(char const *signal)> const &messageOf);
 
-/// As EndProgram, but SIGINT sets a mark only, for whoever runs long to look at.
+/// As EndProgram, but SIGINT only sets a mark, which a long operation looks at.
 void MarkInterrupts(std::function<std::string(char const *signal)> const &messageOf);
 bool IsInterrupted();
 void ClearInterrupt();

@@ -74,8 +74,8 @@ int UnfinishedFile::Begin(FilePlace wanted, std::string &reason) {
     return Lend();
 }
 
-/// Makes and locks the hidden file. Not even others of the group see it before an old file's
-/// permissions are known to allow that.
+/// Makes and locks the hidden file. While the text is written it is private if there is an old
+/// file, whose permissions it gets in the end.
 bool UnfinishedFile::Make() {
     constexpr mode_t NEW = 0666;
     constexpr mode_t PRIVATE = 0600;
@@ -85,7 +85,7 @@ bool UnfinishedFile::Make() {
                                place.exists ? PRIVATE : NEW));
     if (!file.IsOpen())
         return false;
-    // Between these two steps another run may take the file for a leftover.
+    // Before the lock is set another run may take the file for a leftover.
     bool const lost = ::flock(file.Get(), LOCK_EX | LOCK_NB) != 0 && errno == EWOULDBLOCK;
     if (lost || ::fstat(file.Get(), &status) != 0 || status.st_nlink == 0) {
         file.Close();
@@ -148,7 +148,8 @@ int UnfinishedFile::BeginAppending(FilePlace wanted, std::string &reason) {
     return Lend();
 }
 
-/// The lock goes with the last descriptor: this object keeps one until the file has its name.
+/// The lock lasts until the last descriptor is closed: this object keeps one until the file has its
+/// name.
 int UnfinishedFile::Lend() const { return ::fcntl(file.Get(), F_DUPFD_CLOEXEC, STDERR_FILENO + 1); }
 
 int UnfinishedFile::Finish() {
@@ -167,7 +168,7 @@ int UnfinishedFile::Finish() {
     return error;
 }
 
-/// Whoever could not look into the old file cannot look into the new one.
+/// Where the group cannot be kept, the new group may do no more than others may.
 void UnfinishedFile::GiveModeAndOwner() const {
     struct stat const &old = place.status;
     mode_t mode = old.st_mode & PERMISSIONS;

@@ -7,9 +7,9 @@
 
 namespace Vesk_Hdl {
 
-/// Finds the first model of a name, in any case, among those of an engine, as a walk over them does.
-/// Clients may rename models without a word to the engine: each model counts its renames here, and
-/// the index is then made anew at the next question.
+/// Finds the first model of a name, in any case, among those of an engine, as a walk over them
+/// does. Clients may rename models without a word to the engine: each model counts its renames
+/// here, and the index is then made anew at the next question.
 class ModelIndex {
 public:
     Model *Find(PtrArray<Model *> const &models, char const *name) {

@@ -101,8 +101,8 @@ Signal *Model::CreateAndAddCompundSignal(char const *name) {
     StringArray memberNames;
     CompoundBus::ParseCompoundBusName(normal, memberNames, false);
 
-    // A later member may widen the bus of an earlier one: a slice then takes the bus's place, also in
-    // this array.
+    // A later member may widen the bus of an earlier one: a slice then takes the bus's place, also
+    // in this array.
     PtrArray<Signal *> members;
     for (int i = 0; i < memberNames.GetSize(); ++i) {
         Text const &member = memberNames.At(i);

@@ -8,10 +8,10 @@
 
 namespace Vesk_Hdl {
 
-/// A walk over the members of a compound and of the compounds in it, left to right. Clients can nest
-/// compounds as deep as they like, also in a circle: the walk needs no recursion, leaves out a
-/// compound that it is in the middle of, and once it met one enters no compound a second time. So it
-/// ends in any case, and without a circle it visits every member as often as it occurs.
+/// A walk over the members of a compound and of the compounds in it, left to right. Clients can
+/// nest compounds as deep as they like, also in a circle: the walk needs no recursion, leaves out a
+/// compound that it is in the middle of, and once it met one enters no compound a second time. So
+/// it ends in any case, and without a circle it visits every member as often as it occurs.
 ///
 /// `Visitor` has Enter(CompoundBus &), Leave(CompoundBus &), and Visit(Signal &) for what is no
 /// compound. Null members are skipped.

@@ -9,8 +9,8 @@
 namespace Vesk_Hdl {
 
 /// What a signal lists, pins and signals alike, for lists that are too long to be scanned: a net
-/// with a hundred thousand pins answers whether it lists one as fast as a net with two. Items may be
-/// gone; a signal may then lie where a pin was.
+/// with a hundred thousand pins answers whether it lists one as fast as a net with two. Items may
+/// be gone; a signal may then lie where a pin was.
 class ListIndex {
 public:
     static constexpr int MAX_SCAN = 32;

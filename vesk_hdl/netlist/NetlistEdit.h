@@ -18,11 +18,12 @@ public:
     Component *FindComponent(Names::Key const &key) const;
     Bus *FindBus(Names::Key const &key) const;
 
-    /// Replaces a bus by a wider one that is called `name`, which is returned. The old slices become
-    /// slices of the new bus. A further slice of it gets the old bus's name and connections, and its
-    /// place in memory: whatever points at the old bus (assignments, compounds, pins tied to it, a
-    /// caller's variable) points at that slice. The netlist owns the slice, but nobody finds it by
-    /// name or by a walk. Polarity, comment, attributes and constant of the old bus are lost.
+    /// Replaces a bus by a wider one that is called `name`, which is returned. The old slices
+    /// become slices of the new bus. A further slice of it gets the old bus's name and connections,
+    /// and its place in memory: whatever points at the old bus (assignments, compounds, pins tied
+    /// to it, a caller's variable) points at that slice. The netlist owns the slice, but nobody
+    /// finds it by name or by a walk. Polarity, comment, attributes and constant of the old bus are
+    /// lost.
     Bus *Widen(Bus *bus, char const *name);
 
     /// From now on each change of the netlist's name adds 1 to a counter, which outlives it.

@@ -49,9 +49,11 @@ void Object::Rename(std::string_view name) {
     case Record::NAME:
         return Replace(MakeRecord<Record>(name, std::as_const(*record)));
     case Record::COMMENT:
-        return Replace(MakeRecord<CommentRecord>(name, static_cast<CommentRecord const &>(*record)));
+        return Replace(
+            MakeRecord<CommentRecord>(name, static_cast<CommentRecord const &>(*record)));
     case Record::NETLIST:
-        return Replace(MakeRecord<NetlistRecord>(name, static_cast<NetlistRecord const &>(*record)));
+        return Replace(
+            MakeRecord<NetlistRecord>(name, static_cast<NetlistRecord const &>(*record)));
     case Record::PIN:
         return Replace(MakeRecord<PinRecord>(name, static_cast<PinRecord const &>(*record)));
     }
@@ -117,8 +119,8 @@ void Object::Release() {
     }
 }
 
-/// Assigns name, comment and kind, and nothing of what makes a pin a pin. In most objects that is the
-/// whole record.
+/// Assigns name, comment and kind, and nothing of what makes a pin a pin. In most objects that is
+/// the whole record.
 Object &Object::operator=(Object const &other) {
     if (record == other.record)
         return *this;

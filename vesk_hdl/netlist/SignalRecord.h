@@ -9,8 +9,8 @@
 
 namespace Vesk_Hdl {
 
-/// Neither list holds an item twice: Connect looks first, and CloneConnection fills empty lists. The
-/// items are compared and not looked into, but by operations that say so: they may be gone.
+/// Neither list holds an item twice: Connect looks first, and CloneConnection fills empty lists.
+/// The items are compared and not looked into, but by operations that say so: they may be gone.
 ///
 /// Three pins find room here: one that drives and two that read, as most nets of a design have.
 struct Signal::Record {

@@ -14,7 +14,8 @@ namespace Vesk_Hdl {
 namespace {
 
 bool AreEqualInOrder(Pin const &a, Pin const &b) {
-    return a.GetPolarity() == b.GetPolarity() && NaturalCompare(a.GetNameRef(), b.GetNameRef()) == 0;
+    return a.GetPolarity() == b.GetPolarity() &&
+           NaturalCompare(a.GetNameRef(), b.GetNameRef()) == 0;
 }
 
 /// Null if two pins are equal: then there are several orders, and which of them a sort gives

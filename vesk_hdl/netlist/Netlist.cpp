@@ -69,27 +69,23 @@ void Netlist::Add(Signal *signal) {
     if (!signal)
         return;
     std::unique_ptr<Signal> held(signal);
+    StringBase<char> const &name = signal->GetNameRef();
     record->signals.Add(signal);
     try {
+        record->signalMap.Add(name, signal);
+        // Last: a bus that a wider one replaces is found until then.
         if (auto const *const bus = As<Bus>(signal))
             record->busMap.Add(bus->GetBaseName(), signal);
-        record->signalMap.Add(signal->GetNameRef(), signal);
     } catch (...) {
         record->signals.RemoveTail();
-        Forget(signal);
+        if (record->signalMap.Get(Names::Key(name.View())) == signal)
+            record->signalMap.Remove(name, signal);
+        if (As<BusSlice>(signal) || As<BusIndex>(signal))
+            if (Bus *const parent = GetParentBus(name))
+                parent->RemoveBusSlice(signal);
         throw;
     }
     held.release();
-}
-
-/// Everything that finds a signal but the array and the map of names.
-void Netlist::Forget(Signal *signal) {
-    if (auto const *const bus = As<Bus>(signal)) {
-        record->busMap.Remove(bus->GetBaseName(), signal);
-    } else if (As<BusSlice>(signal) || As<BusIndex>(signal)) {
-        if (Bus *const parent = GetParentBus(signal->GetNameRef()))
-            parent->RemoveBusSlice(signal);
-    }
 }
 
 void Netlist::Add(Instance *instance) {

@@ -105,7 +105,6 @@ private:
     void GetFeedBackSignals(bool outPortToInPin, StringSet &names);
     void FindFeedBack(StringSet &read, PtrArray<Signal *> &driven);
     void AddDummySignals(bool portTakesDummy, StringSet &names);
-    void Forget(Signal *signal);
 
     std::unique_ptr<Record> record;
 };

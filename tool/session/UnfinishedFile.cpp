@@ -4,6 +4,7 @@
 #include <array>
 #include <atomic>
 #include <climits>
+#include <cstdio>
 #include <cstring>
 #include <fcntl.h>
 #include <sys/file.h>

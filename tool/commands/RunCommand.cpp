@@ -70,7 +70,9 @@ void RefuseToOverwrite(RunOptions const &options) {
     for (std::string const &output : {options.vhdlFile, options.verilogFile})
         if (output != STANDARD_STREAM && inputs.Holds(output))
             throw CLI::ValidationError(output, "is an input, too");
-    if (IsSamePlace(options.vhdlFile, options.verilogFile))
+    std::error_code error; // a terminal or the null device takes both
+    if (!fs::is_character_file(options.vhdlFile, error) &&
+        IsSamePlace(options.vhdlFile, options.verilogFile))
         throw CLI::ValidationError(options.verilogFile, "is to hold the VHDL, too");
 }
 

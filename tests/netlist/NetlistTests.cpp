@@ -174,4 +174,24 @@ TEST(Netlist, SortsLikeAModelAndAsTheArraySortDoes) {
     }
 }
 
+TEST(Netlist, SeriesThatTakeTurnsAreMergedAsTheArraySortSorts) {
+    std::mt19937 random(2);
+    for (int series = 1; series < 11; ++series)
+        for (bool const repeats : {false, true}) {
+            Netlist netlist("n");
+            PtrArray<Signal *> expected;
+            for (int i = 0; i < 300; ++i) {
+                int const one = static_cast<int>(random()) & 0xff;
+                std::string name = std::string(13, 'x') + char('a' + one % series);
+                name += std::to_string(repeats && i == 200 ? 100 : i);
+                expected.Add(AddScalar(netlist, name.c_str()));
+            }
+            expected.Sort(SortsBefore, nullptr);
+            netlist.SortNetlist();
+            Iterator<Signal *> walk = netlist.GetSignalIterator();
+            for (int i = 0; i < 300; ++i, walk.Advance())
+                ASSERT_EQ(expected.GetAt(i), walk.Current()) << series << ' ' << i;
+        }
+}
+
 } // namespace

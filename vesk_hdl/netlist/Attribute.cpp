@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "vesk_hdl/netlist/Vocabulary.h"
+#include "vesk_hdl/text/LentPtrArray.h"
 #include "vesk_hdl/text/StringArray.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
 
@@ -17,7 +18,7 @@ using Basis::StringBase;
 
 namespace {
 
-/// The words of an option; the index is the value of its two bits in the flags.
+/// The words of an option; the index is the value of its two bits in the options.
 struct Option {
     unsigned int shift;
     Vocabulary::Words words;
@@ -25,15 +26,16 @@ struct Option {
 constexpr Option GENERIC = {0, Vocabulary::GENERIC_WORDS};
 constexpr Option SYNTHESIS = {2, Vocabulary::SYNTHESIS_WORDS};
 
-unsigned int GetOption(unsigned int flags, Option const &option) {
-    return (flags >> option.shift) & 3U;
+unsigned int GetOption(unsigned int options, Option const &option) {
+    return (options >> option.shift) & 3U;
 }
 
-bool SetOption(unsigned int &flags, Option const &option, char const *word) {
+bool SetOption(unsigned int &options, Option const &option, char const *word) {
     int const value = Vocabulary::IndexOf(option.words, word);
     if (value < 0)
         return false;
-    flags = (flags & ~(3U << option.shift)) | (static_cast<unsigned int>(value) << option.shift);
+    options =
+        (options & ~(3U << option.shift)) | (static_cast<unsigned int>(value) << option.shift);
     return true;
 }
 
@@ -59,27 +61,18 @@ unsigned int const Attribute::DEFAULT_GENERIC = 0;
 unsigned int const Attribute::DEFAULT_SYNATTR = 0;
 char const *const Attribute::DEFAULT_ATTRTYPE = Vocabulary::ATTRIBUTE_TYPES[VALUE_STRING];
 
-struct Attribute::Record {
-    unsigned int flags = DEFAULT_GENERIC << GENERIC.shift | DEFAULT_SYNATTR << SYNTHESIS.shift;
-    ValueType valueType = VALUE_STRING;
-};
+Attribute::Attribute()
+    : options(DEFAULT_GENERIC << GENERIC.shift | DEFAULT_SYNATTR << SYNTHESIS.shift),
+      valueType(VALUE_STRING) {}
 
-Attribute::Attribute() : record(new Record) {}
-
-Attribute::Attribute(char const *name) : record(new Record) {
+Attribute::Attribute(char const *name) : Attribute() {
     SetNormalizedName(name);
     SetObjectType(OBJECT_ATTRIBUTE);
 }
 
-Attribute::Attribute(Attribute const &other) : Object(other), record(new Record(*other.record)) {}
-
+Attribute::Attribute(Attribute const &other) = default;
 Attribute::~Attribute() = default;
-
-Attribute &Attribute::operator=(Attribute const &other) {
-    Object::operator=(other);
-    *record = *other.record;
-    return *this;
-}
+Attribute &Attribute::operator=(Attribute const &other) = default;
 
 Object::ObjectType Attribute::GetObjectType() const { return GetStoredObjectType(); }
 void Attribute::AcceptObject(ObjectVisitor &visitor) { visitor.VisitAttribute(this); }
@@ -87,8 +80,7 @@ void Attribute::SetName(char const *name) { Object::SetName(name); }
 void Attribute::AcceptAttribute(AttributeVisitor &visitor) { visitor.VisitAttribute(this); }
 
 bool Attribute::operator==(Attribute const &other) const {
-    return Object::operator==(other) && record->valueType == other.record->valueType &&
-           record->flags == other.record->flags &&
+    return Object::operator==(other) && valueType == other.valueType && options == other.options &&
            GetValueString().Compare(other.GetValueString(),
                                     StringBase<char>::COMPARE_IGNORING_CASE) == 0;
 }
@@ -98,22 +90,22 @@ StringBase<char> Attribute::GetValueTypeName() const {
 }
 
 StringBase<char> Attribute::GetGeneric() const {
-    return GENERIC.words[GetOption(record->flags, GENERIC)];
+    return GENERIC.words[GetOption(options, GENERIC)];
 }
-bool Attribute::SetGeneric(char const *word) { return SetOption(record->flags, GENERIC, word); }
+bool Attribute::SetGeneric(char const *word) { return SetOption(options, GENERIC, word); }
 
 StringBase<char> Attribute::GetSynAttr() const {
-    return SYNTHESIS.words[GetOption(record->flags, SYNTHESIS)];
+    return SYNTHESIS.words[GetOption(options, SYNTHESIS)];
 }
-bool Attribute::SetSynAttr(char const *word) { return SetOption(record->flags, SYNTHESIS, word); }
+bool Attribute::SetSynAttr(char const *word) { return SetOption(options, SYNTHESIS, word); }
 
-bool Attribute::IsGenericNoSyn() const { return GetOption(record->flags, GENERIC) == 1; }
-bool Attribute::IsGenericSyn() const { return GetOption(record->flags, GENERIC) == 2; }
-bool Attribute::IsSynAssigned() const { return GetOption(record->flags, SYNTHESIS) != 0; }
-bool Attribute::IsSynDeclared() const { return GetOption(record->flags, SYNTHESIS) == 1; }
+bool Attribute::IsGenericNoSyn() const { return GetOption(options, GENERIC) == 1; }
+bool Attribute::IsGenericSyn() const { return GetOption(options, GENERIC) == 2; }
+bool Attribute::IsSynAssigned() const { return GetOption(options, SYNTHESIS) != 0; }
+bool Attribute::IsSynDeclared() const { return GetOption(options, SYNTHESIS) == 1; }
 
-void Attribute::SetValueType(ValueType type) { record->valueType = type; }
-Attribute::ValueType Attribute::GetStoredValueType() const { return record->valueType; }
+void Attribute::SetValueType(ValueType type) { valueType = type; }
+Attribute::ValueType Attribute::GetStoredValueType() const { return valueType; }
 
 struct AttributeString::Record {
     StringBase<char> value;
@@ -233,52 +225,78 @@ AttributeVisitor::~AttributeVisitor() = default;
 
 /// The attributes, each with the name it was added under, by which it is found although a client
 /// may have renamed it since.
+///
+/// Most holders have one attribute: it costs no memory beyond the record.
 struct AttributeHolder::Record {
     static constexpr int MAX_SCAN = 8; ///< more attributes than that are found by a map
 
-    OwnPtrArray<Attribute *> attributes;
-    std::vector<StringBase<char>> names;
-    std::unique_ptr<IStringPtrMap<Attribute *>> map;
+    ~Record() { DeleteAll(); }
 
     void Add(std::unique_ptr<Attribute> attribute) {
-        names.push_back(attribute->GetNameRef());
+        StringBase<char> const name = attribute->GetNameRef();
+        if (attributes.IsEmpty())
+            firstName = name;
+        else
+            GetFurtherNames().push_back(name);
         try {
             attributes.Add(attribute.get());
         } catch (...) {
-            names.pop_back();
+            if (further)
+                further->names.pop_back();
             throw;
         }
         Attribute *const added = attribute.release();
-        if (map)
-            map->Add(added->GetNameRef(), added);
+        if (further && further->map)
+            further->map->Add(name, added);
         else if (attributes.GetSize() > MAX_SCAN)
             MakeMap();
     }
 
     /// The newest of a name.
     Attribute *Find(char const *name) const {
-        if (map)
-            return map->Get(name);
+        if (further && further->map)
+            return further->map->Get(name);
         for (int i = attributes.GetSize() - 1; i >= 0; --i)
-            if (names[static_cast<std::size_t>(i)].Compare(
-                    name, StringBase<char>::COMPARE_IGNORING_CASE) == 0)
+            if (GetName(i).Compare(name, StringBase<char>::COMPARE_IGNORING_CASE) == 0)
                 return attributes.GetAt(i);
         return nullptr;
     }
 
     void DeleteAll() {
-        map.reset();
-        names.clear();
-        attributes.DeleteAll();
+        further.reset();
+        for (int i = attributes.GetSize() - 1; i >= 0; --i)
+            delete attributes.GetAt(i);
+        attributes.Empty();
     }
 
+    InlinePtrArray<Attribute *, 1> attributes; ///< owned
+
 private:
+    /// What the second attribute needs.
+    struct Further {
+        std::vector<StringBase<char>> names; ///< from the second attribute on
+        std::unique_ptr<IStringPtrMap<Attribute *>> map;
+    };
+
+    StringBase<char> const &GetName(int attribute) const {
+        return attribute == 0 ? firstName : further->names[static_cast<std::size_t>(attribute - 1)];
+    }
+
+    std::vector<StringBase<char>> &GetFurtherNames() {
+        if (!further)
+            further = std::make_unique<Further>();
+        return further->names;
+    }
+
     void MakeMap() {
         auto made = std::make_unique<IStringPtrMap<Attribute *>>();
         for (int i = 0; i < attributes.GetSize(); ++i)
-            made->Add(names[static_cast<std::size_t>(i)], attributes.GetAt(i));
-        map = std::move(made);
+            made->Add(GetName(i), attributes.GetAt(i));
+        further->map = std::move(made);
     }
+
+    StringBase<char> firstName;
+    std::unique_ptr<Further> further;
 };
 
 AttributeHolder::AttributeHolder() : record(nullptr) {}

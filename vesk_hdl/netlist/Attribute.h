@@ -75,8 +75,8 @@ protected:
     ValueType GetStoredValueType() const;
 
 private:
-    struct Record;
-    std::unique_ptr<Record> record;
+    unsigned int options; ///< two bits for each of both options
+    ValueType valueType;
 };
 
 /// What each of the seven value classes declares besides its typed GetValue: construction from name

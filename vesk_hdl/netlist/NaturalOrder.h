@@ -1,5 +1,6 @@
 #pragma once
 
+#include <algorithm>
 #include <array>
 #include <cstdint>
 #include <vector>
@@ -22,8 +23,12 @@ using NaturalHead = std::array<std::uint64_t, 2>;
 NaturalHead HeadOf(char const *name);
 
 /// Sorts objects by polarity, then by name. `polarityOf` gives an object's polarity; objects that
-/// have none sort by name alone when it always gives the same. Where all names of each polarity
-/// stand in strictly ascending order, the only order there is takes no sort: polarities apart.
+/// have none sort by name alone when it always gives the same.
+///
+/// Where no two objects are equal there is only one order, and the way to it is free. Names mostly
+/// come in order, or as a few series that take turns (a1, d1(7:0), a2, d2(7:0), ...), so those are
+/// merged, in a time that grows with the number of objects alone. The order of equal objects is
+/// what the steps of IntroSort make of it.
 template <class T, class PolarityOf> class NaturalSort {
 public:
     static void Sort(PtrArray<T> &array, PolarityOf polarityOf) {
@@ -33,13 +38,21 @@ public:
     }
 
 private:
+    /// What a comparison of an object mostly wants, side by side in memory.
     struct Key {
-        int polarity;
-        char const *name;
-        T item;
         NaturalHead head;
+        int polarity;
+        int place; ///< of the object in the array; while series are merged, of the next in its
+                   ///< series
+    };
+    /// Objects that ascend, by their places in the array.
+    struct Series {
+        int first;
+        int last;
     };
     static constexpr int PARTS = 4; ///< INVALID, INPUT, OUTPUT, BIDIRECTIONAL
+    static constexpr std::size_t MAX_SERIES = 8;
+    static constexpr int NONE = -1;
 
     NaturalSort(PtrArray<T> &sorted, PolarityOf &polarity) : array(sorted), polarityOf(polarity) {}
 
@@ -91,22 +104,93 @@ private:
     }
 
     void SortAll() {
-        auto less = [](Key const &a, Key const &b) {
-            if (a.polarity != b.polarity)
-                return a.polarity < b.polarity;
-            return a.head != b.head ? a.head < b.head : NaturalCompare(a.name, b.name) < 0;
-        };
-        std::vector<Key> keys;
         keys.reserve(static_cast<std::size_t>(GetSize()));
         for (int i = 0; i < GetSize(); ++i)
-            keys.push_back({PolarityAt(i), NameAt(i), array.GetAt(i), HeadOf(NameAt(i))});
-        IntroSort<Key, decltype(less)>::Sort(keys.data(), keys.data() + keys.size(), less);
+            keys.push_back({HeadOf(NameAt(i)), PolarityAt(i), i});
+        std::vector<T> sorted;
+        sorted.reserve(keys.size());
+        if (!Merge(sorted)) {
+            sorted.clear();
+            for (int i = 0; i < GetSize(); ++i)
+                KeyAt(i).place = i;
+            auto less = [this](Key const &a, Key const &b) {
+                return IsLess(a, a.place, b, b.place);
+            };
+            IntroSort<Key, decltype(less)>::Sort(keys.data(), keys.data() + keys.size(), less);
+            for (Key const &key : keys)
+                sorted.push_back(array.GetAt(key.place));
+        }
         for (int i = 0; i < GetSize(); ++i)
-            array.SetAt(i, keys[static_cast<std::size_t>(i)].item);
+            array.SetAt(i, sorted[static_cast<std::size_t>(i)]);
+    }
+
+    /// False if there are too many series, or two objects are equal.
+    bool Merge(std::vector<T> &sorted) {
+        std::vector<Series> series;
+        if (!Split(series))
+            return false;
+        std::sort(series.begin(), series.end(),
+                  [this](Series const &a, Series const &b) { return IsLessAt(a.first, b.first); });
+        for (int last = NONE; !series.empty();) {
+            int const least = series.front().first; // the series are in the order of their firsts
+            if (last != NONE && !IsLessAt(last, least))
+                return false;
+            last = least;
+            sorted.push_back(array.GetAt(least));
+            TakeFirst(series);
+        }
+        return true;
+    }
+
+    /// Puts each object at the end of the series with the greatest last object that is less. So the
+    /// last objects of the series descend, and there are as few series as can be.
+    bool Split(std::vector<Series> &series) {
+        for (int i = 0; i < GetSize(); ++i) {
+            auto const found = std::find_if(series.begin(), series.end(), [&](Series const &each) {
+                return IsLessAt(each.last, i);
+            });
+            KeyAt(i).place = NONE;
+            if (found != series.end()) {
+                KeyAt(found->last).place = i;
+                found->last = i;
+            } else if (series.size() < MAX_SERIES) {
+                series.push_back({i, i});
+            } else {
+                return false;
+            }
+        }
+        return true;
+    }
+
+    /// Takes the first object out of the first series, and puts the series where it belongs now.
+    void TakeFirst(std::vector<Series> &series) {
+        auto place = series.begin();
+        Series const moved = {KeyAt(place->first).place, place->last};
+        if (moved.first == NONE) {
+            series.erase(place);
+            return;
+        }
+        for (; place + 1 != series.end() && IsLessAt(place[1].first, moved.first); ++place)
+            *place = place[1];
+        *place = moved;
+    }
+
+    Key &KeyAt(int place) { return keys[static_cast<std::size_t>(place)]; }
+    Key const &KeyAt(int place) const { return keys[static_cast<std::size_t>(place)]; }
+
+    bool IsLessAt(int a, int b) const { return IsLess(KeyAt(a), a, KeyAt(b), b); }
+
+    bool IsLess(Key const &a, int placeOfA, Key const &b, int placeOfB) const {
+        if (a.polarity != b.polarity)
+            return a.polarity < b.polarity;
+        if (a.head != b.head)
+            return a.head < b.head;
+        return NaturalCompare(NameAt(placeOfA), NameAt(placeOfB)) < 0;
     }
 
     PtrArray<T> &array;
     PolarityOf &polarityOf;
+    std::vector<Key> keys;
 };
 
 template <class T, class PolarityOf> void SortNaturally(PtrArray<T> &array, PolarityOf polarityOf) {

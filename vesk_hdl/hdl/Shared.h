@@ -33,7 +33,7 @@ struct SignalLists {
             if (signal->HasAttrs() && signal->GetPortPolarity() == Polarity::INVALID &&
                 signal->IsNeededToDeclared())
                 innerWithAttrs.Add(signal);
-            if (signal->HasConstantValue() || signal->GetSignalIterator().HasMore())
+            if (signal->HasConstantValue() || signal->HasAssignments())
                 assigned.Add(signal);
         });
     }

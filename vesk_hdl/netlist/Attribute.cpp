@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "vesk_hdl/netlist/Vocabulary.h"
+#include "vesk_hdl/netlist/storage/LazyRecord.h"
 #include "vesk_hdl/text/LentPtrArray.h"
 #include "vesk_hdl/text/StringArray.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
@@ -307,16 +308,7 @@ AttributeHolder::AttributeHolder(AttributeHolder const &other) : AttributeHolder
 
 AttributeHolder::~AttributeHolder() { delete record.load(std::memory_order_relaxed); }
 
-/// Threads that only read may ask at once: the first of them gives the holder its record.
-AttributeHolder::Record &AttributeHolder::Own() const {
-    Record *own = record.load(std::memory_order_acquire);
-    if (own)
-        return *own;
-    auto made = std::make_unique<Record>();
-    if (record.compare_exchange_strong(own, made.get(), std::memory_order_acq_rel))
-        own = made.release();
-    return *own;
-}
+AttributeHolder::Record &AttributeHolder::Own() const { return OwnLazily(record); }
 
 AttributeHolder &AttributeHolder::operator=(AttributeHolder const &other) {
     if (this == &other)

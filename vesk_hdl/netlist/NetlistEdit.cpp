@@ -1,5 +1,6 @@
 #include "vesk_hdl/netlist/NetlistEdit.h"
 
+#include <cassert>
 #include <new>
 #include <typeinfo>
 #include <utility>
@@ -56,15 +57,24 @@ Bus *NetlistEdit::Widen(Bus *bus, char const *name) {
     bool const isPlain = typeid(*bus) == typeid(Bus); // not a class that a client derived
     BusSlice *const slice =
         isPlain ? PutSliceInPlaceOf(bus, *made) : RepointToSlice(bus, std::move(made));
-    ForEach(slice->GetPinIterator(), [slice](Pin *pin) { pin->Connect(slice); });
+    if (Signal::Record *const own = slice->Find())
+        ForEach(own->pins, [slice](Pin *pin) { pin->Connect(slice); });
     return result;
+}
+
+/// Moves the lists of a bus to a new slice. The constant value ends: it was one of the whole bus.
+void NetlistEdit::TakeLists(Bus &bus, BusSlice &made) {
+    Signal::Record *const lists = bus.Signal::record.exchange(nullptr);
+    if (lists)
+        lists->constantValue = BitVectorValue();
+    assert(!made.Find());
+    made.Signal::record = lists;
 }
 
 /// A bus and a slice are of one size: a pointer at the one is a pointer at the other.
 BusSlice *NetlistEdit::PutSliceInPlaceOf(Bus *bus, BusSlice &made) {
     static_assert(sizeof(Bus) == sizeof(BusSlice) && alignof(Bus) == alignof(BusSlice));
-    std::swap(made.Signal::record, bus->Signal::record);
-    made.Signal::record->constantValue = BitVectorValue();
+    TakeLists(*bus, made);
     bus->~Bus();
     return new (static_cast<void *>(bus)) BusSlice(std::move(made));
 }
@@ -74,16 +84,17 @@ BusSlice *NetlistEdit::PutSliceInPlaceOf(Bus *bus, BusSlice &made) {
 BusSlice *NetlistEdit::RepointToSlice(Bus *bus, std::unique_ptr<BusSlice> made) {
     Netlist::Record &record = *netlist.record;
     BusSlice *const slice = made.release();
-    std::swap(slice->Signal::record, bus->Signal::record);
-    slice->Signal::record->constantValue = BitVectorValue();
+    TakeLists(*bus, *slice);
     auto const replace = [bus, slice](PtrArray<Signal *> &signals) {
         for (int i = 0; i < signals.GetSize(); ++i)
             if (signals.GetAt(i) == bus)
                 signals.SetAt(i, slice);
     };
     auto const replaceIn = [&](Signal *signal) {
-        replace(signal->record->signals);
-        signal->record->index.reset();
+        if (Signal::Record *const own = signal->Find()) {
+            replace(own->signals);
+            own->index.reset();
+        }
         if (auto *const compound = As<CompoundBus>(signal))
             for (int i = 0; i < compound->GetSize(); ++i)
                 if (compound->GetAt(i) == bus)

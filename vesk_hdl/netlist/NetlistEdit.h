@@ -30,6 +30,7 @@ public:
     void CountRenames(unsigned long &counter) { netlist.CountRenames(counter); }
 
 private:
+    static void TakeLists(Bus &bus, BusSlice &made);
     BusSlice *PutSliceInPlaceOf(Bus *bus, BusSlice &made);
     BusSlice *RepointToSlice(Bus *bus, std::unique_ptr<BusSlice> made);
 

@@ -1,85 +1,112 @@
 #include "vesk_hdl/netlist/Signal.h"
 
-#include <utility>
-
 #include "vesk_hdl/netlist/As.h"
 #include "vesk_hdl/netlist/SignalRecord.h"
+#include "vesk_hdl/netlist/storage/LazyRecord.h"
 
 namespace Vesk_Hdl {
 
 using Basis::StringBase;
 
-Signal::Signal() : record(std::make_unique<Record>()) { SetObjectType(OBJECT_SIGNAL); }
-Signal::Signal(char const *name) : record(std::make_unique<Record>()) {
-    SetNormalizedName(name);
-    SetObjectType(OBJECT_SIGNAL);
-}
+Signal::Signal() : record(nullptr) { SetObjectType(OBJECT_SIGNAL); }
+Signal::Signal(char const *name) : Signal() { SetNormalizedName(name); }
 
-Signal::~Signal() = default;
+Signal::~Signal() { delete Find(); }
 
 Object::ObjectType Signal::GetObjectType() const { return GetStoredObjectType(); }
 void Signal::AcceptObject(ObjectVisitor &visitor) { visitor.VisitSignal(this); }
 void Signal::SetName(char const *name) { Object::SetName(name); }
 
 /// For a slice that takes the place of a bus: with the name and the lists of another object.
-Signal::Signal(Signal &&made) noexcept : Object(made), record(std::move(made.record)) {}
+Signal::Signal(Signal &&made) noexcept : Object(made), record(made.record.exchange(nullptr)) {}
+
+Signal::Record *Signal::Find() const { return record.load(std::memory_order_acquire); }
+Signal::Record &Signal::Own() const { return OwnLazily(record); }
 
 void Signal::Connect(Pin *pin) {
-    if (!pin || (pin->MayBeListed() && record->Contains(record->pins, pin)))
+    if (!pin)
         return;
-    record->Append(record->pins, pin);
+    Record &own = Own();
+    if (pin->MayBeListed() && own.Contains(own.pins, pin))
+        return;
+    own.Append(own.pins, pin);
     pin->SetListedSignal(this);
 }
 
 void Signal::Connect(Signal *other) {
-    if (other && !record->Contains(record->signals, other))
-        record->Append(record->signals, other);
+    if (!other)
+        return;
+    Record &own = Own();
+    if (!own.Contains(own.signals, other))
+        own.Append(own.signals, other);
 }
 
 void Signal::Disconnect(Pin *pin) {
     if (!pin)
         return;
-    record->Remove(record->pins, pin);
+    if (Record *const own = Find())
+        own->Remove(own->pins, pin);
     pin->Disconnect();
 }
 
-void Signal::Disconnect(Signal *other) { record->Remove(record->signals, other); }
+void Signal::Disconnect(Signal *other) {
+    if (Record *const own = Find())
+        own->Remove(own->signals, other);
+}
 
 void Signal::DisconnectAll() {
-    ForEach(record->pins, [](Pin *pin) { pin->Disconnect(); });
-    record->pins.Empty();
-    record->signals.Empty();
-    record->index.reset();
+    Record *const own = Find();
+    if (!own)
+        return;
+    ForEach(own->pins, [](Pin *pin) { pin->Disconnect(); });
+    own->pins.Empty();
+    own->signals.Empty();
+    own->index.reset();
 }
 
 void Signal::CloneConnection(Signal *source) {
     DisconnectAll();
-    if (!source)
+    Record *const others = source ? source->Find() : nullptr;
+    if (!others)
         return;
-    ForEach(source->record->pins, [this](Pin *pin) { record->Append(record->pins, pin); });
-    ForEach(source->record->signals, [this](Signal *s) { record->Append(record->signals, s); });
+    Record &own = Own();
+    ForEach(others->pins, [&own](Pin *pin) { own.Append(own.pins, pin); });
+    ForEach(others->signals, [&own](Signal *signal) { own.Append(own.signals, signal); });
     source->DisconnectAll();
-    ForEach(record->pins, [this](Pin *pin) { pin->SetListedSignal(this); });
+    ForEach(own.pins, [this](Pin *pin) { pin->SetListedSignal(this); });
 }
 
-void Signal::AssignConstantValue(char const *text) { record->constantValue.SetValue(text); }
-void Signal::AssignConstantValue(BitVectorValue const &value) { record->constantValue = value; }
-BitVectorValue Signal::GetConstantValue() const { return record->constantValue; }
-bool Signal::HasConstantValue() const { return !record->constantValue.IsEmpty(); }
+void Signal::AssignConstantValue(char const *text) { Own().constantValue.SetValue(text); }
+void Signal::AssignConstantValue(BitVectorValue const &value) { Own().constantValue = value; }
+BitVectorValue Signal::GetConstantValue() const {
+    Record const *const own = Find();
+    return own ? own->constantValue : BitVectorValue();
+}
+bool Signal::HasConstantValue() const {
+    Record const *const own = Find();
+    return own && !own->constantValue.IsEmpty();
+}
 
 bool Signal::HasMultiDriver() const {
+    Record const *const own = Find();
     int drivers = 0;
-    PtrArray<Pin *> const &pins = record->pins;
-    for (int i = 0; i < pins.GetSize() && drivers < 2; ++i)
-        if (Pin const *const pin = pins.GetAt(i))
+    for (int i = 0; own && i < own->pins.GetSize() && drivers < 2; ++i)
+        if (Pin const *const pin = own->pins.GetAt(i))
             drivers += pin->GetPolarity() == Polarity::OUTPUT ? 1 : 0;
     return drivers > 1;
 }
 
-Iterator<Pin *> Signal::GetPinIterator() const { return Iterator<Pin *>(&record->pins); }
+Iterator<Pin *> Signal::GetPinIterator() const { return Iterator<Pin *>(&Own().pins); }
+Iterator<Signal *> Signal::GetSignalIterator() const { return Iterator<Signal *>(&Own().signals); }
 
-Iterator<Signal *> Signal::GetSignalIterator() const {
-    return Iterator<Signal *>(&record->signals);
+bool Signal::HasPins() const {
+    Record const *const own = Find();
+    return own && !own->pins.IsEmpty();
+}
+
+bool Signal::HasAssignments() const {
+    Record const *const own = Find();
+    return own && !own->signals.IsEmpty();
 }
 
 void Signal::GetBaseName(StringSet &names) const {

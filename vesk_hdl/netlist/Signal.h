@@ -1,5 +1,7 @@
 #pragma once
 
+#include <atomic>
+
 #include "vesk_hdl/netlist/Attribute.h"
 #include "vesk_hdl/netlist/Object.h"
 #include "vesk_hdl/text/StringArray.h"
@@ -66,8 +68,13 @@ public:
     bool HasConstantValue() const;
     /// Whether more than one pin of polarity OUTPUT is listed.
     bool HasMultiDriver() const;
+    /// The walks also see what is connected after they were asked for, so that asking makes empty
+    /// lists: ask HasPins or HasAssignments first where many signals have none.
     Iterator<Pin *> GetPinIterator() const;
     Iterator<Signal *> GetSignalIterator() const;
+    bool HasPins() const;
+    /// Whether other signals are assigned to this one.
+    bool HasAssignments() const;
     /// Adds the names that this signal needs declared, each if `IContains` says that it is absent:
     /// the base name, or for a compound its full name and the base name of each member.
     void GetBaseName(StringSet &names) const;
@@ -83,8 +90,10 @@ private:
     struct Record;
 
     Signal(Signal &&made) noexcept;
+    Record *Find() const;
+    Record &Own() const;
 
-    std::unique_ptr<Record> record;
+    mutable std::atomic<Record *> record; ///< null while nothing was connected or asked for
 };
 
 /// One net.

@@ -1,3 +1,5 @@
+// What all classes of signals share: connections, the constant and the names to be declared.
+
 #include "vesk_hdl/netlist/Signal.h"
 
 #include <utility>
@@ -21,9 +23,11 @@ Object::ObjectType Signal::GetObjectType() const { return GetStoredObjectType();
 void Signal::AcceptObject(ObjectVisitor &visitor) { visitor.VisitSignal(this); }
 void Signal::SetName(char const *name) { Object::SetName(name); }
 
-/// For a slice that takes the place of a bus: with the name and the lists of another object.
+/// For a slice that takes the address of a bus: it gets the name and the lists of `made`.
 Signal::Signal(Signal &&made) noexcept : Object(made), record(std::move(made.record)) {}
 
+/// A pin that was never on a signal is not searched: with nets of a hundred thousand pins that is
+/// nearly every connection.
 void Signal::Connect(Pin *pin) {
     if (!pin || (pin->MayBeListed() && record->Contains(record->pins, pin)))
         return;
@@ -58,6 +62,7 @@ void Signal::CloneConnection(Signal *source) {
         return;
     ForEach(source->record->pins, [this](Pin *pin) { record->Append(record->pins, pin); });
     ForEach(source->record->signals, [this](Signal *s) { record->Append(record->signals, s); });
+    // This clears the signal of all pins, so that they are put on this signal after it.
     source->DisconnectAll();
     ForEach(record->pins, [this](Pin *pin) { pin->SetListedSignal(this); });
 }

@@ -1,6 +1,8 @@
 #pragma once
 
-/// Marks what the shared library exports; everything else is hidden.
+/// Marks a class or function that the shared library exports. The library is built with hidden
+/// visibility: a client cannot link to anything that lacks this mark. Clients define no macro,
+/// since using an exported name needs the same attribute as exporting it.
 #if defined(__GNUC__)
 #define VESK_HDL_API __attribute__((visibility("default")))
 #else

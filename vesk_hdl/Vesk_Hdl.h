@@ -1,6 +1,17 @@
 #pragma once
 
-// The whole exported interface and the types of the base layer that it uses. Begin with Engine.
+// The whole exported interface and the types of the base layer that it uses.
+//
+// Where to begin reading:
+// - Engine (engine/HdlEngine.h) owns designs and runs command lines and command files on them.
+// - Model (model/HdlModel.h) is one design. Its operations are what the commands call.
+// - Netlist (netlist/Netlist.h) is what a client walks that looks at a design.
+// - VhdlNetlister and VerilogNetlister (hdl/) write a netlist as text.
+// - OutStream (text/OutStream.h) is where that text goes.
+// - Exception (text/Exception.h) is what every refusal throws.
+//
+// A client that needs one class alone includes the header of that class. Headers that this one does
+// not include are not installed, apart from those of text/basis/, which Basis.h includes.
 
 #include "vesk_hdl/engine/CommandHelp.h"
 #include "vesk_hdl/engine/HdlCmd.h"

@@ -10,30 +10,35 @@ namespace Vesk_Hdl {
 class HdlOptions;
 class OutStream;
 
-/// Static helpers of both writers. Null counts as empty.
+/// Static helpers that both writers use. A null text counts as empty.
 class VESK_HDL_API HdlUtilities {
 public:
-    /// Local date and time, MM/DD/YYYY hh:mm:ss.
+    /// The present local date and time, MM/DD/YYYY hh:mm:ss.
     static Basis::StringBase<char> CurrentTimeString();
     /// The date and time of a moment in UTC, in the same form.
     static Basis::StringBase<char> TimeString(std::time_t moment);
-    /// The letter of a bit string literal: "b" for 2, "o" for 8, otherwise "x" in VHDL and "h" in
-    /// Verilog.
+    /// The base letter of a VHDL bit string literal (IEEE 1076-1993, 13.7): "b" for 2, "o" for 8,
+    /// "x" for any other number.
     static Basis::StringBase<char> ConvertVhdlBase(int base);
+    /// The base letter of a Verilog number (IEEE 1364-1995, 2.5.1): "b" for 2, "o" for 8, "h" for
+    /// any other number.
     static Basis::StringBase<char> ConvertVerilogBase(int base);
-    /// The library's version.
+    /// The version of the library, as Basis::Version gives it.
     static Basis::StringBase<char> GetVersion();
-    /// The name with "_DUMMY" in front of its brackets, or behind it; what follows ")" is dropped.
+    /// The name of a dummy: "A(3:0)" gives "A_DUMMY(3:0)", "A" gives "A_DUMMY". What follows the
+    /// first ")" is left out. Unlike Signal::GetDummySignalName it does not look for a mark that is
+    /// there already.
     static Basis::StringBase<char> AddDummySuffix(char const *name);
-    /// The text without one kind of enclosing quotes: all double ones at both ends if it begins and
-    /// ends with one, otherwise all single ones likewise.
+    /// The text without its enclosing quotes. If it begins and ends with a double quote, all double
+    /// quotes at both ends are left out; otherwise the same with single quotes. Quotes of one kind
+    /// inside the other stay.
     static Basis::StringBase<char> RemoveQuotes(char const *text);
-    /// The names of the instance's own attributes, in order; those of its component are not
-    /// reported. Null gives an empty array.
+    /// The names of the instance's own attributes, in order. Those of its component are left out,
+    /// also where the instance inherits them. Null gives an empty array.
     static StringArray GetAttrNames(Instance const *instance);
-    /// Writes the file header with the fields of the options, in the comment syntax of the
-    /// language. The file name is that of a TextFileOutStream, otherwise empty. The time is that
-    /// of the options, otherwise the present one.
+    /// Writes the file header, see NetlistHeader, with the fields of the options. The file name is
+    /// that of the stream if it is a TextFileOutStream, otherwise empty. The time is `headerTime`
+    /// of the options, otherwise the present local time. `isVhdl` chooses the comment mark.
     static void WriteHeader(Basis::StringBase<char> const &designName, bool isVhdl,
                             HdlOptions const &options, OutStream &stream);
 };

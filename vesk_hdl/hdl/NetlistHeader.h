@@ -6,26 +6,30 @@ namespace Vesk_Hdl {
 
 class OutStream;
 
-/// The comment block at the head of a written file: divider, copyright, a drawing with five fields,
-/// then command, design, device, purpose and reference of the run. The languages differ in the
-/// comment mark alone.
+/// The comment block at the head of a written file: a divider, a copyright line, a drawing with
+/// five fields beside it, then command, design name, device, purpose and reference of the run. The
+/// two languages differ only in the comment mark, "--" or "//".
 class VESK_HDL_API NetlistHeader {
 public:
-    /// Copies the texts and points at the stream, which must outlive the header. Of `fileName`, a
-    /// path, the last component is shown. An empty device, purpose or reference leaves its lines
-    /// out.
+    /// Copies the texts and refers to the stream, which must outlive this object. Of `fileName`, a
+    /// path, only the last component is shown. An empty device, purpose or reference leaves its
+    /// lines out; the other fields are always shown. Purpose and reference are wrapped at 79
+    /// columns between words, and a "\n" in them begins a new line. A "\n" in another field is
+    /// written as it is and ends the comment there.
     NetlistHeader(Basis::StringBase<char> const &application,
                   Basis::StringBase<char> const &fileName, Basis::StringBase<char> const &command,
                   Basis::StringBase<char> const &designName, Basis::StringBase<char> const &device,
                   Basis::StringBase<char> const &purpose, Basis::StringBase<char> const &reference,
                   bool isVhdl, OutStream &stream);
+    /// Leaves the stream alone.
     ~NetlistHeader();
     NetlistHeader(NetlistHeader const &) = delete;
     NetlistHeader &operator=(NetlistHeader const &) = delete;
 
-    /// Writes the block with the present local time.
+    /// Writes the block with the present local time. It can be called again and then writes it
+    /// again.
     void Write();
-    /// Writes it with that text in the place of the time.
+    /// Writes the block with this text in the place of the time.
     void Write(Basis::StringBase<char> const &timestamp);
 
 private:

@@ -11,19 +11,25 @@ namespace Vesk_Hdl {
 class OutStream;
 class VerilogStatements;
 
-/// Writes one netlist as one structural Verilog file: a time scale and a module. It decides what is
-/// written and in which order; VerilogStatements knows the characters. The source reads from top to
-/// bottom like the file that it writes.
+/// Writes one netlist as one structural Verilog file (IEEE 1364-1995): a time scale and a module.
+/// It decides what is written and in which order; VerilogStatements knows the characters.
+/// VerilogNetlister.cpp reads from top to bottom like the file that it writes.
 class VESK_HDL_API VerilogNetlister {
 public:
-    /// Points at the stream, which must outlive the netlister.
+    /// A writer to a stream, which is not owned and must outlive the netlister.
     VerilogNetlister(OutStream &stream);
+    /// Leaves the stream open and does not flush it.
     ~VerilogNetlister();
     VerilogNetlister(VerilogNetlister const &) = delete;
     VerilogNetlister &operator=(VerilogNetlister const &) = delete;
 
-    /// Rewrites the netlist for good, as for VHDL, and puts names into the case that the options
-    /// ask for; then writes it. Null writes nothing. Sets `macroNetlist` of the options.
+    /// Rewrites the netlist for good and writes it: sorts it, makes dummy signals as for VHDL
+    /// (Netlist::CreateVhdlDummySignals), gives names the case of the options, then writes the
+    /// file. All rewriting is done before the first text. Sets `macroNetlist` of the options. Null
+    /// writes nothing.
+    ///
+    /// Nothing is reported: the stream knows whether its text arrived. An exception of the stream's
+    /// guard passes through.
     void WriteNetlist(Netlist *netlist, HdlOptions const &options);
 
 private:

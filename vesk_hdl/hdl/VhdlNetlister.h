@@ -10,24 +10,32 @@ class HdlOptions;
 class OutStream;
 class VhdlStatements;
 
-/// Writes one netlist as one structural VHDL file: libraries, an entity, an architecture named
-/// BEHAVIORAL and a configuration. It decides what is written and in which order; VhdlStatements
-/// knows the characters.
+/// Writes one netlist as one structural VHDL file (IEEE 1076-1993): library clauses, an entity, an
+/// architecture named BEHAVIORAL and a configuration. It decides what is written and in which
+/// order; VhdlStatements knows the characters.
 ///
 /// Sources: VhdlNetlister.cpp reads from top to bottom like the file that it writes;
-/// VhdlNetlister_instances.cpp holds generic clauses and instance statements.
+/// VhdlNetlister_instances.cpp has the generic clauses and instance statements.
 class VESK_HDL_API VhdlNetlister {
 public:
-    /// Points at the stream, which must outlive the netlister.
+    /// A writer to a stream, which is not owned and must outlive the netlister.
     VhdlNetlister(OutStream &stream);
-    /// Shares the statements and copies the set of declared attributes.
+    /// A writer to the same stream, which takes over the set of attributes that are declared so
+    /// far. Its argument is not const: that is part of the interface.
     VhdlNetlister(VhdlNetlister &other);
+    /// Leaves the stream open and does not flush it.
     ~VhdlNetlister();
     VhdlNetlister &operator=(VhdlNetlister const &) = delete;
 
-    /// Rewrites the netlist for good so that the text will be legal, then writes it. Null writes
-    /// nothing. One netlister writes one file: a second write takes the attributes of the first as
-    /// declared. Sets `macroNetlist` of the options.
+    /// Rewrites the netlist for good, so that the text will be legal, and writes it: sorts it,
+    /// makes dummy signals, marks the vendor's cells (see the passes of Netlist), ties open inputs
+    /// if the option `openPin` is false, then writes the file. All rewriting is done before the
+    /// first text. Sets `macroNetlist` of the options. A null netlist or null options write
+    /// nothing.
+    ///
+    /// One netlister writes one file: a second call takes the attributes that the first one
+    /// declared as declared. Nothing is reported: the stream knows whether its text arrived. An
+    /// exception of the stream's guard passes through.
     void WriteNetlist(Netlist *netlist, HdlOptions const *options);
 
 private:
@@ -53,9 +61,9 @@ private:
     void WriteInstance(Instance const *instance, HdlOptions const *options);
     void WriteInstanceAttrAssignment(Instance const *instance, HdlOptions const *options);
 
-    VhdlStatements *statements; ///< shared with copies
-    OutStream *stream;
-    StringSet declaredAttrs; ///< declared so far in this file, by entity and architecture alike
+    VhdlStatements *statements; ///< shared with copies; the last of them deletes it
+    OutStream *stream;          ///< not owned
+    StringSet declaredAttrs;    ///< declared in this file so far, by entity and architecture alike
 };
 
 } // namespace Vesk_Hdl

@@ -1,3 +1,7 @@
+// Model's declarations and lookups. Each operation checks first and changes afterwards, so that a
+// refusal leaves the design as it was. Reserved words are no matter of a model: the languages
+// differ in them.
+
 #include "vesk_hdl/model/HdlModel.h"
 
 #include "vesk_hdl/model/Messages.h"
@@ -10,7 +14,8 @@ namespace Vesk_Hdl {
 
 using Basis::StringBase;
 
-/// Names are shared by components, instances and signals; those of pins and attributes are not.
+/// Components, instances and signals share one space of names, since both languages declare them in
+/// one region. Pins and attributes have their own.
 bool Model::IsNamedUsed(char const *name) {
     return NetlistEdit(*GetNetlist()).IsNameUsed(Names::Key(name));
 }
@@ -25,6 +30,8 @@ bool Model::AddComponent(char const *name) {
     return true;
 }
 
+/// The pins of a component are no identifiers of the design: any name that the component does not
+/// have is free.
 bool Model::AddPin(char const *pinName, Polarity const &polarity, char const *componentName,
                    char const *initialValue) {
     if (!pinName)
@@ -49,13 +56,16 @@ bool Model::AddInstance(char const *instanceName, char const *componentName) {
     Component *const component = GetComponent(componentName);
     if (!component)
         RAISE(Messages::COMPONENT_NOT_FOUND, componentName);
-    if (NetlistEdit(netlist).FindInstance(key)) // a guard: the identifier check has caught this
+    // The test above has caught this case. The guard and its message are part of the interface.
+    if (NetlistEdit(netlist).FindInstance(key))
         RAISE(Messages::INSTANCE_EXISTS, instanceName);
     netlist.Add(new Instance(instanceName, component));
     SetModifiedFlag(true);
     return true;
 }
 
+/// Required: only the form of a bus makes another class. A declared D(3) or A,B is a single net of
+/// that name.
 bool Model::AddSignal(char const *name) {
     if (!name)
         RAISE(Messages::INVALID_NAME);

@@ -1,5 +1,6 @@
-// Model's attributes and comments, set out as a grid: an owner a block, an operation a line. Each
-// line finds the owner, with the message for that owner, and calls a base operation.
+// Model's attributes and comments, as a grid: a block for each kind of owner, and in it an entry
+// for each operation, which finds the owner, with the message for that owner, and calls a base
+// operation. The grid is written out, since each entry is an operation of its own in the interface.
 
 #include "vesk_hdl/model/HdlModel.h"
 
@@ -12,7 +13,7 @@ using namespace Vesk_Hdl;
 
 namespace {
 
-// The finders: never null, but an exception.
+// The finders. They return no null: what is missing is refused with the required message.
 
 template <class T, class... Names> T *Found(T *object, Message const &message, Names... names) {
     if (!object)
@@ -28,7 +29,8 @@ Instance *FindInstance(Model const &model, char const *name) {
     return Found(model.GetInstance(name), Messages::INSTANCE_MISSING, name);
 }
 
-/// Required of the operations that set options: a missing instance is a missing attribute.
+/// For the operations that set options. Required: a missing instance is reported as a missing
+/// attribute.
 Instance *FindInstanceToSet(Model const &model, char const *name, char const *attribute) {
     return Found(model.GetInstance(name), Messages::INSTANCE_OF_ATTRIBUTE_MISSING, attribute, name);
 }
@@ -75,10 +77,12 @@ void SetUserTypeOf(Attribute &attribute, char const *userType) {
     user->SetUserType(userType);
 }
 
-/// The attribute that an instance changes: its own, or a copy of its component's, which it keeps
-/// from then on, so that the component's other instances go on with the component's value.
+/// The attribute that a Set operation on an instance changes: its own, or a clone of its
+/// component's, which the instance keeps, so that other instances keep the component's value.
+/// `found` is either of the two.
 Attribute *OwnAttr(Instance *instance, Attribute *found, char const *name) {
     Found(found, Messages::ATTRIBUTE_NOT_FOUND, name);
+    // Required: the clone stays also if the operation is refused afterwards.
     if (instance->GetAttr(name) == found)
         return found;
     Attribute *const copy = found->CloneAttribute();
@@ -97,7 +101,7 @@ void Model::AddAttr(AttributeHolder *holder, char const *name, char const *value
     if (!holder)
         return;
     if (Attribute *const attribute = holder->GetAttr(name)) {
-        attribute->SetValue(value);
+        attribute->SetValue(value); // it keeps its type: `type` has no effect
     } else {
         Attribute *const added = AttributeFactory::GetInstance().CreateAttribute(type, name, value);
         if (!added)
@@ -185,6 +189,7 @@ void Model::AddComponentComment(char const *component, char const *text) {
 
 // An instance.
 
+/// The attribute that is in effect for an instance.
 Attribute *Model::GetInstanceOrComponentAttr(char const *name, Instance *instance) const {
     if (!instance)
         return nullptr;

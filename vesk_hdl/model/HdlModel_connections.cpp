@@ -1,5 +1,5 @@
 // Model's connections. Netlists arrive as flat text, a signal and a pin at a time, and signals need
-// not be declared first: a name brings what it demands into being.
+// not be declared first: a name that is used makes the signals that it refers to.
 
 #include "vesk_hdl/model/HdlModel.h"
 
@@ -16,7 +16,8 @@ using Text = Basis::StringBase<char>;
 
 namespace {
 
-/// Builds the name of the signal that ties a pin to a constant; the pin's class picks the form.
+/// Builds the name of the signal that ties a pin to a constant. Its form follows from the class of
+/// the pin, so that the signal is as wide as the pin.
 class PinConstantSignalVisitor : public PinVisitor {
 public:
     explicit PinConstantSignalVisitor(char const *instance) : instanceName(instance) {}
@@ -50,8 +51,9 @@ private:
 
 namespace Vesk_Hdl {
 
-/// Null for a bit of an unknown bus: a bit never makes its bus. The forms are tested on the name as
-/// it was typed, so that "a[3]" makes a scalar that is called a(3).
+/// Null for a bit of an unknown bus: the width of a bus does not follow from one of its bits.
+/// Required: the forms are tested on the name as it was typed, so that "a[3]" makes a single net
+/// that is called a(3).
 Signal *Model::GetOrCreateSignal(char const *name) {
     if (Signal *const signal = GetSignal(name))
         return signal;
@@ -76,8 +78,8 @@ Signal *Model::CreateAndAddBusIndexSignal(char const *name) {
     return index;
 }
 
-/// A slice that is narrower than its bus is one wherever its range lies. One as wide or wider takes
-/// the bus's place, and the bus becomes a slice of it.
+/// Required: a range that is narrower than the bus makes a slice, also if it is outside the bus.
+/// One that is as wide or wider replaces the bus, and the bus becomes a slice of it.
 Signal *Model::CreateAndAddBusSliceSignal(char const *name) {
     Netlist &netlist = *GetNetlist();
     Bus *const bus = netlist.GetParentBus(name);
@@ -101,8 +103,8 @@ Signal *Model::CreateAndAddCompundSignal(char const *name) {
     StringArray memberNames;
     CompoundBus::ParseCompoundBusName(normal, memberNames, false);
 
-    // A later member may widen the bus of an earlier one: a slice then takes the bus's place, also
-    // in this array.
+    // A later member may widen the bus of an earlier one. The pointer in this array is then one to
+    // the slice at the address of that bus, see docs/architecture.md, "Widening".
     PtrArray<Signal *> members;
     for (int i = 0; i < memberNames.GetSize(); ++i) {
         Text const &member = memberNames.At(i);
@@ -111,7 +113,8 @@ Signal *Model::CreateAndAddCompundSignal(char const *name) {
             signal = CreateAndAddBusIndexSignal(member);
         else if (!signal && Bus::IsBusName(member))
             signal = CreateAndAddBusSliceSignal(member);
-        if (!signal) { // also a bit of an unknown bus, unlike outside a compound
+        if (!signal) { // required: also a bit of an unknown bus, which is refused outside a
+                       // compound
             AddSignal(member);
             signal = GetSignal(member);
         }
@@ -122,6 +125,9 @@ Signal *Model::CreateAndAddCompundSignal(char const *name) {
     SetModifiedFlag(true);
     return compound;
 }
+
+// The private operations below are part of the interface of the class. They refuse nothing: a null
+// gives false.
 
 bool Model::Connect(Signal *signal, Pin *pin) {
     if (!signal || !pin)
@@ -158,7 +164,9 @@ bool Model::AssignConstant(Pin *pin, char const *value, char const *instanceName
     Signal *const signal = GetSignal(signalName);
     if (!AssignConstant(signal, value))
         return false;
-    pin->Connect(signal); // one way: the signal's list of pins stays empty
+    // Required: one way only. The writers find the constant through the pin, and the passes before
+    // a write find no pin through the signal.
+    pin->Connect(signal);
     return true;
 }
 
@@ -177,7 +185,8 @@ bool Model::ConnectSignalToPin(char const *signalName, char const *instanceName,
 }
 
 bool Model::ConnectSignals(char const *left, char const *right) {
-    Text const sourceName(right); // it may be the name of the bus that gives way to the left one
+    // A copy: `right` may be the text of a bus that the signal on the left replaces.
+    Text const sourceName(right);
     Signal *const target = GetOrCreateSignal(left);
     if (!target)
         RAISE(Messages::SIGNAL_NOT_FOUND, left);

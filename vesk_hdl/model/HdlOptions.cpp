@@ -1,3 +1,5 @@
+// The options of the writers: defaults, copies, and the words that commands pass on.
+
 #include "vesk_hdl/model/HdlOptions.h"
 
 #include <algorithm>
@@ -22,7 +24,8 @@ HdlOptions::VerilogOption &HdlOptions::VerilogOption::operator=(VerilogOption &o
 
 void HdlOptions::VerilogOption::SetSynthesisType(char const *word) {
     int const tool = Vocabulary::IndexOf(Vocabulary::SYNTHESIS_TOOLS, word);
-    synthesisType = static_cast<SynthesisType>(std::max(tool, 0)); // any other word is QRT
+    // Required: any other word is QRT.
+    synthesisType = static_cast<SynthesisType>(std::max(tool, 0));
 }
 
 HdlOptions::VerilogOption::CaseType HdlOptions::VerilogOption::GetCaseType(char const *word) const {
@@ -36,6 +39,7 @@ bool HdlOptions::VerilogOption::IsSemiColonWrittenBeforeAttr() const {
 
 HdlOptions::HdlOptions() : writeHeader(true), portOnePerLine(true), macroNetlist(false) {}
 
+/// Required: macroNetlist is not copied. It is a result of the last write and no setting.
 HdlOptions::HdlOptions(HdlOptions &other)
     : vhdlOption(other.vhdlOption), verilogOption(other.verilogOption),
       writeHeader(other.writeHeader), application(other.application), commandStr(other.commandStr),

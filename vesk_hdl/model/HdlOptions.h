@@ -7,81 +7,124 @@
 
 namespace Vesk_Hdl {
 
-/// How a netlist is written. Each model owns one; the option commands fill it, the writers read it.
-/// Nothing resets it between writes but what the fields say. Copies are independent.
+/// How a netlist is written. Each model owns one; the option commands set it, and the writers read
+/// it.
+///
+/// A value type with public fields, whose copies are independent. Each field is described with the
+/// command that sets it and its default. A setting stays for all later writes of the model, apart
+/// from `writeHeader` and `macroNetlist`.
 class VESK_HDL_API HdlOptions {
 public:
-    /// What concerns VHDL.
+    /// The options for VHDL.
     struct VESK_HDL_API VhdlOption {
+        /// All fields at their defaults.
         VhdlOption();
+        /// An independent copy. Its argument is not const: that is part of the interface.
         VhdlOption(VhdlOption &other);
+        /// Frees the lists.
         ~VhdlOption();
+        /// Copies all fields.
         VhdlOption &operator=(VhdlOption &other);
 
-        bool suppressConfiguration; ///< no configuration unit; "SUPPRESS CONFIGURATION"; false
-        bool flattenBus;            ///< kept and read by no writer; "FLATTEN BUS"; false
-        bool useDefaultLibrary;     ///< the default library clauses; "USE DEFAULT LIBRARY"; true
-        StringArray libraries;      ///< of library clauses; "ADD LIBRARY" appends
-        StringArray useLibraries;   ///< of use clauses; "ADD USE LIBRARY" appends
-        bool useAttrType;       ///< attributes are declared with their type; "Use AttrType"; false
-        bool openPin;           ///< open input pins stay open; "Set Open Pin"; true
-        bool suppressComponent; ///< no component declarations; "SUPPRESS COMPONENT"; false
+        /// Whether the configuration unit is left out. "SUPPRESS CONFIGURATION"; false.
+        bool suppressConfiguration;
+        /// Kept for clients; no writer reads it. "FLATTEN BUS"; false.
+        bool flattenBus;
+        /// Whether the default library clauses are written. "USE DEFAULT LIBRARY"; true.
+        bool useDefaultLibrary;
+        /// The names of library clauses, in order. "ADD LIBRARY" appends; empty.
+        StringArray libraries;
+        /// The names of use clauses, in order. "ADD USE LIBRARY" appends; empty.
+        StringArray useLibraries;
+        /// Whether attributes are declared with their own types, not as strings. "Use AttrType";
+        /// false.
+        bool useAttrType;
+        /// Whether open input pins stay open; with false each gets a signal. "Set Open Pin"; true.
+        bool openPin;
+        /// Whether component declarations are left out. "SUPPRESS COMPONENT"; false.
+        bool suppressComponent;
     };
 
-    /// What concerns Verilog.
+    /// The options for Verilog.
     struct VESK_HDL_API VerilogOption {
-        /// The tool whose syntax attributes are written in.
+        /// The synthesis tool in whose syntax attributes are written.
         enum SynthesisType {
-            SYNTHESIS_QRT = 0,
-            SYNTHESIS_EXEMPLAR = 1,
-            SYNTHESIS_SYNPLICITY = 2,
-            SYNTHESIS_SYNOPSYS = 3,
-            SYNTHESIS_VERILOG2001 = 4,
-            SYNTHESIS_PRECISION = 5
+            SYNTHESIS_QRT = 0,         ///< "QRT"
+            SYNTHESIS_EXEMPLAR = 1,    ///< "EXEMPLAR"
+            SYNTHESIS_SYNPLICITY = 2,  ///< "SYNPLICITY"
+            SYNTHESIS_SYNOPSYS = 3,    ///< "SYNOPSYS"
+            SYNTHESIS_VERILOG2001 = 4, ///< "VERILOG2001": attributes are not written
+            SYNTHESIS_PRECISION = 5    ///< "PRECISION"
         };
-        enum CaseType { CASE_DEFAULT = 10, CASE_UPPER = 11, CASE_LOWER = 12 };
+        /// The case that names are written in.
+        enum CaseType {
+            CASE_DEFAULT = 10, ///< as they are
+            CASE_UPPER = 11,   ///< upper case
+            CASE_LOWER = 12    ///< lower case
+        };
 
+        /// All fields at their defaults.
         VerilogOption();
+        /// An independent copy. Its argument is not const: that is part of the interface.
         VerilogOption(VerilogOption &other);
+        /// Frees the list.
         ~VerilogOption();
+        /// Copies all fields.
         VerilogOption &operator=(VerilogOption &other);
 
-        /// Takes "QRT", "EXEMPLAR", "SYNPLICITY", "SYNOPSYS", "VERILOG2001" or "PRECISION" in any
-        /// case; any other word, null too, selects "QRT".
+        /// Sets the tool by its word, in any case. Any other word, also null, selects "QRT".
         void SetSynthesisType(char const *word);
-        /// "DEFSULT" (the spelling is part of the interface), "UPPERCASE" or "LOWERCASE" in any
-        /// case; any other word gives the default.
+        /// The case that a word means: "DEFSULT" (the spelling is part of the interface),
+        /// "UPPERCASE" or "LOWERCASE", in any case. Any other word, also null, gives CASE_DEFAULT.
         CaseType GetCaseType(char const *word) const;
-        /// Whether a statement's ";" stands before its attributes: true for all but "SYNPLICITY",
-        /// whose attributes stand inside the statement.
+        /// Whether the ";" of a statement comes before its attributes. True except for
+        /// "SYNPLICITY", whose attributes are inside the statement.
         bool IsSemiColonWrittenBeforeAttr() const;
 
-        SynthesisType synthesisType; ///< "SET SYNTHESIS"; "QRT"
-        CaseType signalCase;         ///< "UPPERCASE", "LOWERCASE"; names stay as they are
-        CaseType instanceCase;       ///< likewise
-        CaseType componentCase;      ///< likewise
-        StringArray includes;        ///< paths at the file's head; "ADD INCLUDE" appends
+        /// The tool. "SET SYNTHESIS"; SYNTHESIS_QRT.
+        SynthesisType synthesisType;
+        /// The case of signals. "UPPERCASE", "LOWERCASE"; CASE_DEFAULT. A write renames the signals
+        /// of the netlist for good, and so for the other two kinds.
+        CaseType signalCase;
+        /// The case of instances.
+        CaseType instanceCase;
+        /// The case of components.
+        CaseType componentCase;
+        /// The paths of include lines at the head of the file, in order. "ADD INCLUDE" appends;
+        /// empty.
+        StringArray includes;
     };
 
+    /// All fields at their defaults.
     HdlOptions();
+    /// An independent copy of all fields but macroNetlist. Its argument is not const: that is part
+    /// of the interface.
     HdlOptions(HdlOptions &other);
+    /// Frees the texts and lists.
     ~HdlOptions();
     /// Copies all fields but macroNetlist.
     HdlOptions &operator=(HdlOptions &other);
 
+    /// The options for VHDL.
     VhdlOption vhdlOption;
+    /// The options for Verilog.
     VerilogOption verilogOption;
-    bool writeHeader;                    ///< the file header; each write command sets it; true
-    Basis::StringBase<char> application; ///< header field; "Set Application"
-    Basis::StringBase<char> commandStr;  ///< header field; "Set Command"
-    Basis::StringBase<char> device;      ///< header field; "Set Device"
-    Basis::StringBase<char> purpose;     ///< header field; "Set Purpose"
-    Basis::StringBase<char> reference;   ///< header field; "Set Reference"
-    bool portOnePerLine;                 ///< ports go one a line; no command clears it; true
-    /// The netlist is a macro that takes INIT as a generic of its own. Each write computes it, also
-    /// through a const reference, and nobody copies it.
+    /// Whether a file begins with a header. Each write command sets it; true unless it has
+    /// "-NOHEADER".
+    bool writeHeader;
+    Basis::StringBase<char> application; ///< a field of the header; "Set Application"; empty
+    Basis::StringBase<char> commandStr;  ///< a field of the header; "Set Command"; empty
+    Basis::StringBase<char> device;      ///< a field of the header; "Set Device"; empty
+    Basis::StringBase<char> purpose;     ///< a field of the header; "Set Purpose"; empty
+    Basis::StringBase<char> reference;   ///< a field of the header; "Set Reference"; empty
+    /// Whether ports and port maps have one item on each line. "SET PORT ONEPERLINE"; true, and no
+    /// command clears it.
+    bool portOnePerLine;
+    /// Whether the netlist is a macro that takes INIT as a generic of its own. Each write computes
+    /// it, also through a const reference, and copies do not take it over; false.
     mutable bool macroNetlist;
-    /// The moment that the header shows, in UTC; without one it shows the local time of the write.
+    /// The moment that the header shows, in UTC, so that the text is the same each time. Without
+    /// one the header shows the local time of the write. No command sets it.
     std::optional<std::time_t> headerTime;
 };
 

@@ -3,8 +3,8 @@
 #include "vesk_hdl/text/Raise.h"
 
 /// The messages of the library, each with its kind of refusal. The texts are part of the interface:
-/// clients compare them. They are kept as they are where one text serves several kinds, and where
-/// they are misspelled or lack a full stop.
+/// clients compare them. So they stay as they are, also where one text serves several kinds, and
+/// where a text is misspelled or lacks a full stop.
 namespace Vesk_Hdl::Messages {
 
 using E = Exception;
@@ -23,16 +23,17 @@ inline constexpr Message PIN_TAKEN = {"Component \"%s\" already has pin \"%s\".\
 inline constexpr Message COMPONENT_NOT_FOUND = {"Component \"%s\" not found.\n",
                                                 E::COMPONENT_NOT_FOUND};
 
-// Connections. A missing instance is reported as a signal, and in one operation a missing pin with
-// its instance in front of it.
+// Connections. A missing instance is reported as a signal. One operation reports a missing pin
+// together with its instance, the other by its name alone.
 inline constexpr Message SIGNAL_NOT_FOUND = {"Signal \"%s\" not found.\n", E::SIGNAL_NOT_FOUND};
 inline constexpr Message CONNECTED_INSTANCE_NOT_FOUND = {"Signal \"%s\" not found.\n",
                                                          E::INSTANCE_NOT_FOUND};
 inline constexpr Message PIN_NOT_FOUND = {"Pin \"%s\" not found.\n", E::PIN_NOT_FOUND};
 inline constexpr Message INSTANCE_PIN_NOT_FOUND = {"Pin \"%s.%s\" not found.\n", E::PIN_NOT_FOUND};
 
-// Owners of attributes and comments. That of a pin is reported as the pin, and an instance whose
-// attribute gets an option as the attribute; the owner's own name follows as the subject.
+// Owners of attributes and comments. A missing owner of a pin is reported as the pin, and a missing
+// instance whose attribute gets an option as the attribute. The name of the owner itself is passed
+// last, which makes it the subject of the exception.
 inline constexpr Message COMPONENT_MISSING = {"\"%s\" not found.\n", E::COMPONENT_NOT_FOUND};
 inline constexpr Message INSTANCE_MISSING = {"\"%s\" not found.\n", E::INSTANCE_NOT_FOUND};
 inline constexpr Message SIGNAL_MISSING = {"\"%s\" not found.\n", E::SIGNAL_NOT_FOUND};

@@ -1,5 +1,9 @@
+// Attributes, their holder and their factory. What differs between the seven classes is how they
+// read and show their value; all else is written once.
+
 #include "vesk_hdl/netlist/Attribute.h"
 
+#include <cassert>
 #include <clocale>
 #include <cstdlib>
 #include <locale.h>
@@ -19,7 +23,7 @@ using Basis::StringBase;
 
 namespace {
 
-/// The words of an option; the index is the value of its two bits in the options.
+/// One of the two options: the words, whose index is the value of its two bits in the options.
 struct Option {
     unsigned int shift;
     Vocabulary::Words words;
@@ -40,18 +44,20 @@ bool SetOption(unsigned int &options, Option const &option, char const *word) {
     return true;
 }
 
-/// Numbers are read and written with a decimal point whatever the client's locale says.
-class PlainNumbers {
+/// The locale "C" for the calling thread as long as the object exists. `atof` and printf follow the
+/// locale of the client: under a German one they would read "2.5" as 2 and write a comma, which
+/// neither language allows.
+class CLocaleScope {
 public:
-    PlainNumbers() : before(uselocale(Plain())) {}
-    ~PlainNumbers() { uselocale(before); }
-    PlainNumbers(PlainNumbers const &) = delete;
-    PlainNumbers &operator=(PlainNumbers const &) = delete;
+    CLocaleScope() : before(uselocale(CLocale())) {}
+    ~CLocaleScope() { uselocale(before); }
+    CLocaleScope(CLocaleScope const &) = delete;
+    CLocaleScope &operator=(CLocaleScope const &) = delete;
 
 private:
-    static locale_t Plain() {
-        static locale_t const plain = newlocale(LC_ALL_MASK, "C", nullptr);
-        return plain;
+    static locale_t CLocale() {
+        static locale_t const locale = newlocale(LC_ALL_MASK, "C", nullptr);
+        return locale;
     }
     locale_t before;
 };
@@ -108,6 +114,9 @@ bool Attribute::IsSynDeclared() const { return GetOption(options, SYNTHESIS) == 
 void Attribute::SetValueType(ValueType type) { valueType = type; }
 Attribute::ValueType Attribute::GetStoredValueType() const { return valueType; }
 
+// The records of the seven classes. Each is apart from its class, so that all classes have the same
+// size and a record may change without a change of the binary interface.
+
 struct AttributeString::Record {
     StringBase<char> value;
 };
@@ -117,7 +126,7 @@ struct AttributeInteger::Record {
 struct AttributeFloat::Record {
     Record() = default;
     Record(Record const &other) : value(other.value) {}
-    /// The look of the number stays behind.
+    /// Required: width and precision are not assigned. The target keeps its own.
     Record &operator=(Record const &other) {
         value = other.value;
         return *this;
@@ -141,7 +150,8 @@ struct AttributeUser::Record {
     StringBase<char> userType;
 };
 
-// What is the same in the seven classes. Each line is one operation.
+// The operations that are the same in the seven classes. A macro makes them, since a template in
+// between would put another class into the hierarchy, which clients derive from and cast to.
 #define VESK_HDL_ATTRIBUTE_BODIES(Class, TYPE)                                                     \
     Class::Class(char const *name, char const *value) : Attribute(name), record(new Record) {      \
         SetValueType(TYPE);                                                                        \
@@ -184,15 +194,16 @@ StringBase<char> AttributeInteger::GetValueString() const {
 int AttributeInteger::GetValue() const { return record->value; }
 
 void AttributeFloat::SetValue(char const *text) {
+    // The number is shown with as many digits as it was typed with, before and after the point.
     StringArray const parts(text, ".", true, nullptr);
     auto const digits = [&parts](int part) { return static_cast<int>(parts.At(part).GetLength()); };
     record->precision = digits(1) == 0 ? 1 : digits(1);
     record->width = record->precision + (digits(0) == 0 ? 1 : digits(0)) + 1;
-    PlainNumbers const plain;
+    CLocaleScope const scope;
     record->value = std::atof(OrEmpty(text));
 }
 StringBase<char> AttributeFloat::GetValueString() const {
-    PlainNumbers const plain;
+    CLocaleScope const scope;
     return StringBase<char>::doFormat("%*.*f", record->width, record->precision, record->value);
 }
 double AttributeFloat::GetValue() const { return record->value; }
@@ -224,21 +235,25 @@ StringBase<char> AttributeUser::GetUserType() const { return record->userType; }
 
 AttributeVisitor::~AttributeVisitor() = default;
 
-/// The attributes, each with the name it was added under, by which it is found although a client
-/// may have renamed it since.
+/// The attributes, each with the name under which it was added: it is found by that name, also if a
+/// client renamed it since.
 ///
 /// Most holders have one attribute: it costs no memory beyond the record.
 struct AttributeHolder::Record {
-    static constexpr int MAX_SCAN = 8; ///< more attributes than that are found by a map
+    static constexpr int MAX_SCAN = 8; ///< up to this many are searched; more are found by a map
 
     ~Record() { DeleteAll(); }
 
     void Add(std::unique_ptr<Attribute> attribute) {
         StringBase<char> const name = attribute->GetNameRef();
-        if (attributes.IsEmpty())
+        if (attributes.IsEmpty()) {
+            assert(!further && "names are left of attributes that are deleted");
             firstName = name;
-        else
+        } else {
+            assert(GetFurtherNames().size() + 1 == static_cast<std::size_t>(attributes.GetSize()) &&
+                   "an attribute is found by the name of another one");
             GetFurtherNames().push_back(name);
+        }
         try {
             attributes.Add(attribute.get());
         } catch (...) {
@@ -253,7 +268,7 @@ struct AttributeHolder::Record {
             MakeMap();
     }
 
-    /// The newest of a name.
+    /// The newest attribute of a name: the search goes from the last to the first.
     Attribute *Find(char const *name) const {
         if (further && further->map)
             return further->map->Get(name);
@@ -308,13 +323,14 @@ AttributeHolder::AttributeHolder(AttributeHolder const &other) : AttributeHolder
 
 AttributeHolder::~AttributeHolder() { delete record.load(std::memory_order_relaxed); }
 
+/// Asking a holder for an iterator makes its record.
 AttributeHolder::Record &AttributeHolder::Own() const { return OwnLazily(record); }
 
 AttributeHolder &AttributeHolder::operator=(AttributeHolder const &other) {
     if (this == &other)
         return *this;
     if (Record *const own = record.load(std::memory_order_relaxed))
-        own->DeleteAll(); // the array stays: a client may still walk it
+        own->DeleteAll(); // the array itself stays: a client may have an iterator over it
     if (Record const *const others = other.record.load(std::memory_order_acquire))
         ForEach(others->attributes,
                 [this](Attribute *attribute) { AddAttr(attribute->CloneAttribute()); });
@@ -322,7 +338,7 @@ AttributeHolder &AttributeHolder::operator=(AttributeHolder const &other) {
 }
 
 void AttributeHolder::AddAttr(Attribute *attribute) {
-    std::unique_ptr<Attribute> held(attribute);
+    std::unique_ptr<Attribute> held(attribute); // deleted if making the record runs out of memory
     if (attribute)
         Own().Add(std::move(held));
 }

@@ -1,3 +1,5 @@
+// The class Bus. Widths and bounds are read from the name each time, see BusText.h.
+
 #include "vesk_hdl/netlist/BusRecord.h"
 #include "vesk_hdl/netlist/BusText.h"
 #include "vesk_hdl/netlist/Names.h"
@@ -11,7 +13,7 @@ Bus::Bus(char const *name) : Signal(name), record(std::make_unique<Record>()) {}
 
 Bus::~Bus() {
     if (record->cell)
-        record->cell->bus = nullptr;
+        record->cell->bus = nullptr; // parts that live on have no parent then
     ParentCell::Leave(record->cell);
 }
 
@@ -33,7 +35,7 @@ StringBase<char> Bus::GetDummySignalName() const {
     return Names::EndsInDummyTag(base.View()) ? base : GetDummyBusName(*this);
 }
 
-/// The cell for one more part.
+/// The cell, with one owner more: a part that is about to be made.
 ParentCell *Bus::ShareCell() {
     if (!record->cell)
         record->cell = new ParentCell(this);
@@ -60,7 +62,7 @@ bool Bus::IsBusName(StringBase<char> const &name) { return Names::IsBusName(name
 
 bool Bus::ParseBusName(StringBase<char> const &name, StringBase<char> &base, StringBase<char> &left,
                        StringBase<char> &right) {
-    StringBase<char> const whole(name); // an output may be the name itself
+    StringBase<char> const whole(name); // an output may be the name itself; `parts` refers to it
     Names::BusParts parts;
     if (!Names::SplitBusName(whole.View(), parts))
         return false;
@@ -77,7 +79,7 @@ bool Bus::ParseBusName(StringBase<char> const &name, StringBase<char> &base, int
         return false;
     left = Names::ToInt(parts.left);
     right = Names::ToInt(parts.right);
-    base = StringBase<char>(parts.base);
+    base = StringBase<char>(parts.base); // last: it may be the name itself
     return true;
 }
 
@@ -87,6 +89,8 @@ bool Bus::ParseBusName(StringBase<char> const &name, StringArray &bits) {
     if (!Names::IsBusName(name.View()) || !Names::SplitBusName(name.View(), parts) ||
         !Names::ParseBounds(name.View(), bounds))
         return false;
+    // The test is at the end: a bus over all int values has one bit more than the counter can
+    // count.
     for (unsigned int position = 0;; ++position) {
         bits.Add(Names::BitName(parts.base, bounds.IndexAt(position)));
         if (position == bounds.Distance())
@@ -94,6 +98,8 @@ bool Bus::ParseBusName(StringBase<char> const &name, StringArray &bits) {
     }
 }
 
+/// Computes what an expansion of the bus into its bits would show, since a bus of 2^31 bits is a
+/// few characters of input.
 StringBase<char> Bus::GetBusSliceName(StringBase<char> const &name, int start, int count) {
     Names::BusParts parts;
     Names::Bounds bounds;

@@ -1,4 +1,5 @@
-// The classes for parts of a bus: slices and indexes.
+// The classes for parts of a bus: slices and indices. Both find their bus through a cell that they
+// share with it, see BusRecord.h.
 
 #include <utility>
 
@@ -16,6 +17,8 @@ BusSlice::BusSlice(char const *name, Bus *parent)
         parent->AddBusSlice(this);
 }
 
+/// For a slice that takes the address of a widened bus. The list of slices already has that
+/// address.
 BusSlice::BusSlice(BusSlice &&made) noexcept
     : Signal(std::move(made)), cell(std::exchange(made.cell, nullptr)) {}
 
@@ -51,6 +54,7 @@ void BusSlice::GetIndex(StringBase<char> &left, StringBase<char> &right) const {
 bool BusSlice::IsDownTo() const { return RunsDown(*this); }
 StringBase<char> BusSlice::GetBaseName() const { return Object::GetBaseName(GetNameRef()); }
 
+/// A parent that is gone counts as one that does not count down.
 bool BusSlice::IsSameDirectionAsParent() const {
     Bus const *const parent = GetParent();
     return (parent && RunsDown(*parent)) == RunsDown(*this);
@@ -62,6 +66,7 @@ BusSlice *BusSlice::CreateDummySignal(Bus *parent) const {
 
 BusIndex::BusIndex(char const *name, Bus *parent)
     : Signal(name), cell(parent ? parent->ShareCell() : new ParentCell(nullptr)) {
+    // Without a parent the cell holds the polarity of the index itself.
     if (parent)
         parent->AddBusSlice(this);
 }

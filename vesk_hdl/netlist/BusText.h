@@ -3,11 +3,12 @@
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/Object.h"
 
-// What a bus and its parts read off their own names.
+// What buses, slices and bus pins read off their own names. No class stores a bound: a name may
+// change at any time, and a million signals would each carry two numbers that are seldom asked for.
 
 namespace Vesk_Hdl {
 
-/// The bounds; both as they were if the name is no bus name.
+/// The bounds as text; both are as they were if the name is no bus name.
 inline void GetBounds(Object const &bus, Basis::StringBase<char> &left,
                       Basis::StringBase<char> &right) {
     Names::BusParts parts;
@@ -17,12 +18,13 @@ inline void GetBounds(Object const &bus, Basis::StringBase<char> &left,
     }
 }
 
+/// Whether the left bound is the greater one; false if the name is no bus name.
 inline bool RunsDown(Object const &bus) {
     Names::Bounds bounds;
     return Names::ParseBounds(bus.GetNameRef().View(), bounds) && bounds.IsDownTo();
 }
 
-/// BASE_DUMMY(LEFT:RIGHT).
+/// BASE_DUMMY(LEFT:RIGHT), the bounds as they are typed: D(07:0) gives D_DUMMY(07:0).
 inline Basis::StringBase<char> GetDummyBusName(Object const &bus) {
     Basis::StringBase<char> left;
     Basis::StringBase<char> right;

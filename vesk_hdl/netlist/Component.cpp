@@ -1,3 +1,5 @@
+// The class Component. Its pins are found by the index of their family once they are many.
+
 #include "vesk_hdl/netlist/ComponentRecord.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/PinList.h"
@@ -6,6 +8,8 @@ namespace Vesk_Hdl {
 
 namespace {
 
+/// Required: the class follows from the name as it was typed. D[7:0] is no bus name before it is
+/// rewritten, and so becomes a pin of one bit that is called D(7:0).
 std::unique_ptr<Pin> MakePin(char const *name, Polarity const &polarity) {
     std::string_view const text(name ? name : "");
     std::string_view base;
@@ -35,6 +39,7 @@ void Component::AddPin(char const *name, Polarity const &polarity,
     std::unique_ptr<Pin> pin = MakePin(name, polarity);
     if (!defaultValue.IsEmpty())
         pin->SetDefaultValue(defaultValue);
+    // The pin shares the family before it is added: it reports changes from the beginning.
     pin->Enter(record->family);
     record->pins.Add(pin.get());
     pin.release();

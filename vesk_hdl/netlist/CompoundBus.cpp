@@ -1,3 +1,5 @@
+// The class CompoundBus and what is computed over its members.
+
 #include <limits>
 
 #include "vesk_hdl/netlist/CompoundWalk.h"
@@ -10,7 +12,8 @@ using Basis::StringBase;
 
 namespace {
 
-/// The dummy names of members, joined by commas: one in front of each member after a text.
+/// The dummy names of the members, joined by commas. A comma comes before a member only if the
+/// compound has some text already: required, and visible with members whose names are empty.
 class DummyName {
 public:
     void Enter(CompoundBus const &) {
@@ -32,7 +35,7 @@ private:
     }
 
     StringBase<char> name;
-    std::vector<unsigned int> begins; ///< of the text of each compound that is open
+    std::vector<unsigned int> begins; ///< where the text of each compound of the path begins
 };
 
 } // namespace
@@ -52,6 +55,7 @@ bool CompoundWidths::Find(CompoundBus const &compound, long long &width) const {
     return true;
 }
 
+/// Adds up from the inside out, without recursion: clients may nest compounds as deep as they like.
 int CompoundWidths::Get(CompoundBus const &compound) {
     constexpr long long MAX_WIDTH = std::numeric_limits<int>::max();
     long long width = 0;
@@ -95,7 +99,8 @@ CompoundBus::~CompoundBus() = default;
 
 Signal::SignalType CompoundBus::GetSignalType() const { return SIGNAL_COMPOUND_BUS; }
 
-/// Each compound once: setting a polarity again changes nothing.
+/// Visits each compound once, since setting a polarity again changes nothing. That also ends a
+/// circle.
 void CompoundBus::SetPortPolarity(Polarity const &polarity) {
     std::unordered_set<CompoundBus const *> found = {this};
     std::vector<CompoundBus const *> toDo = {this};
@@ -117,6 +122,7 @@ void CompoundBus::AcceptSignal(SignalVisitor &visitor) {
     visitor.VisitSignal(this);
 }
 
+/// Follows first members through compounds until one is no compound.
 Polarity CompoundBus::GetPortPolarity() const {
     std::unordered_set<Signal const *> found;
     CompoundBus const *compound = this;
@@ -126,7 +132,7 @@ Polarity CompoundBus::GetPortPolarity() const {
         if (!compound)
             return first ? first->GetPortPolarity() : Polarity();
         if (compound == this || !found.insert(compound).second)
-            return {}; // it leads itself
+            return {}; // a circle of first members has no polarity
     }
 }
 
@@ -162,7 +168,8 @@ void CompoundBus::ParseCompoundBusName(StringBase<char> const &name, StringArray
                                        bool expandBuses) {
     if (!IsCompoundBusName(name))
         return;
-    // Neither separator stands in a member, so that one walk gives what two nested ones would.
+    // No member holds either separator, so that one walk gives what a walk for each separator
+    // would.
     for (Basis_Range range = {1, 0}; Basis::NextToken(name.View(), range, ",\\", true);) {
         StringBase<char> const member(Basis::TokenIn(name.View(), range));
         if (!expandBuses || !Bus::ParseBusName(member, members))

@@ -8,13 +8,15 @@
 
 namespace Vesk_Hdl {
 
-/// A walk over the members of a compound and of the compounds in it, left to right. Clients can
-/// nest compounds as deep as they like, also in a circle: the walk needs no recursion, leaves out a
-/// compound that it is in the middle of, and once it met one enters no compound a second time. So
-/// it ends in any case, and without a circle it visits every member as often as it occurs.
+/// A walk over the members of a compound and of the compounds in it, left to right.
 ///
-/// `Visitor` has Enter(CompoundBus &), Leave(CompoundBus &), and Visit(Signal &) for what is no
-/// compound. Null members are skipped.
+/// Clients can nest compounds as deep as they like, also in a circle. The walk uses no recursion,
+/// so that depth costs no stack. It leaves out a compound that it is inside of; after it has met
+/// such a one it enters no compound a second time, since a circle could be entered on exponentially
+/// many ways. So it always ends, and without a circle it visits every member as often as it occurs.
+///
+/// `Visitor` has Enter(CompoundBus &), Leave(CompoundBus &), and Visit(Signal &) for members that
+/// are no compounds. Null members are skipped.
 template <class Visitor> class CompoundWalk {
 public:
     explicit CompoundWalk(Visitor &toVisit) : visitor(toVisit) {}
@@ -48,7 +50,7 @@ private:
         path.push_back({&compound, 0});
     }
     void EnterOrSkip(CompoundBus &top, CompoundBus &inner) {
-        if (entered.empty()) { // few compounds hold another one
+        if (entered.empty()) { // the sets are filled late, since few compounds hold another one
             open.insert(&top);
             entered.insert(&top);
         }
@@ -62,20 +64,21 @@ private:
 
     Visitor &visitor;
     std::vector<Step> path;
-    std::unordered_set<CompoundBus const *> open;    ///< those of the path
-    std::unordered_set<CompoundBus const *> entered; ///< at any time
-    bool isCircular = false;
+    std::unordered_set<CompoundBus const *> open;    ///< the compounds of the path
+    std::unordered_set<CompoundBus const *> entered; ///< all that were entered so far
+    bool isCircular = false;                         ///< a compound inside of itself was met
 };
 
+/// One such walk.
 template <class Visitor> void WalkCompound(CompoundBus &top, Visitor &visitor) {
     CompoundWalk<Visitor>(visitor).Walk(top);
 }
 
 /// The widths of compounds: the sums over their members. Each compound is added up once, however
-/// often it occurs; one that is in the middle of that adds nothing.
+/// often it occurs in others. One whose sum is being made, as in a circle, counts as 0.
 class CompoundWidths {
 public:
-    /// In bits, at most INT_MAX.
+    /// The width in bits, at most INT_MAX.
     int Get(CompoundBus const &compound);
 
 private:
@@ -85,10 +88,10 @@ private:
         long long width;
     };
 
-    /// The width if it is known or takes no other compound's.
+    /// The width, if it is known or needs that of no other compound. False otherwise.
     bool Find(CompoundBus const &compound, long long &width) const;
 
-    std::unordered_map<CompoundBus const *, long long> widths; ///< 0 for those in the middle
+    std::unordered_map<CompoundBus const *, long long> widths; ///< 0 while a sum is being made
 };
 
 } // namespace Vesk_Hdl

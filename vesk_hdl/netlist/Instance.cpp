@@ -1,3 +1,8 @@
+// The class Instance. A design has far more instances than anything else, so that their pins are
+// kept small: see docs/architecture.md, "Storage and its invariants", PinFamily and Object::Record.
+
+#include <cassert>
+
 #include "vesk_hdl/netlist/ComponentRecord.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/PinList.h"
@@ -10,10 +15,12 @@ using Basis::StringBase;
 
 namespace {
 
-/// For pins that were sorted by themselves: their places tell nothing about those of the family.
+/// Marks pins that were sorted by themselves: where a pin is does not follow from the index of the
+/// family.
 PinFamily::Order const OWN_ORDER;
 
-/// Appends the pins of one of two polarities that are on a port of another.
+/// Appends the pins that are on a port of polarity `portPolarity` and read or drive it: those of
+/// polarity `pinPolarity` and bidirectional ones.
 void FindOnPorts(PtrArray<Pin *> const &pins, Polarity::Value pinPolarity,
                  Polarity::Value portPolarity, PtrArray<Pin *> &found) {
     ForEach(pins, [&](Pin *pin) {
@@ -25,14 +32,14 @@ void FindOnPorts(PtrArray<Pin *> const &pins, Polarity::Value pinPolarity,
     });
 }
 
-/// Memory for a pin of any class.
+/// Memory for a pin of any class, so that all pins of an instance can be in one block.
 union PinRoom {
     ScalarPin scalar;
     BusPin bus;
     BusIndexPin index;
 };
 
-/// Pin::ClonePin into a room.
+/// Pin::ClonePin into given memory.
 Pin *ClonePinInto(PinRoom *room, Pin const &pin) {
     switch (pin.GetPinType()) {
     case Pin::PIN_BUS:
@@ -47,19 +54,19 @@ Pin *ClonePinInto(PinRoom *room, Pin const &pin) {
 
 } // namespace
 
-/// The record and the pins, each in a room of its own, are one memory block: an instance never gets
-/// or loses a pin.
+/// The record, the array of pins and the pins themselves are one block of memory: an instance never
+/// gets or loses a pin, and with a million instances three allocations each would be felt.
 struct Instance::Record {
     static Record *Make(Component *component);
     static void Delete(Record *record);
 
     Component *GetComponent() const { return family ? family->GetComponent() : nullptr; }
-    /// Where the family's index has a pin of that name, as FindPin takes it.
+    /// The place of the pin of that name, in the form that FindPin takes.
     int GetPlace(std::string_view name) const;
     void Sort();
 
-    PinFamilyPtr family; ///< of the component; none without a component
-    LentPtrArray<Pin *> pins;
+    PinFamilyPtr family;                     ///< that of the component; null without a component
+    LentPtrArray<Pin *> pins;                ///< not owned: Delete ends the pins
     PinFamily::Order const *order = nullptr; ///< by which the pins are sorted; null if they are not
 };
 
@@ -73,16 +80,19 @@ Instance::Record *Instance::Record::Make(Component *component) {
         made->family = component->record->family;
     if (count == 0)
         return made;
+    static_assert(sizeof(Record) % alignof(void *) == 0 && alignof(PinRoom) <= alignof(void *),
+                  "the array and the pins follow the record without a gap");
     void *const array = made + 1;
     made->pins.Borrow(array, count);
     auto *room = reinterpret_cast<PinRoom *>(static_cast<char *>(array) + arrayBytes);
     try {
         for (int i = 0; i < count; ++i)
             made->pins.Add(ClonePinInto(room++, *component->record->pins.GetAt(i)));
-    } catch (...) {
+    } catch (...) { // pins that were made until then are in the array
         Delete(made);
         throw;
     }
+    assert(made->pins.GetSize() == count && "the array would outgrow its part of the block");
     return made;
 }
 
@@ -97,6 +107,8 @@ int Instance::Record::GetPlace(std::string_view name) const {
     if (!family || order == &OWN_ORDER)
         return PinFamily::UNKNOWN;
     int const place = family->Find(name);
+    assert((!order || place < 0 || pins.GetSize() == static_cast<int>(order->places.size())) &&
+           "the order is one of another number of pins");
     if (place >= pins.GetSize())
         return PinFamily::ABSENT; // the component got the pin after this instance was made
     return place < 0 || !order ? place : order->places[static_cast<std::size_t>(place)];
@@ -104,7 +116,9 @@ int Instance::Record::GetPlace(std::string_view name) const {
 
 void Instance::Record::Sort() {
     if (order && order != &OWN_ORDER && !family->HasChanged())
-        return; // sorted already, and no two pins are equal
+        return; // sorted already; as no two pins are equal, another sort would change nothing
+    // The order of the family is one for pins as they were added. Pins in another order, and those
+    // of a family in which a pin changed, are sorted by themselves.
     PinFamily::Order const *const found = family && !order ? family->GetOrder(pins) : nullptr;
     if (found)
         for (auto const &[place, other] : found->swaps)

@@ -8,12 +8,15 @@
 
 namespace Vesk_Hdl {
 
-/// What a signal lists, pins and signals alike, for lists that are too long to be scanned: a net
-/// with a hundred thousand pins answers whether it lists one as fast as a net with two. Items may
-/// be gone; a signal may then lie where a pin was.
+/// The set of what a signal lists, pins and signals alike, for lists that are too long to be
+/// searched: a net with a hundred thousand pins then refuses a second connection of a pin as fast
+/// as one with two.
+///
+/// Items are compared by address and never looked into, since they may have been deleted. A signal
+/// may then be at the address of a former pin, so that the two kinds have different keys.
 class ListIndex {
 public:
-    static constexpr int MAX_SCAN = 32;
+    static constexpr int MAX_SCAN = 32; ///< a list up to this length is searched from its beginning
 
     template <class T> void AddAll(PtrArray<T> const &list) {
         for (int i = 0; i < list.GetSize(); ++i)
@@ -24,7 +27,7 @@ public:
     template <class T> bool Contains(T *item) const { return items.contains(KeyOf(item)); }
 
 private:
-    /// Objects lie at even addresses.
+    /// Objects are at even addresses, so that the lowest bit can tell signals from pins.
     static std::uintptr_t KeyOf(Pin *pin) { return reinterpret_cast<std::uintptr_t>(pin); }
     static std::uintptr_t KeyOf(Signal *signal) {
         return reinterpret_cast<std::uintptr_t>(signal) | 1;

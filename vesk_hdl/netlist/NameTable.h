@@ -8,8 +8,11 @@
 
 namespace Vesk_Hdl {
 
-/// The objects of one class that a netlist finds by name. As IStringPtrMap, but it takes a key that
-/// was rewritten and hashed before, since a command asks several tables for one name.
+/// The objects of one class that a netlist finds by name. It is like IStringPtrMap, but takes a key
+/// that is rewritten and hashed already: a command asks up to four tables for one name.
+///
+/// Invariant: an object that was removed is found under no name, neither its own nor a former one.
+/// See docs/architecture.md, "Storage and its invariants".
 template <class T> class NameTable {
 public:
     T *Get(Names::Key const &key) const {
@@ -17,22 +20,23 @@ public:
         return node ? static_cast<T *>(node->value) : nullptr;
     }
 
-    /// The table shares the name's text. The newer object of a name is the one that is found.
+    /// Files an object under a name, whose text the table shares. Of two objects of a name the
+    /// newer one is found.
     void Add(Basis::StringBase<char> const &name, T *object) {
         if (formerNames)
             formerNames->emplace(object, name);
         table.Put(name, object);
     }
 
-    /// The object is about to be destroyed, and nothing finds it any more: its former names are of
-    /// no use.
+    /// Drops the former names of an object that no lookup finds any more and that is about to be
+    /// deleted.
     void Forget(T const *object) {
         if (formerNames)
             formerNames->erase(object);
     }
 
-    /// Takes away what the name finds, and the object: if it was renamed since it was added, it is
-    /// still found by its former name, and nobody must find what is gone.
+    /// Removes what is filed under `name`, and `object` under whatever name it is filed: an object
+    /// that was renamed after it was added is filed under its former name.
     void Remove(Basis::StringBase<char> const &name, T const *object) {
         TextIndex::Node const *const found = table.Find(name.View());
         bool const isFiledSo = found && found->value == object;
@@ -60,7 +64,10 @@ private:
         formerNames = std::move(found);
     }
 
-    std::unique_ptr<FormerNames> formerNames; ///< null until somebody removes a renamed object
+    /// All names that objects were filed under; null until a renamed object is removed. From then
+    /// on it is kept up to date, as a search through the table for each removal would cost its
+    /// square.
+    std::unique_ptr<FormerNames> formerNames;
     TextIndex table{TextIndex::CASE_IGNORED};
 };
 

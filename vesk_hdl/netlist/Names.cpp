@@ -1,6 +1,10 @@
+// The grammar of names, as scanners: names are tested with each command, and a regular expression
+// would cost more than the rest of the command.
+
 #include "vesk_hdl/netlist/Names.h"
 
 #include <array>
+#include <cassert>
 #include <charconv>
 #include <climits>
 #include <limits>
@@ -19,6 +23,8 @@ namespace {
 
 constexpr std::string_view::size_type NPOS = std::string_view::npos;
 
+/// The characters that rewriting leaves as they are. A table, since every name of every command is
+/// tested.
 constexpr std::array<bool, 256> FindNormalCharacters() {
     std::array<bool, 256> isNormal = {};
     isNormal.fill(true);
@@ -28,6 +34,7 @@ constexpr std::array<bool, 256> FindNormalCharacters() {
 }
 constexpr std::array<bool, 256> IS_NORMAL = FindNormalCharacters();
 
+/// Whether a token is a member of a compound name.
 bool IsMember(std::string_view token) {
     std::string_view base;
     std::string_view index;
@@ -55,6 +62,7 @@ bool IsInteger(std::string_view text) {
 }
 
 int ToInt(std::string_view integer) {
+    assert(IsInteger(integer) && "the sign or the digits would be read wrongly");
     bool const negative = integer.starts_with('-');
     if (integer.starts_with('+'))
         integer.remove_prefix(1);
@@ -62,9 +70,11 @@ int ToInt(std::string_view integer) {
     auto const result = std::from_chars(integer.data(), integer.data() + integer.size(), value);
     if (result.ec == std::errc::result_out_of_range)
         value = negative ? LONG_MIN : LONG_MAX;
-    return static_cast<int>(value);
+    return static_cast<int>(value); // required: atoi converts like this
 }
 
+/// The first of each mark decides, and the tests come in the order that is cheapest for other
+/// names.
 bool IsBusName(std::string_view name) {
     if (!name.ends_with(')'))
         return false;
@@ -77,6 +87,8 @@ bool IsBusName(std::string_view name) {
            IsInteger(name.substr(colon + 1, close - colon - 1));
 }
 
+/// Token by token, where a run of separators counts as one: "A(:3:0)" is a bus name here and none
+/// for IsBusName.
 bool SplitBusName(std::string_view name, BusParts &parts) {
     Basis_Range range = {1, 0};
     if (!NextToken(name, range, "(", true))
@@ -98,7 +110,7 @@ bool SplitBusName(std::string_view name, BusParts &parts) {
 
 bool SplitBusIndexName(std::string_view name, std::string_view &base, std::string_view &index) {
     if (!name.ends_with(')'))
-        return false; // as the walk would find, for no token can then end in front of a last ")"
+        return false; // the walk below would find the same: no token ends before a last ")"
     Basis_Range range = {1, 0};
     if (!NextToken(name, range, "(", true))
         return false;
@@ -135,8 +147,8 @@ int BusWidth(std::string_view name) {
     Bounds bounds;
     if (!ParseBounds(name, bounds))
         return 0;
-    constexpr auto MOST = static_cast<unsigned int>(std::numeric_limits<int>::max());
-    return static_cast<int>(std::min(bounds.Distance(), MOST - 1) + 1);
+    constexpr auto MAX_WIDTH = static_cast<unsigned int>(std::numeric_limits<int>::max());
+    return static_cast<int>(std::min(bounds.Distance(), MAX_WIDTH - 1) + 1);
 }
 
 bool IsOneBitBus(std::string_view name) {
@@ -146,7 +158,7 @@ bool IsOneBitBus(std::string_view name) {
 
 namespace {
 
-/// The decimal text of a number.
+/// The decimal text of a number, without an allocation.
 struct Digits {
     explicit Digits(int number) : end(std::to_chars(text, text + sizeof text, number).ptr) {}
     std::string_view View() const { return {text, static_cast<std::size_t>(end - text)}; }
@@ -183,6 +195,8 @@ StringBase<char> BusName(std::string_view base, std::string_view left, std::stri
     return name;
 }
 
+/// Without a branch for each character: nearly all names are normal and have to be read to the end
+/// anyway.
 bool IsNormal(std::string_view name) {
     bool isNormal = true;
     for (char const c : name)
@@ -200,6 +214,8 @@ void Normalize(StringBase<char> &name) {
     name.ReplaceChars('-', ':');
 }
 
+/// Required: the order of the brackets is not tested, and a comma anywhere makes the name whole,
+/// since it is that of a compound.
 std::string_view BaseName(std::string_view name) {
     std::size_t const open = name.find('(');
     bool const ranged = open != NPOS && name.find(')') != NPOS && name.find(',') == NPOS;

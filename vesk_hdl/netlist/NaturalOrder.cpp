@@ -1,3 +1,5 @@
+// The order of names, and the heads that save most comparisons of whole names.
+
 #include "vesk_hdl/netlist/NaturalOrder.h"
 
 #include "vesk_hdl/text/basis/Ascii.h"
@@ -8,11 +10,14 @@ using namespace Basis::Ascii;
 
 namespace {
 
-/// The characters that are no digits, small letters as capitals, each by its place in the order:
-/// bytes as signed, the end of a text among them as 0. Above them stand runs of digits by length.
-constexpr unsigned int FIRST_RUN = 256 - 10 - 26;
-constexpr unsigned int LONGEST_RUN = 255 - FIRST_RUN;
+// A byte of a head is a character or the length of a run of digits. Characters that are no digits
+// have the lower values, small letters those of capitals, in their order: bytes as signed numbers,
+// the end of a text among them as 0. The values above are lengths of runs, since digits come after
+// other characters and longer runs after shorter ones.
+constexpr unsigned int FIRST_RUN = 256 - 10 - 26; ///< all bytes but digits and small letters
+constexpr unsigned int MAX_RUN = 255 - FIRST_RUN; ///< longer runs have this value as well
 
+/// The value of each character that is no digit.
 constexpr std::array<unsigned char, 256> MakeRanks() {
     std::array<unsigned char, 256> ranks = {};
     unsigned char rank = 0;
@@ -27,9 +32,10 @@ constexpr std::array<unsigned char, 256> MakeRanks() {
 }
 constexpr std::array<unsigned char, 256> RANKS = MakeRanks();
 
+/// The length of the run of digits at the beginning of a text, at most MAX_RUN.
 unsigned int RunLength(char const *text) {
     unsigned int length = 0;
-    while (length < LONGEST_RUN && IsDigit(text[length]))
+    while (length < MAX_RUN && IsDigit(text[length]))
         ++length;
     return length;
 }
@@ -42,7 +48,7 @@ NaturalHead HeadOf(char const *name) {
     for (std::size_t i = 0; more && i < bytes.size();) {
         if (unsigned int run = RunLength(name)) {
             bytes[i++] = static_cast<unsigned char>(FIRST_RUN + run);
-            more = run < LONGEST_RUN; // of the longest runs no byte tells the length
+            more = run < MAX_RUN; // runs of that length may differ in length: the head ends here
             for (; more && run > 0 && i < bytes.size(); --run)
                 bytes[i++] = static_cast<unsigned char>(*name++);
         } else {
@@ -52,7 +58,7 @@ NaturalHead HeadOf(char const *name) {
     }
     NaturalHead head = {};
     for (std::size_t i = 0; i < bytes.size(); ++i)
-        head[i / 8] = head[i / 8] << 8 | bytes[i];
+        head[i / 8] = head[i / 8] << 8 | bytes[i]; // the first byte weighs most, as in a text
     return head;
 }
 
@@ -69,7 +75,8 @@ int NaturalCompare(char const *a, char const *b) {
         return static_cast<signed char>(ToUpper(*a)) < static_cast<signed char>(ToUpper(*b)) ? -1
                                                                                              : 1;
 
-    // Runs of equal length compare by their first difference, which is where they stand now.
+    // Required: both are in a run of digits that began alike. If the rests are of equal length, the
+    // digits at this first difference decide.
     int const difference = *a < *b ? -1 : 1;
     while (IsDigit(*a) && IsDigit(*b)) {
         ++a;

@@ -11,24 +11,27 @@
 
 namespace Vesk_Hdl {
 
-/// The one order of names: case is ignored and runs of digits compare as numbers, so that A2 comes
-/// before A10. -1, 0 or 1. A digit comes after any other character in its place; of two runs of
-/// digits the longer one is greater, leading zeros counted.
+/// The one order of names in all written text: case is ignored, and runs of digits compare as
+/// numbers, so that A2 comes before A10. The result is -1, 0 or 1. A digit comes after any other
+/// character in its place. Of two runs of digits the longer one is greater, leading zeros counted:
+/// A007 comes after A7.
 int NaturalCompare(char const *a, char const *b);
 
-/// The beginning of a name as numbers in that order: where two heads differ they compare as the
-/// names do, where they are equal NaturalCompare decides. A sort so seldom touches the names, which
-/// lie all over the memory.
+/// The beginning of a name as two numbers in that order. Heads that differ compare as the names do;
+/// if they are equal, NaturalCompare decides. So a sort seldom reads the names, which are scattered
+/// over the memory.
 using NaturalHead = std::array<std::uint64_t, 2>;
+/// The head of a name.
 NaturalHead HeadOf(char const *name);
 
-/// Sorts objects by polarity, then by name. `polarityOf` gives an object's polarity; objects that
-/// have none sort by name alone when it always gives the same.
+/// Sorts objects by polarity, then by name. `polarityOf` returns the polarity of an object; for
+/// objects without one it returns the same for all, which then sort by name alone.
 ///
-/// Where no two objects are equal there is only one order, and the way to it is free. Names mostly
-/// come in order, or as a few series that take turns (a1, d1(7:0), a2, d2(7:0), ...), so those are
-/// merged, in a time that grows with the number of objects alone. The order of equal objects is
-/// what the steps of IntroSort make of it.
+/// If no two objects are equal only one order is possible, and any way may lead there. Names mostly
+/// come in ascending order for each polarity, or in a few series that take turns (a1, d1(7:0), a2,
+/// d2(7:0), ...). So the polarities are separated or the series merged, in a time that is linear in
+/// the number of objects. Everything else is sorted by IntroSort, whose order of equal items is
+/// required.
 template <class T, class PolarityOf> class NaturalSort {
 public:
     static void Sort(PtrArray<T> &array, PolarityOf polarityOf) {
@@ -66,7 +69,8 @@ private:
         return item ? item->GetNameRef().GetText() : "";
     }
 
-    /// False, and all as it was, unless the names of each polarity ascend.
+    /// Separates the polarities if the names of each ascend. Otherwise it returns false and changes
+    /// nothing.
     bool Part() {
         char const *last[PARTS] = {};
         int highest = 0;
@@ -87,7 +91,8 @@ private:
         return true;
     }
 
-    /// The first part, mostly by far the largest, moves up in its place.
+    /// The signals without a polarity, by far the largest part in most designs, move within the
+    /// array; only the others are copied.
     void MoveParts() {
         std::vector<T> others[PARTS];
         int size = 0;
@@ -193,6 +198,7 @@ private:
     std::vector<Key> keys;
 };
 
+/// One such sort.
 template <class T, class PolarityOf> void SortNaturally(PtrArray<T> &array, PolarityOf polarityOf) {
     NaturalSort<T, PolarityOf>::Sort(array, polarityOf);
 }

@@ -1,3 +1,6 @@
+// The contents of a netlist. docs/architecture.md, "Who owns what", says who points at what it
+// holds.
+
 #include "vesk_hdl/netlist/Netlist.h"
 
 #include "vesk_hdl/netlist/As.h"
@@ -16,7 +19,7 @@ namespace {
 
 int Length(StringBase<char> const &name) { return static_cast<int>(name.GetLength()); }
 
-/// Enters an object whole or, when memory runs out, not at all; then it is deleted.
+/// Adds an object to both array and table. If memory runs out, it is in neither and is deleted.
 template <class T> void File(ObjectArray<T> &array, NameTable<T> &map, T *object) {
     std::unique_ptr<T> held(object);
     array.Add(object);
@@ -29,14 +32,15 @@ template <class T> void File(ObjectArray<T> &array, NameTable<T> &map, T *object
     held.release();
 }
 
-/// False if the object is not in the array.
+/// Removes an object from both. False if it was not in the array; the table is asked all the same,
+/// since whatever it finds by that name must not be found any more.
 template <class T> bool Unfile(ObjectArray<T> &array, NameTable<T> &map, T *object) {
     bool const wasThere = array.Remove(object);
     map.Remove(object->GetNameRef(), object);
     return wasThere;
 }
 
-/// The longest name of the signals that pass a test, a bus counted by its base name.
+/// The longest name of the signals that pass a test, where a bus counts by its base name.
 template <class Test> int LongestName(Iterator<Signal *> &signals, Test test) {
     int longest = 0;
     for (signals.Rewind(); signals.HasMore(); signals.Advance()) {
@@ -52,6 +56,7 @@ template <class Test> int LongestName(Iterator<Signal *> &signals, Test test) {
 } // namespace
 
 Netlist::Netlist(char const *name) : record(std::make_unique<Record>()) {
+    // Required: another default than that of Model::SetName.
     SetNameText(name ? name : "hdlNetlist");
     SetObjectType(OBJECT_NETLIST);
 }
@@ -73,11 +78,13 @@ void Netlist::Add(Signal *signal) {
     record->signals.Add(signal);
     try {
         record->signalMap.Add(name, signal);
-        // Last: a bus that a wider one replaces is found until then.
+        // Last: until here a lookup still finds the bus that a wider one of the same base name
+        // replaces.
         if (auto const *const bus = As<Bus>(signal))
             record->busMap.Add(bus->GetBaseName(), signal);
     } catch (...) {
         record->signals.RemoveTail();
+        // The table may not have got that far, or may find an older signal of the name.
         if (record->signalMap.Get(Names::Key(name.View())) == signal)
             record->signalMap.Remove(name, signal);
         if (As<BusSlice>(signal) || As<BusIndex>(signal))
@@ -102,8 +109,8 @@ void Netlist::Remove(Signal *signal) {
     if (!signal)
         return;
     if (!Unfile(record->signals, record->signalMap, signal))
-        record->widenedSlices.Remove(signal); // which a client found in its bus
-    signal->DisconnectAll();
+        record->widenedSlices.Remove(signal); // a client can find one through its bus
+    signal->DisconnectAll();                  // its pins must not point at a signal that is gone
     if (auto const *const bus = As<Bus>(signal))
         record->busMap.Remove(bus->GetBaseName(), signal);
     delete signal;
@@ -133,6 +140,7 @@ Component *Netlist::GetComponent(char const *name) const {
     return record->componentMap.Get(Names::Key(name));
 }
 
+/// The cast is safe: only objects of class Bus are filed by base name, see Add.
 Bus *Netlist::GetParentBus(char const *name) const {
     Names::NormalName const whole(name);
     return static_cast<Bus *>(record->busMap.Get(Names::Key(Names::BaseName(whole.View()))));
@@ -164,6 +172,7 @@ void Netlist::GetInstances(char const *componentName, PtrArray<Instance *> &foun
     GetInstances(GetComponent(componentName), found);
 }
 
+/// Components keep the order of their pins: it is that of their declaration in the text.
 void Netlist::SortNetlist() {
     auto const noPolarity = [](Object const *) { return Polarity(); };
     SortNaturally(record->signals.GetForSort(),
@@ -205,7 +214,7 @@ int Netlist::GetLongestAttrName(Netlist const *netlist) {
         if (signal->GetPortPolarity() == Polarity::INVALID && signal->IsNeededToDeclared())
             GetLongestAttrName(signal, longest);
     });
-    Component const *last = nullptr; // a look at the same one again tells nothing new
+    Component const *last = nullptr; // instances of one component are mostly neighbours
     ForEachAhead(netlist->GetInstances(), [&longest, &last](Instance const *instance) {
         Component const *const component = instance->GetComponent();
         if (component != last)

@@ -1,3 +1,6 @@
+// What the library does with a netlist and clients cannot. docs/architecture.md, "Widening",
+// explains the replacement of a bus.
+
 #include "vesk_hdl/netlist/NetlistEdit.h"
 
 #include <cassert>
@@ -31,7 +34,9 @@ Bus *NetlistEdit::FindBus(Names::Key const &key) const {
 
 Bus *NetlistEdit::Widen(Bus *bus, char const *name) {
     Netlist::Record &record = *netlist.record;
-    // What needs memory comes first, so that a failure leaves the netlist as it was.
+    // All that needs memory comes first, so that a failure leaves the netlist as it was. The bus
+    // becomes the first part of itself here, since the slice at its address will be the first part
+    // of the new bus.
     std::unique_ptr<Bus> wide = std::make_unique<Bus>(name);
     std::unique_ptr<BusSlice> made(new BusSlice(bus->GetNameRef(), nullptr));
     ParentCell *const cell = bus->ShareCell();
@@ -47,14 +52,17 @@ Bus *NetlistEdit::Widen(Bus *bus, char const *name) {
         bus->RemoveBusSlice(bus);
         throw;
     }
+    // The table of buses finds the new bus by the common base name already.
+    assert(record.busMap.Get(Names::Key(Names::BaseName(result->GetNameRef().View()))) == result &&
+           "the new bus is not found by its base name");
     record.busMap.Forget(bus);
     record.signals.Remove(bus);
     record.signalMap.Remove(bus->GetNameRef(), bus);
     result->record->busSlices.ExchangeElements(bus->record->busSlices);
     result->record->cell = std::exchange(bus->record->cell, nullptr);
-    cell->bus = result;
+    cell->bus = result; // all parts, old and new, now find the new bus
 
-    bool const isPlain = typeid(*bus) == typeid(Bus); // not a class that a client derived
+    bool const isPlain = typeid(*bus) == typeid(Bus); // a class that a client derived may be larger
     BusSlice *const slice =
         isPlain ? PutSliceInPlaceOf(bus, *made) : RepointToSlice(bus, std::move(made));
     if (Signal::Record *const own = slice->Find())
@@ -67,11 +75,13 @@ void NetlistEdit::TakeLists(Bus &bus, BusSlice &made) {
     Signal::Record *const lists = bus.Signal::record.exchange(nullptr);
     if (lists)
         lists->constantValue = BitVectorValue();
-    assert(!made.Find());
+    assert(!made.Find() && "a new slice is connected to nothing");
     made.Signal::record = lists;
 }
 
-/// A bus and a slice are of one size: a pointer at the one is a pointer at the other.
+/// Ends the bus and makes the slice at its address. Both classes have the same size, and a signal
+/// is reached through its base class, so that every pointer to the bus is then a pointer to the
+/// slice. Nothing has to be searched, however many signals, compounds and pins point there.
 BusSlice *NetlistEdit::PutSliceInPlaceOf(Bus *bus, BusSlice &made) {
     static_assert(sizeof(Bus) == sizeof(BusSlice) && alignof(Bus) == alignof(BusSlice));
     TakeLists(*bus, made);
@@ -79,8 +89,9 @@ BusSlice *NetlistEdit::PutSliceInPlaceOf(Bus *bus, BusSlice &made) {
     return new (static_cast<void *>(bus)) BusSlice(std::move(made));
 }
 
-/// A client's class may have any size: whatever points at the bus from inside the netlist is looked
-/// for. Nothing but the bus itself is looked into that may be gone.
+/// For a bus of a client's class, which may have any size: all that points at the bus from inside
+/// the netlist is searched and made to point at the slice. Listed signals are compared by address
+/// only, since they may be gone.
 BusSlice *NetlistEdit::RepointToSlice(Bus *bus, std::unique_ptr<BusSlice> made) {
     Netlist::Record &record = *netlist.record;
     BusSlice *const slice = made.release();

@@ -6,12 +6,16 @@
 
 namespace Vesk_Hdl {
 
-/// Members are destroyed in reverse order: the maps first, then the signals, the instances whose
-/// pins point at them, and last the components that the instances point at.
+/// The contents of a netlist. The arrays own the objects and give the order of all output; the
+/// tables only find them.
+///
+/// Members end in reverse order: the tables, then the signals, then the instances whose pins point
+/// at signals, and last the components that instances point at. No destructor follows these
+/// pointers.
 struct Netlist::Record {
     ObjectArray<Component> components;
     ObjectArray<Instance> instances;
-    OwnPtrArray<Signal *> widenedSlices; ///< slices in the place of buses that a wider one replaced
+    OwnPtrArray<Signal *> widenedSlices; ///< slices at the addresses of buses that were widened
     ObjectArray<Signal> signals;
     NameTable<Component> componentMap;
     NameTable<Instance> instanceMap;

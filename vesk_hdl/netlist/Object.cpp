@@ -1,3 +1,6 @@
+// Objects and their records. Copies share a record until one of them changes: see
+// docs/architecture.md, "Storage and its invariants".
+
 #include "vesk_hdl/netlist/Object.h"
 
 #include <cassert>
@@ -15,6 +18,7 @@ using Basis::StringBase;
 
 namespace {
 
+/// A rewritten copy of a name.
 StringBase<char> NormalText(char const *name) {
     StringBase<char> text(name);
     Names::Normalize(text);
@@ -23,19 +27,22 @@ StringBase<char> NormalText(char const *name) {
 
 } // namespace
 
-/// That of all objects without a name. It is never counted or freed.
+/// The record of all objects without a name. It is never counted, changed or freed, so that an
+/// object costs nothing until it gets a name.
 Object::Record *Object::NoRecord() {
     static Record none;
     return &none;
 }
 
-/// A record with that name, all else as in a model or as the class begins.
+/// A record of class `Made` in the block of its name. The arguments are those of its constructor: a
+/// record to copy all but the name from, or initial values.
 template <class Made, class... Model>
 Object::Record *Object::MakeRecord(std::string_view name, Model &&...model) {
     void *room = nullptr;
     StringBase<char> text = StringBase<char>::MakeWithRoom(name, sizeof(Made), room);
+    static_assert(alignof(Made) <= alignof(void *), "the room is aligned as a pointer is");
     auto *const made = new (room) Made(std::forward<Model>(model)...);
-    made->name = std::move(text);
+    made->name = std::move(text); // the record now owns the block that it is in, see Release
     return made;
 }
 
@@ -44,6 +51,7 @@ void Object::Replace(Record *now) {
     record = now;
 }
 
+/// Gives this object a record of its own with that name and otherwise the present contents.
 void Object::Rename(std::string_view name) {
     switch (record->content) {
     case Record::NAME:
@@ -59,14 +67,14 @@ void Object::Rename(std::string_view name) {
     }
 }
 
-/// The record for writing anything but the name: this object's alone.
+/// The record for changing anything but the name. A record that copies share is copied first.
 Object::Record &Object::Own() {
     if (record == NoRecord() || record->owners.load(std::memory_order_acquire) != 1)
         Rename(record->name.View());
     return *record;
 }
 
-/// The comment for writing: this object's alone.
+/// The comment for changing it. A record without room for one is replaced by one that has it.
 StringBase<char> &Object::OwnComment() {
     if (record->content == Record::NAME)
         Replace(MakeRecord<CommentRecord>(record->name.View(), std::as_const(*record)));
@@ -106,7 +114,8 @@ void Object::Join() {
 void Object::Release() {
     if (record == NoRecord() || !Basis::Counting::Leave(record->owners))
         return;
-    StringBase<char> const block = std::move(record->name); // the record lies in it
+    // The record is in the block of its name, which is freed last, at the end of this function.
+    StringBase<char> const block = std::move(record->name);
     switch (record->content) {
     case Record::NAME:
         return record->~Record();
@@ -119,8 +128,8 @@ void Object::Release() {
     }
 }
 
-/// Assigns name, comment and kind, and nothing of what makes a pin a pin. In most objects that is
-/// the whole record.
+/// Assigns name, comment and kind, but not the polarity or default value of a pin, nor the counter
+/// of a netlist. If neither object has these, the whole record is shared.
 Object &Object::operator=(Object const &other) {
     if (record == other.record)
         return *this;

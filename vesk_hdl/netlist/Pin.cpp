@@ -1,3 +1,5 @@
+// Pins of all three classes.
+
 #include "vesk_hdl/netlist/Pin.h"
 
 #include "vesk_hdl/netlist/Names.h"
@@ -5,6 +7,9 @@
 #include "vesk_hdl/netlist/storage/ObjectRecord.h"
 
 namespace Vesk_Hdl {
+
+// All but the signal is in the record that a pin shares with its copies: the pin of an instance is
+// a copy of the component's and mostly stays one.
 
 using Basis::StringBase;
 
@@ -29,13 +34,15 @@ Pin &Pin::operator=(Pin const &other) {
     return *this;
 }
 
-/// What a pin points at that is on no signal but was on one. It is compared and never looked into.
+/// The mark of a pin that is on no signal but was on one: some signal may still list it. A pin that
+/// is null was never on one, and Signal::Connect need not search. The address is compared and never
+/// read.
 Signal *Pin::Former() {
     alignas(Signal) static char place;
     return reinterpret_cast<Signal *>(&place);
 }
 
-/// The signal is not looked into: it may be one that a copied pin was on before it was removed.
+/// The signal is stored and not read: a copied pin may name one that was removed since.
 void Pin::Connect(Signal *newSignal) {
     if (newSignal)
         signal = newSignal;
@@ -53,7 +60,7 @@ void Pin::Enter(PinFamilyPtr const &family) { OwnPinRecord().family = family; }
 Signal *Pin::GetSignal() const { return signal == Former() ? nullptr : signal; }
 
 void Pin::SetPolarity(Polarity const &polarity) {
-    GetPinRecord().NoteChange();
+    GetPinRecord().NoteChange(); // the sorted orders of the family are by polarity
     OwnPinRecord().polarity = polarity.GetValue();
 }
 

@@ -1,3 +1,5 @@
+// The class ScalarSignal.
+
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/Signal.h"
 
@@ -5,6 +7,7 @@ namespace Vesk_Hdl {
 
 using Basis::StringBase;
 
+/// Only ports have one: most scalar signals of a design are inner nets.
 struct ScalarSignal::Record {
     Polarity portPolarity;
 };
@@ -33,6 +36,8 @@ int ScalarSignal::GetWidth() const { return 1; }
 bool ScalarSignal::IsPort() const { return GetPortPolarity() != Polarity::INVALID; }
 bool ScalarSignal::IsNeededToDeclared() const { return true; }
 
+/// Required: a name that ends in the mark gets no second one. A dummy that becomes a port again
+/// then has the name of its own dummy.
 StringBase<char> ScalarSignal::GetDummySignalName() const {
     StringBase<char> name = GetNameRef();
     if (!Names::EndsInDummyTag(name.View()))

@@ -1,3 +1,5 @@
+// What all classes of signals share: connections, the constant and the names to be declared.
+
 #include "vesk_hdl/netlist/Signal.h"
 
 #include "vesk_hdl/netlist/As.h"
@@ -17,12 +19,14 @@ Object::ObjectType Signal::GetObjectType() const { return GetStoredObjectType();
 void Signal::AcceptObject(ObjectVisitor &visitor) { visitor.VisitSignal(this); }
 void Signal::SetName(char const *name) { Object::SetName(name); }
 
-/// For a slice that takes the place of a bus: with the name and the lists of another object.
+/// For a slice that takes the address of a bus: it gets the name and the lists of `made`.
 Signal::Signal(Signal &&made) noexcept : Object(made), record(made.record.exchange(nullptr)) {}
 
 Signal::Record *Signal::Find() const { return record.load(std::memory_order_acquire); }
 Signal::Record &Signal::Own() const { return OwnLazily(record); }
 
+/// A pin that was never on a signal is not searched: with nets of a hundred thousand pins that is
+/// nearly every connection.
 void Signal::Connect(Pin *pin) {
     if (!pin)
         return;
@@ -72,6 +76,7 @@ void Signal::CloneConnection(Signal *source) {
     Record &own = Own();
     ForEach(others->pins, [&own](Pin *pin) { own.Append(own.pins, pin); });
     ForEach(others->signals, [&own](Signal *signal) { own.Append(own.signals, signal); });
+    // This clears the signal of all pins, so that they are put on this signal after it.
     source->DisconnectAll();
     ForEach(own.pins, [this](Pin *pin) { pin->SetListedSignal(this); });
 }

@@ -9,15 +9,20 @@
 
 namespace Vesk_Hdl {
 
-/// Neither list holds an item twice: Connect looks first, and CloneConnection fills empty lists.
-/// The items are compared and not looked into, but by operations that say so: they may be gone.
+/// The two lists of a signal and its constant. See docs/architecture.md, "Storage and its
+/// invariants".
 ///
-/// Three pins find room here: one that drives and two that read, as most nets of a design have.
+/// Neither list holds an item twice: Connect searches first, and CloneConnection fills empty lists.
+/// Items are compared by address and looked into only by operations that say so, since they may be
+/// gone.
+///
+/// There is room for three pins in the record: one that drives and two that read, as most nets
+/// have.
 struct Signal::Record {
     BitVectorValue constantValue;
     InlinePtrArray<Pin *, 3> pins;
     PtrArray<Signal *> signals;
-    std::unique_ptr<ListIndex> index; ///< of both lists, once one of them was long when searched
+    std::unique_ptr<ListIndex> index; ///< of both lists; made when a long one is searched
 
     template <class T> bool Contains(PtrArray<T *> const &list, T *item) {
         if (list.GetSize() <= ListIndex::MAX_SCAN)
@@ -36,7 +41,8 @@ struct Signal::Record {
             index->Add(item);
     }
 
-    /// Looks from both ends: clients mostly take away what came first or last.
+    /// Removes an item, if it is listed. It searches from both ends, since clients mostly remove
+    /// what came first or last: removing all items in either order then takes linear time.
     template <class T> void Remove(PtrArray<T *> &list, T *item) {
         if (index && !index->Remove(item))
             return;

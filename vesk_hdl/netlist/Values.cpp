@@ -1,3 +1,5 @@
+// Directions and constants.
+
 #include "vesk_hdl/netlist/Values.h"
 
 #include <cstdlib>
@@ -18,6 +20,7 @@ Polarity::Value Polarity::GetValue(char const *text) {
     std::size_t const length = text ? std::strlen(text) : 0;
     if (length == 0)
         return INVALID;
+    // The names begin with different letters, so that no text is the beginning of two.
     for (int i = INPUT; i <= BIDIRECTIONAL; ++i)
         if (Basis::strnicmp(Vocabulary::POLARITIES[i], text, length) == 0)
             return static_cast<Value>(i);
@@ -29,9 +32,12 @@ bool Polarity::IsValidValue(Value value) {
 }
 
 StringBase<char> Polarity::GetValueName() const {
+    // Required: anything that is no direction is called "Output", also INVALID.
     return IsValidValue(value) ? Vocabulary::POLARITIES[value] : "Output";
 }
 
+/// Made for a value that is not in its default state: every signal and pin has a value, and few are
+/// set.
 struct BitVectorValue::Record {
     StringBase<char> value;
     int base = 2;
@@ -65,7 +71,7 @@ void BitVectorValue::SetValue(char const *text) {
         return;
     record = new Record;
     StringArray const parts(whole, ":", true, nullptr);
-    if (parts.GetSize() < 3) {
+    if (parts.GetSize() < 3) { // a text that is not of the form is no error: it is the digits
         record->value = whole;
         return;
     }
@@ -92,7 +98,7 @@ int BitVectorValue::ConvertToBase(char const *text) const {
     case 'h':
     case 'H':
         return 16;
-    default:
+    default: // required: any other word, not only "b"
         return 2;
     }
 }

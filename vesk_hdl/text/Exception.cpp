@@ -1,3 +1,5 @@
+// The exception of the library, and the one function that throws it.
+
 #include "vesk_hdl/text/Exception.h"
 
 #include <string>
@@ -15,6 +17,7 @@ Exception::~Exception() = default;
 
 void Raise(char const *sourceFile, int line, Message const &message,
            std::initializer_list<char const *> names) {
+    // Not printf: a name may hold a "%", and names may be longer than any buffer.
     constexpr std::string_view PLACE = "%s";
     std::string description;
     std::string_view rest = message.text;
@@ -23,7 +26,7 @@ void Raise(char const *sourceFile, int line, Message const &message,
         subject = Basis::OrEmpty(name);
         std::size_t const place = rest.find(PLACE);
         if (place == rest.npos)
-            continue;
+            continue; // a subject that the text does not show
         description.append(rest.substr(0, place)).append(subject);
         rest.remove_prefix(place + PLACE.size());
     }

@@ -4,15 +4,20 @@
 
 namespace Vesk_Hdl {
 
-/// The one exception that the library throws. Its description is the message, ending in a line
-/// feed, with nothing in front. Module tag "DesignEntry". It adds nothing to its base.
+/// The one exception that the library throws, apart from std::bad_alloc and std::length_error when
+/// memory or a count runs out.
+///
+/// Its description is the message of a refusal, which ends in a line feed and has no prefix. The
+/// module is "DesignEntry". The class adds no data to its base: a Basis::Exception that is caught
+/// by reference is the same object.
 class VESK_HDL_API Exception : public Basis::Exception {
 public:
-    /// What getKind() says of an exception of the library. Several kinds share a message: one text
-    /// serves a missing signal and a missing instance of a connection. getSubject() is the name or
-    /// word given for each kind, as the caller spelled it.
+    /// What getKind() returns for an exception of the library, so that a client need not compare
+    /// messages: several kinds share one message, such as that of a missing signal and of a missing
+    /// instance in a connection. Beside each kind is what getSubject() returns, as the caller
+    /// spelled it.
     enum Kind : int {
-        OTHER = 0,              ///< not made by the library; no subject
+        OTHER = 0,              ///< not thrown by the library; no subject
         MISSING_MODEL,          ///< no subject
         UNKNOWN_COMMAND,        ///< no subject
         INVALID_ARGUMENTS,      ///< the keyword as it was registered
@@ -31,9 +36,14 @@ public:
         INVALID_SYNTHESIS_WORD  ///< the word for the synthesis option
     };
 
+    /// Copies description, place, kind and subject. A client command builds a Basis::Exception and
+    /// throws an exception of this class made from it, which the library treats as a refusal.
     Exception(Basis::Exception const &other);
+    /// An independent copy. Each level of the library that cleans up throws such a copy on.
     Exception(Exception const &other);
+    /// Copies everything. Assigning an exception to itself changes nothing.
     Exception &operator=(Exception const &other);
+    /// Frees the texts.
     ~Exception() override;
 };
 

@@ -1,3 +1,6 @@
+// Folds the lines of text files. Where a line may break, and that a fold is decided for each piece,
+// is part of the required text: see docs/architecture.md, "The road of a write".
+
 #include "vesk_hdl/text/FoldingLine.h"
 
 #include <algorithm>
@@ -16,6 +19,7 @@ void WriteBlanks(Basis::Stream &file, std::size_t count) {
 
 } // namespace
 
+/// The short way of Append may fill the line up to 80 columns, as far as its memory reaches.
 void FoldingLine::FindLimit() {
     limit = std::min(capacity, start + MAX_LENGTH - std::min(blanks, MAX_LENGTH));
 }
@@ -32,7 +36,9 @@ void FoldingLine::Grow() {
     FindLimit();
 }
 
-/// Whether the text in front of the last piece holds a comment mark.
+/// Whether the text before the last piece holds a comment mark. A line break in a comment would
+/// turn the rest of the comment into text, so that such a line is never folded. Required: a single
+/// "/" counts, not only "//" and "/*".
 bool FoldingLine::IsComment() {
     for (; !comment && searched < pieceBegin; ++searched) {
         char const c = text[searched];
@@ -41,7 +47,7 @@ bool FoldingLine::IsComment() {
     return comment;
 }
 
-/// The place of a character in front of the last piece, not before `from`.
+/// The last place of a character before the last piece and not before `from`.
 std::size_t FoldingLine::FindLast(char c, std::size_t from) const {
     for (std::size_t at = pieceBegin; at > from; --at)
         if (text[at - 1] == c)
@@ -52,7 +58,9 @@ std::size_t FoldingLine::FindLast(char c, std::size_t from) const {
 void FoldingLine::Fold(Basis::Stream &file, std::size_t indentation) {
     WriteBlanks(file, blanks);
     std::size_t const lastBlank = FindLast(' ', std::max(start, withoutBlank));
-    std::size_t end = start; // unless the text holds a blank, the last one stands in front of it
+    // Without a blank in the text, the last blank of the line is the last one of its indentation,
+    // and the line breaks there. Only a line without indentation is searched for a comma.
+    std::size_t end = start;
     if (lastBlank != NONE) {
         end = lastBlank + 1;
     } else if (blanks == 0) {
@@ -61,7 +69,7 @@ void FoldingLine::Fold(Basis::Stream &file, std::size_t indentation) {
     }
     file.Write(std::string_view(text.get() + start, end - start)).Write("\n");
     start = end;
-    blanks = indentation + FOLD_INDENT; // now in front, so that no comma will be asked for
+    blanks = indentation + FOLD_INDENT; // the next fold of this line finds these blanks, no comma
     withoutBlank = pieceBegin;
     searched = std::max(searched, start);
     if (start - MARGIN >= size - start)
@@ -69,7 +77,9 @@ void FoldingLine::Fold(Basis::Stream &file, std::size_t indentation) {
     FindLimit();
 }
 
-/// So that a line that folds a million times takes no more memory than one that folds once.
+/// Moves what is not written yet to the front. Without it a line that is folded a million times
+/// would keep all of its text in memory. It is called when the written part is the larger one, so
+/// that each character is moved at most once on average.
 void FoldingLine::DropWritten() {
     std::copy(text.get() + start, text.get() + size, text.get() + MARGIN);
     for (std::size_t *const place : {&size, &pieceBegin, &searched, &withoutBlank})
@@ -82,7 +92,7 @@ void FoldingLine::End(Basis::Stream &file) {
         Grow();
     text[size++] = '\n';
     std::size_t begin = start;
-    if (start == MARGIN && blanks <= MARGIN)
+    if (start == MARGIN && blanks <= MARGIN) // the margin before the text serves as indentation
         begin -= blanks;
     else
         WriteBlanks(file, blanks);

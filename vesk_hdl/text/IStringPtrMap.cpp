@@ -1,3 +1,5 @@
+// A map from names to pointers, without regard to case: a TextIndex with a stable interface.
+
 #include "vesk_hdl/text/IStringPtrMap.h"
 
 #include "vesk_hdl/text/TextIndex.h"
@@ -7,6 +9,8 @@ namespace Vesk_Hdl {
 
 using Basis::ViewOf;
 
+/// Made with the first entry: most maps of a design, such as that of a component's attributes, stay
+/// empty.
 struct IStringPtrMapBase::Record {
     TextIndex table{TextIndex::CASE_IGNORED};
 };
@@ -25,6 +29,7 @@ IStringPtrMapBase &IStringPtrMapBase::operator=(IStringPtrMapBase &other) {
     Empty();
     if (!other.record)
         return *this;
+    // The order of the entries has no meaning: the map offers no walk.
     for (TextIndex::Node const &node : other.record->table)
         Add(node.key, node.value);
     return *this;

@@ -7,9 +7,12 @@
 
 namespace Vesk_Hdl {
 
-/// The introspective sort of pointer arrays, for items that are cheap to copy. The steps are fixed,
-/// since equal items keep the order that these steps leave them in. Every cursor also stops at the
-/// ends of the range: a `less` that is no strict order gives some order, never a stray access.
+/// The introspective sort of arrays, for items that are cheap to copy.
+///
+/// Its steps are fixed and must not be replaced by std::sort: the order that they leave equal items
+/// in is visible in the written text, and another library or version would give another one. Every
+/// cursor also stops at the ends of the range. So a `less` that is no strict order, which a client
+/// may pass, gives some order and never an access outside.
 template <class Item, class Less> class IntroSort {
 public:
     static void Sort(Item *first, Item *last, Less less) {
@@ -22,12 +25,14 @@ public:
     }
 
 private:
-    static constexpr std::ptrdiff_t SMALL = 16;
+    static constexpr std::ptrdiff_t SMALL =
+        16; ///< ranges up to this size are left to InsertionSort
 
     explicit IntroSort(Less &l) : less(l) {}
 
     void SortLoop(Item *first, Item *last, std::size_t depthLimit) {
         while (last - first > SMALL) {
+            // Bad pivots would make the time quadratic. Heap sort never takes more than n log n.
             if (depthLimit == 0)
                 return HeapSort(first, last);
             --depthLimit;
@@ -38,6 +43,7 @@ private:
         }
     }
 
+    /// Of first, middle and last item: a range that is in order already is halved.
     Item Median(Item a, Item b, Item c) {
         if (less(a, b))
             return less(b, c) ? b : less(a, c) ? c : a;
@@ -79,6 +85,7 @@ private:
         }
     }
 
+    /// One pass over the whole array: after SortLoop each item is near its place.
     void InsertionSort(Item *first, Item *last) {
         Item *const guarded = last - first > SMALL ? first + SMALL : last;
         for (Item *item = first + 1; item < guarded; ++item) {

@@ -4,17 +4,18 @@
 
 namespace Vesk_Hdl {
 
-/// A PtrArray whose elements stand in memory of its owner, which outlives it, as long as they find
-/// room there: no allocation for the few that nearly every array of a design has.
+/// A PtrArray whose first elements are in memory of its owner, which must outlive the array. Nearly
+/// every array of a design has only a few elements, and these then need no allocation. An array
+/// that outgrows that memory moves to memory of its own.
 template <class T> class LentPtrArray : public PtrArray<T> {
 public:
-    /// What Borrow wants for so many elements.
+    /// The bytes that Borrow needs for so many elements.
     static constexpr std::size_t BytesFor(int count) { return PtrArrayBase::BytesFor(count); }
-    /// Before the first element. The memory is aligned as a pointer is.
+    /// Called before the first element is added. The memory is aligned as a pointer is.
     void Borrow(void *memory, int count) { PtrArrayBase::Borrow(memory, count); }
 };
 
-/// The same with the memory at hand, for COUNT elements.
+/// The same with memory for COUNT elements inside the object.
 template <class T, int COUNT> class InlinePtrArray : public LentPtrArray<T> {
 public:
     InlinePtrArray() { this->Borrow(room, COUNT); }

@@ -1,3 +1,6 @@
+// A set of texts with a required order. The header says which; docs/architecture.md, "Storage and
+// its invariants", what depends on it.
+
 #include "vesk_hdl/text/OrderedTextTable.h"
 
 #include <algorithm>
@@ -9,6 +12,7 @@ namespace Vesk_Hdl {
 
 namespace {
 
+/// Primes, each about double the one before. The series is part of the visible order.
 constexpr std::uint32_t BUCKET_COUNTS[] = {
     7,         23,        53,        97,         193,        389,        769,      1543,
     3079,      6151,      12289,     24593,      49157,      98317,      196613,   393241,
@@ -26,6 +30,8 @@ std::uint32_t BucketCountFor(std::size_t wanted) {
 
 OrderedTextTable::OrderedTextTable(std::uint32_t wanted) : bucketCount(BucketCountFor(wanted)) {}
 
+/// A character is taken as signed, so that bytes above 127 count as negative numbers. Where `char`
+/// is unsigned the order must be the same.
 std::uint32_t OrderedTextTable::Hash(std::string_view key) {
     std::uint32_t hash = 5381;
     for (char const c : key)
@@ -33,7 +39,7 @@ std::uint32_t OrderedTextTable::Hash(std::string_view key) {
     return hash;
 }
 
-/// Counts in `passed` the nodes that it looked at in vain.
+/// Counts in `passed` the nodes of the bucket that have another text.
 OrderedTextTable::Node const *OrderedTextTable::Find(std::string_view key, std::uint32_t hash,
                                                      std::uint32_t &passed) const {
     passed = 0;
@@ -64,6 +70,8 @@ void OrderedTextTable::GrowForOneMore() {
         Rebuild(BucketCountFor(count + 1));
 }
 
+/// The nodes stay where they are; only their chains are made anew. Their order within a bucket is
+/// the reverse of the order in which this walk meets them.
 void OrderedTextTable::Rebuild(std::uint32_t newCount) {
     std::vector<std::uint32_t> old(newCount, NONE);
     old.swap(buckets);
@@ -77,7 +85,8 @@ void OrderedTextTable::Rebuild(std::uint32_t newCount) {
             std::uint32_t &first = buckets[BucketOf(node.hash)];
             node.next = first;
             node.previous = NONE;
-            node.length = 1;
+            node.length =
+                1; // counted on the way, since a walk over a long bucket would cost its square
             if (first != NONE) {
                 nodes[first].previous = number;
                 node.length += nodes[first].length;
@@ -90,6 +99,7 @@ void OrderedTextTable::Rebuild(std::uint32_t newCount) {
         MakeIndex();
 }
 
+/// The index stays until the table is emptied: names that collided once may do so again.
 void OrderedTextTable::MakeIndex() {
     if (index)
         return;
@@ -108,7 +118,8 @@ void OrderedTextTable::Add(Basis::StringBase<char> const &key) {
         return;
     if (passed >= LONGEST_BUCKET)
         MakeIndex();
-    // All that may run out of memory comes before the first change.
+    // All that may run out of memory comes before the first change, so that a failed Add leaves the
+    // table whole.
     if (unused == NONE) {
         if (nodes.size() >= NONE)
             throw std::length_error("Vesk_Hdl::OrderedTextTable: too many texts");
@@ -122,7 +133,7 @@ void OrderedTextTable::Add(Basis::StringBase<char> const &key) {
     unused = node.next;
     node.key = key;
     node.hash = hash;
-    // The oldest text of a bucket stays in front; a new one comes directly after it.
+    // The oldest text of a bucket stays its first; a new one comes directly after it.
     std::uint32_t const bucket = BucketOf(hash);
     std::uint32_t &first = buckets[bucket];
     node.previous = first;
@@ -156,6 +167,8 @@ void OrderedTextTable::Remove(std::string_view key) {
     --count;
 }
 
+/// Only buckets that are in use are reset. The passes of a write empty a set that is small again
+/// but may have been large.
 void OrderedTextTable::Empty() {
     for (Node const &node : nodes)
         buckets[BucketOf(node.hash)] = NONE;

@@ -1,3 +1,6 @@
+// Output streams and their two destinations: a file with indentation and folding, and memory
+// without.
+
 #include "vesk_hdl/text/OutStream.h"
 
 #include <cerrno>
@@ -24,7 +27,8 @@ using Basis::File;
 using Basis::Stream;
 using Vesk_Hdl::FoldingLine;
 
-/// Text into a file, a line at a time. Writes nothing while no file is open.
+/// Writes text into a file, a line at a time. While no file is open, text is dropped: a write to a
+/// path that cannot be opened is no error of the commands.
 class TextFileDst : public StreamDst {
 public:
     explicit TextFileDst(char const *name) : fileName(name) {}
@@ -33,7 +37,7 @@ public:
     ~TextFileDst() override {
         try {
             Close();
-        } catch (std::bad_alloc const &) { // it is closed all the same
+        } catch (std::bad_alloc const &) { // a destructor must not throw; the file is closed anyway
         }
     }
 
@@ -60,7 +64,7 @@ public:
     }
     void Write(int value) override {
         char digits[16] = {};
-        std::to_chars(digits, digits + sizeof digits - 1, value);
+        std::to_chars(digits, digits + sizeof digits - 1, value); // the last byte stays NUL
         Write(digits);
     }
 
@@ -71,7 +75,7 @@ public:
     }
 
     bool Adopt(int descriptor) {
-        int const callersError = errno;
+        int const callersError = errno; // Close may change it
         Close();
         bool const taken = Take(File::adopt(descriptor));
         if (!taken)
@@ -82,6 +86,7 @@ public:
     void Close() {
         if (!file)
             return;
+        // Closes the file also when the flush throws, as a guard may.
         struct Closing {
             TextFileDst &dst;
             ~Closing() {
@@ -111,8 +116,9 @@ private:
         return file != nullptr;
     }
 
-    /// What stands in front of a "\n" in one piece ends the line unfolded. Apart, so that the short
-    /// way need not save what this one does with registers.
+    /// Any text. What comes before a "\n" in the same piece ends its line and is not folded. It is
+    /// kept out of line so that the short way in Write need not save the registers that this one
+    /// uses.
     [[gnu::noinline]] void WriteAny(char const *text) {
         while (*text != '\0') {
             IndentNewLine();
@@ -124,7 +130,7 @@ private:
         }
     }
 
-    /// Text that has no file to go to.
+    /// Called with text while no file is open.
     [[gnu::noinline]] void Drop() {
         if (guard)
             guard->Failed();
@@ -142,13 +148,14 @@ private:
         line.End(*file);
     }
 
-    Stream *file = nullptr;
-    FoldingLine line;
-    Basis::StringBase<char> fileName;
-    int error = 0;
+    Stream *file = nullptr; ///< owned; null while no file is open
+    FoldingLine line; ///< what is not in the file yet; Close leaves the blanks of a fold in it
+    Basis::StringBase<char> fileName; ///< given to the constructor; Open does not change it
+    int error = 0;                    ///< of the last file; an open one has its own
     Stream::Guard *guard = nullptr;
 };
 
+/// Collects text in memory as it comes. Levels of nesting are counted and have no effect.
 class TextMemDst : public StreamDst {
 public:
     explicit TextMemDst(char const *text) : value(text) {}
@@ -161,6 +168,9 @@ public:
 } // namespace
 
 namespace Vesk_Hdl {
+
+// The casts of `dst` below are safe: a stream of these classes makes its own destination, and
+// nothing replaces it.
 
 OutStream::OutStream(StreamDst *destination) : dst(destination) {}
 OutStream::~OutStream() { delete dst; }

@@ -1,3 +1,7 @@
+// The untyped pointer array. Most arrays of a design are empty or short, and some are used as
+// queues: see docs/architecture.md, "Storage and its invariants", for the gap and for borrowed
+// memory.
+
 #include "vesk_hdl/text/PtrArray.h"
 
 #include <algorithm>
@@ -15,6 +19,7 @@ PtrArrayBase::PtrArrayBase() : block(nullptr) {}
 
 PtrArrayBase::~PtrArrayBase() { FreeMemory(); }
 
+/// The mark keeps FreeMemory and Reserve from freeing memory that belongs to the owner.
 void PtrArrayBase::Borrow(void *memory, int count) {
     assert(!block && "a block that is replaced here is never freed");
     block = new (memory) Block{0, static_cast<unsigned int>(count) | BORROWED};
@@ -32,6 +37,7 @@ void PtrArrayBase::SetGap(std::size_t places) {
     reinterpret_cast<std::size_t *>(block)[-1] = places;
 }
 
+/// The address that malloc returned: before the gap.
 void *PtrArrayBase::GetMemory() const { return reinterpret_cast<void **>(block) - GetGap(); }
 
 void PtrArrayBase::FreeMemory() {
@@ -39,8 +45,9 @@ void PtrArrayBase::FreeMemory() {
         std::free(GetMemory());
 }
 
-/// Moves the head and the first elements by some places, down if that is negative. The capacity
-/// counts what the head leaves or takes.
+/// Moves the head and the first `elements` by some places, towards lower addresses if that is
+/// negative. The places that the head leaves become gap, and those that it takes stop being gap;
+/// the capacity changes by as many. So neither end of an array costs a move of all elements.
 void PtrArrayBase::MoveHead(std::ptrdiff_t places, int elements) {
     auto const gap = static_cast<std::ptrdiff_t>(GetGap()) + places;
     assert(gap >= 0 && !IsBorrowed() && "the head would leave its memory");
@@ -51,8 +58,9 @@ void PtrArrayBase::MoveHead(std::ptrdiff_t places, int elements) {
     SetGap(static_cast<std::size_t>(gap));
 }
 
-/// Moves into memory with that capacity after a gap of `gap` places. A large gap that is there is
-/// used up first.
+/// Moves the elements into memory for `capacity` elements after a gap of `gap` places. If the
+/// present gap is at least as large as the array, the elements move down into it instead: an array
+/// that is filled at one end and emptied at the other then never grows.
 void PtrArrayBase::Reserve(int capacity, int gap) {
     if (capacity <= 0 || capacity > MAX_CAPACITY || gap > MAX_CAPACITY)
         throw std::bad_alloc(); // more than a block counts
@@ -64,6 +72,7 @@ void PtrArrayBase::Reserve(int capacity, int gap) {
         return;
     }
     std::size_t const bytes = static_cast<std::size_t>(gap) * sizeof(void *) + BytesFor(capacity);
+    // realloc can grow a block without copying it, but only if the block begins at the head.
     bool const inPlace = !IsBorrowed() && free == 0 && gap == 0;
     void *const memory = inPlace ? std::realloc(block, bytes) : std::malloc(bytes);
     if (!memory)
@@ -78,7 +87,7 @@ void PtrArrayBase::Reserve(int capacity, int gap) {
     SetGap(static_cast<std::size_t>(gap));
 }
 
-/// 1, 2, 4, 8 and on up to the most; 0 when there is no more.
+/// Double the size: 1, 2, 4, 8 and so on up to the greatest capacity; 0 when the array has that.
 int PtrArrayBase::GrownCapacity() const {
     int const size = GetSize();
     return size < MAX_CAPACITY ? std::min(size + std::max(size, 1), MAX_CAPACITY) : 0;
@@ -120,6 +129,7 @@ bool PtrArrayBase::Remove(void *item) {
     return true;
 }
 
+/// The shorter side moves. In borrowed memory there can be no gap, and the later elements move.
 void PtrArrayBase::RemoveAt(int index) {
     assert(index >= 0 && index < GetSize() && "elements outside the array would move");
     int const after = GetSize() - index - 1;
@@ -136,6 +146,7 @@ void PtrArrayBase::RemoveTail() {
         --block->size;
 }
 
+/// A new gap is as large as the array, so that the additions that follow do not move it again.
 void PtrArrayBase::Prepend(void *item) {
     if (GetGap() == 0)
         Reserve(std::max(GetCapacity(), 1), std::max(GetSize(), 1));
@@ -167,6 +178,7 @@ void PtrArrayBase::Swap(int first, int second) {
     int const size = GetSize();
     if (first < 0 || second < 0 || first >= size || second >= size || first == second)
         return;
+    assert(block && "an array of two elements has a block");
     void *const held = GetAt(first);
     SetAt(first, GetAt(second));
     SetAt(second, held);

@@ -1,3 +1,5 @@
+// The seeded hash. It reads eight characters at a time, since every command hashes names.
+
 #include "vesk_hdl/text/SeededHash.h"
 
 #include <algorithm>
@@ -11,10 +13,11 @@ namespace Vesk_Hdl {
 namespace {
 
 constexpr std::size_t WORD = sizeof(std::uint64_t);
-constexpr std::uint64_t EACH_BYTE = 0x0101010101010101U;
-/// What counting changes in the last character.
+constexpr std::uint64_t EACH_BYTE = 0x0101010101010101U; ///< times a byte: that byte eight times
+/// The bits of the last character in which numbered names differ: those of a decimal digit.
 constexpr unsigned int COUNTED_BITS = 0x0F;
 
+/// The random numbers of this process. They must stay the same from the first hash to the last.
 struct Key {
     std::uint64_t a, b, c, d;
 
@@ -24,8 +27,8 @@ struct Key {
             for (std::uint64_t *const part : {&a, &b, &c, &d})
                 *part = std::uint64_t{device()} << 32U | device();
         } catch (std::exception const &) {
-            // The machine hands out no random numbers. A file is seldom made for this microsecond
-            // and this place in memory.
+            // The machine provides no random numbers. The time and an address are hard to guess for
+            // the author of a file of colliding names.
             auto const now = std::chrono::steady_clock::now().time_since_epoch().count();
             std::mt19937_64 random(static_cast<std::uint64_t>(now) ^
                                    reinterpret_cast<std::uintptr_t>(this));
@@ -35,8 +38,8 @@ struct Key {
     }
 };
 
-/// Both halves of the product. If a secret number was added to each factor first, nobody can say
-/// which factors give the same result.
+/// Both halves of the product, combined. Each factor has been combined with a secret number before,
+/// so that nobody can choose texts that give the same result.
 std::uint64_t Mix(std::uint64_t a, std::uint64_t b) {
     __extension__ using Product = unsigned __int128;
     Product const product = Product{a} * b;
@@ -53,25 +56,30 @@ std::uint64_t Byte(char const *text, std::size_t at) {
     return std::uint64_t{static_cast<unsigned char>(text[at])} << 8 * at;
 }
 
-/// Up to eight characters as a number, which is another one for any other text of that length.
+/// Up to eight characters as a number. Different texts of the same length give different numbers.
 std::uint64_t LoadWord(char const *text, std::size_t size) {
     if (size >= WORD)
         return Load<std::uint64_t>(text);
+    // Loads that overlap cover every length without a loop and without reading past the end.
     constexpr std::size_t HALF = WORD / 2;
     if (size >= HALF)
         return Load<std::uint32_t>(text) | Load<std::uint32_t>(text + size - HALF) << 8 * HALF;
     return size > 0 ? Byte(text, 0) | Byte(text, size / 2) | Byte(text, size - 1) : 0;
 }
 
-/// Basis::Ascii::ToUpper for each byte of a word.
+/// Basis::Ascii::ToUpper for each byte of a word at once. The top bit of each byte of the two sums
+/// says whether the byte is at least 'a' and whether it is greater than 'z'. Shifted by two, the
+/// top bit is 32, the difference between a small and a capital letter.
 std::uint64_t ToUpper(std::uint64_t word) {
     constexpr std::uint64_t TOP_BITS = 0x80 * EACH_BYTE;
     std::uint64_t const low = word & ~TOP_BITS;
     std::uint64_t const fromSmallA = low + (0x80 - 'a') * EACH_BYTE;
-    std::uint64_t const behindSmallZ = low + (0x7F - 'z') * EACH_BYTE;
-    return word - ((fromSmallA & ~behindSmallZ & ~word & TOP_BITS) >> 2U);
+    std::uint64_t const afterSmallZ = low + (0x7F - 'z') * EACH_BYTE;
+    return word - ((fromSmallA & ~afterSmallZ & ~word & TOP_BITS) >> 2U);
 }
 
+/// The last character is left out of the words: its low bits are added to the finished hash, so
+/// that numbered names become neighbours, and its other bits take part with the length.
 template <bool ignoresCase> std::uint32_t Hash(std::string_view text) {
     auto const load = [](char const *from, std::size_t size) {
         std::uint64_t const word = LoadWord(from, size);

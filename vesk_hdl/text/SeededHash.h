@@ -12,25 +12,31 @@
 
 namespace Vesk_Hdl {
 
-/// The hash of every table whose order nobody sees. Its key is random and drawn once per process,
-/// so that no file can hold names that were made to collide.
+/// The hash of every table whose order is not visible. Its key is random and drawn once in a
+/// process, so that nobody can write a file of names that all collide.
 ///
-/// Texts that differ in the low four bits of their last character alone get hashes that differ in
-/// the low four bits alone: names that are counted through lie side by side in a table.
+/// Texts that differ only in the low four bits of their last character get hashes that differ only
+/// in the low four bits: numbered names, such as N10 to N19, are neighbours in a table and so in
+/// the cache.
 std::uint32_t SeededHash(std::string_view text);
-/// The same for texts that are equal if they differ only in the case of ASCII letters.
+/// The same for texts whose case does not count: equal but for the case of ASCII letters means an
+/// equal hash.
 std::uint32_t SeededHashIgnoringCase(std::string_view text);
 
-/// For unordered containers of the standard library that are keyed by texts of a design. They take
-/// a std::string_view to look a text up.
+// For unordered containers of the standard library whose keys are texts of a design. They look up a
+// std::string_view without a copy of it.
+
+/// Hashes exact texts.
 struct TextHash {
     using is_transparent = void;
     std::size_t operator()(std::string_view text) const { return SeededHash(text); }
 };
+/// Hashes texts whose case does not count.
 struct FoldedTextHash {
     using is_transparent = void;
     std::size_t operator()(std::string_view text) const { return SeededHashIgnoringCase(text); }
 };
+/// Compares texts whose case does not count.
 struct FoldedTextEqual {
     using is_transparent = void;
     bool operator()(std::string_view a, std::string_view b) const {
@@ -38,10 +44,12 @@ struct FoldedTextEqual {
     }
 };
 
+/// A map whose keys are exact texts.
 template <class Value>
 using TextMap = std::unordered_map<std::string, Value, TextHash, std::equal_to<>>;
+/// A set of exact texts.
 using TextSet = std::unordered_set<std::string, TextHash, std::equal_to<>>;
-/// Keys that differ only in case are the same key.
+/// A map in which keys that differ only in case are the same key.
 template <class Value>
 using FoldedTextMap = std::unordered_map<std::string, Value, FoldedTextHash, FoldedTextEqual>;
 

@@ -1,5 +1,8 @@
+// Arrays of strings and the tokenizer, where the grammar of a command line begins.
+
 #include "vesk_hdl/text/StringArray.h"
 
+#include <cassert>
 #include <string>
 #include <vector>
 
@@ -16,17 +19,18 @@ using Basis::ViewOf;
 
 namespace {
 
-/// The range from `begin` up to, without, `end`.
+/// The range of the characters from `begin` on and before `end`, in the form of Basis_Range.
 Basis_Range PlaceOf(std::size_t begin, std::size_t end) {
     if (begin == end)
         return {static_cast<unsigned int>(begin) + 1, static_cast<unsigned int>(begin)};
     return {static_cast<unsigned int>(begin), static_cast<unsigned int>(end - 1)};
 }
 
-/// The quoted way of StringArray::Parse: one walk over the text, a character at a time.
+/// StringArray::Parse for a text with quotes: one walk over the text, a character at a time. What
+/// looks like an oversight here is required: the language of command files depends on it.
 class QuotedParser {
 public:
-    /// Null for places asks for none.
+    /// `placesOut` may be null.
     QuotedParser(std::string_view separatorSet, bool skip, std::string_view pairs, StringArray &out,
                  std::vector<Basis_Range> *placesOut)
         : separators(separatorSet), skipEmpty(skip), quotePairs(pairs), tokens(out),
@@ -36,7 +40,8 @@ public:
         std::size_t i = OpensAt(text, 0) ? 1 : 0;
         while (i < text.size())
             i = inQuote ? StepInside(text, i) : StepOutside(text, i);
-        // Only here a quoted part that ended does not count: an empty last token is lost.
+        // Required: at the end of the text a quoted part does not count, so that an empty last
+        // token is lost. Everywhere else `hadQuote` keeps it.
         if (!token.empty())
             AddToken(text.size());
         return count;
@@ -45,7 +50,8 @@ public:
 private:
     bool IsSeparator(char c) const { return separators.find(c) != std::string_view::npos; }
 
-    /// Enters a quote if a character that opens one stands at the place.
+    /// Enters a quote if the character at the place opens one. A last character of the pairs that
+    /// has no partner opens nothing.
     bool OpensAt(std::string_view text, std::size_t at) {
         for (std::size_t pair = 0; at < text.size() && pair + 1 < quotePairs.size(); pair += 2)
             if (quotePairs[pair] == text[at]) {
@@ -56,6 +62,8 @@ private:
         return false;
     }
 
+    /// One step inside a quote; returns where the next one begins. Required: a closing character in
+    /// the middle of a word is dropped, and the quote continues.
     std::size_t StepInside(std::string_view text, std::size_t i) {
         bool const last = i + 1 == text.size();
         if (text[i] == close) {
@@ -73,6 +81,7 @@ private:
         return i + 1;
     }
 
+    /// One step outside a quote. A quote begins only after a separator: in `a"b` it is a character.
     std::size_t StepOutside(std::string_view text, std::size_t i) {
         if (!IsSeparator(text[i])) {
             token += text[i];
@@ -99,15 +108,16 @@ private:
     StringArray &tokens;
     std::vector<Basis_Range> *places;
     std::string token;
-    std::size_t begin = 0; ///< of the token, with its quote
+    std::size_t begin = 0; ///< where the token begins, with its quote
     char close = '\0';
     bool inQuote = false;
     bool hadQuote = false; ///< a quoted part has ended: the token counts even if it is empty
     int count = 0;
 };
 
-/// What each character is to the plain way of StringArray::Parse, where empty tokens do not count
-/// and no quote stands in the text: the tokens are the runs of characters that are no separators.
+/// StringArray::Parse for a text without quotes, where empty tokens do not count: the tokens are
+/// the runs of characters that are no separators. Nearly all command lines are such texts. One
+/// look-up for each character takes the place of a search for quotes and another for separators.
 class PlainParser {
 public:
     constexpr PlainParser(std::string_view separators, std::string_view quotes) {
@@ -118,7 +128,8 @@ public:
         KindOf('\0') = END;
     }
 
-    /// Up to the first quote; tells whether there is none.
+    /// Calls `act` with each token up to the first quote. False if it met a quote: then the tokens
+    /// so far may be wrong.
     template <class Act> bool ForEachToken(char const *at, Act act) const {
         for (;;) {
             while (KindOf(*at) == SEPARATOR)
@@ -148,7 +159,7 @@ constexpr char QUOTES[] = "\"\"''";
 
 } // namespace
 
-/// A slot that nobody assigned reads as the empty string, and that is what it holds.
+/// A slot that was never assigned reads as the empty string, so that it need not be null.
 struct StringArray::Record {
     std::vector<StringBase<char>> strings;
 };
@@ -180,7 +191,7 @@ StringBase<char> StringArray::operator[](int index) const { return At(index); }
 StringBase<char> StringArray::GetAt(int index) const { return At(index); }
 
 StringBase<char> const &StringArray::At(int index) const {
-    static StringBase<char> const outside;
+    static StringBase<char> const outside; // a reference to it stays valid
     return index >= 0 && index < GetSize() ? record->strings[static_cast<std::size_t>(index)]
                                            : outside;
 }
@@ -236,12 +247,15 @@ int StringArray::Parse(char const *text, char const *separators, bool skipEmpty,
     }
     if (isPlain)
         return GetSize() - before;
+    // There is a quote: what was added before it is dropped, and the text is read again.
     record->strings.resize(static_cast<std::size_t>(before));
     if (places)
         places->resize(placesBefore);
     return QuotedParser(set, skipEmpty, quotes, *this, places).Parse(whole);
 }
 
+/// A line is parsed for each command, so that this one differs from Parse in two ways: the table of
+/// characters is made when the library is compiled, and strings that exist are assigned to.
 void StringArray::ParseLine(char const *line, std::vector<Basis_Range> *places) {
     static constexpr PlainParser PARSER(BLANK, QUOTES);
     std::vector<StringBase<char>> &strings = record->strings;
@@ -267,6 +281,7 @@ void StringArray::ParseLine(char const *line, std::vector<Basis_Range> *places) 
         Parse(line, BLANK, true, QUOTES, places);
         return;
     }
+    assert(strings.size() >= count && "a token was neither assigned nor added");
     while (strings.size() > count)
         strings.pop_back();
 }

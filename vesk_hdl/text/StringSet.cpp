@@ -1,3 +1,5 @@
+// A set of strings in two tables with separate rules; see the header for who relies on them.
+
 #include "vesk_hdl/text/StringSet.h"
 
 #include "vesk_hdl/text/OrderedTextTable.h"
@@ -10,10 +12,13 @@ using Basis::ViewOf;
 
 namespace {
 
+/// Asks for the first prime of the series that is not below it, 193. It is part of the visible
+/// order.
 constexpr std::uint32_t FIRST_BUCKETS = 100;
 
 } // namespace
 
+/// A position. An iterator points at it, so that the class has the size of one pointer for clients.
 struct StringSetIterator::Cell {
     OrderedTextTable const *table;
     OrderedTextTable::Node const *node; ///< null at the end
@@ -57,8 +62,8 @@ Basis::StringBase<char> StringSetIterator::operator*() const {
 }
 
 struct StringSet::Record {
-    TextIndex insensitiveTable{TextIndex::CASE_IGNORED}; ///< without values
-    OrderedTextTable sensitiveTable{FIRST_BUCKETS};
+    TextIndex insensitiveTable{TextIndex::CASE_IGNORED}; ///< never walked; its values are null
+    OrderedTextTable sensitiveTable{FIRST_BUCKETS};      ///< walked in the required order
 };
 
 StringSet::StringSet() : record(new Record) {}
@@ -68,6 +73,7 @@ StringSet::~StringSet() { delete record; }
 StringSet &StringSet::operator=(StringSet &other) {
     if (this == &other)
         return *this;
+    // Required: only one table is cleared, and what the exact table held before stays.
     record->insensitiveTable.Empty();
     OrderedTextTable &source = other.record->sensitiveTable;
     for (OrderedTextTable::Node const *node = source.GetFirst(); node; node = source.GetNext(node))
@@ -99,6 +105,7 @@ void StringSet::Remove(char const *string) {
 
 bool StringSet::IsEmpty() const { return record->sensitiveTable.GetCount() == 0; }
 
+/// Required: the other table keeps its names. The passes before a write rely on it.
 void StringSet::Empty() { record->sensitiveTable.Empty(); }
 
 StringSetIterator StringSet::GetBeginPos() {

@@ -4,24 +4,30 @@
 
 namespace Vesk_Hdl {
 
-/// A position in a StringSet, valid until the set changes or dies. One made by the default
-/// constructor stands nowhere: it reads as the empty string and does not move.
+/// A position in the exact table of a StringSet, valid until the set changes or ends. One that the
+/// default constructor makes is at no position: it reads as the empty string and does not move.
 class VESK_HDL_API StringSetIterator {
 public:
+    /// An iterator at no position.
     StringSetIterator();
-    /// For StringSet: takes over a position. Null, all that a client can pass, stands nowhere.
+    /// For StringSet, whose position it takes over. A client can only pass null, for no position.
     StringSetIterator(void *cell);
+    /// An iterator at the same position, which moves on its own.
     StringSetIterator(StringSetIterator const &other);
+    /// Leaves the set alone.
     ~StringSetIterator();
+    /// Goes to the position of the other iterator.
     StringSetIterator &operator=(StringSetIterator const &other);
 
-    /// Equal are an iterator and itself, two that stand nowhere, and two at the same string or end.
+    /// Whether both are at the same string, both at an end, or both at no position.
     bool operator==(StringSetIterator const &other) const;
+    /// The opposite of operator==.
     bool operator!=(StringSetIterator const &other) const;
-    /// To the next string. Not allowed at the end.
+    /// Goes to the next string. The iterator must not be at the end.
     StringSetIterator &operator++();
+    /// The same, without a result.
     void operator++(int);
-    /// A copy of the string here. Not allowed at the end.
+    /// A copy of the string at this position. The iterator must not be at the end.
     Basis::StringBase<char> operator*() const;
 
 private:
@@ -30,39 +36,49 @@ private:
     Cell *cell;
 };
 
-/// Strings, held once by exact spelling and once without regard to case, in two tables.
+/// Strings in two tables: one holds each spelling, the other each string without regard to case.
 ///
-/// The two are kept by separate rules on purpose: Empty and operator= each clear one of them. The
-/// rewriting before a write counts on it: a name that one of its stages handled stays known to
-/// IContains after Empty, and so out of the later stages.
+/// The tables follow separate rules on purpose: Empty and operator= clear only one of them. The
+/// passes before a write rely on it: after Empty, IContains still knows the names that an earlier
+/// pass handled, and so keeps them out of the later passes. A null string counts as empty.
 class VESK_HDL_API StringSet {
 public:
+    /// An empty set.
     StringSet();
+    /// An empty set, then operator=: names that only IContains of `other` knows are not copied.
     StringSet(StringSet &other);
+    /// Frees the strings; iterators are no longer valid.
     ~StringSet();
-    /// Clears what IContains knows, then adds the strings of the exact table of `other` to both
-    /// tables, in its order. What Contains knew stays. Assigning a set to itself changes nothing.
+    /// Clears the table of IContains, then adds the strings of the exact table of `other` to both
+    /// tables, in its order. Strings that Contains knew before stay. Assigning a set to itself
+    /// changes nothing.
     StringSet &operator=(StringSet &other);
 
-    /// Adds to each table unless that table holds the string by its own rule.
+    /// Adds the string to each table that does not hold it by its own rule: "a" and "A" are two
+    /// strings of the exact table and one of the other.
     void Add(char const *string);
+    /// The same; the set shares the text.
     void Add(Basis::StringBase<char> const &string);
-    /// True if a string equal but for case was added.
+    /// Whether a string that is equal but for case was added and not removed.
     bool IContains(char const *string) const;
+    /// The same for a text without NUL.
     bool IContains(std::string_view string) const;
-    /// True if this very string is held.
+    /// Whether exactly this string is in the exact table.
     bool Contains(char const *string) const;
-    /// Removes the string that equals this one but for case from what IContains knows, and this
-    /// very string from what Contains knows.
+    /// Removes exactly this string from the exact table, and the one that is equal but for case
+    /// from the other table.
     void Remove(char const *string);
-    /// True if the exact table holds nothing.
+    /// Whether the exact table is empty.
     bool IsEmpty() const;
-    /// Clears the exact table alone: IContains still answers true for all that was added before.
+    /// Clears the exact table only: IContains still returns true for all that was added before. A
+    /// caller that wants neither uses a new set.
     void Empty();
 
-    /// The walk over the exact table, in an order that depends on the strings and on the order of
-    /// their addition alone.
+    /// The first position of a walk over the exact table. The order of the walk depends on nothing
+    /// but the strings and the order in which they were added; the dummy signals of a written
+    /// netlist follow it.
     StringSetIterator GetBeginPos();
+    /// The position after the last string.
     StringSetIterator GetEndPos();
 
 private:

@@ -5,8 +5,9 @@
 
 namespace Vesk_Hdl {
 
-/// The record of an object that mostly needs none, made at the first call. Threads that only read
-/// the object may call at the same time: all of them get the record of the first.
+/// The record of an object, made at the first call: most objects of the kind need none. Several
+/// threads that only read the object may call at the same time. The record of the first one is
+/// taken; the others drop theirs.
 template <class Record> Record &OwnLazily(std::atomic<Record *> &record) {
     Record *own = record.load(std::memory_order_acquire);
     if (own)

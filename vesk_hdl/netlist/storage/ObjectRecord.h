@@ -1,6 +1,7 @@
 #pragma once
 
 #include <atomic>
+#include <cassert>
 
 #include "vesk_hdl/netlist/Object.h"
 #include "vesk_hdl/netlist/Values.h"
@@ -8,26 +9,32 @@
 
 namespace Vesk_Hdl {
 
-/// What an object shares with its copies until one of them changes: the pins of a million instances
-/// are what their components' pins are, and so cost their signal alone.
+/// What an object shares with its copies until one of them changes. The pins of a million instances
+/// have the names and polarities of their components' pins, and so each of them costs little more
+/// than a pointer to its signal.
 ///
-/// A record lies in the memory block of its name's text, after the characters. A new name makes a
-/// new record. The block is freed when the record and all copies of the text are gone.
+/// A record is in the memory block of the text of its name, after the characters: the two are
+/// always allocated together. A new name makes a new record. The block is freed when the record and
+/// all copies of the text are gone.
 ///
-/// Few objects have more than a name and a kind; their records are of a derived class, which
-/// `content` names.
+/// Few objects have more than a name and a kind. Their records are of a derived class, which
+/// `content` says; a virtual table would cost each name a pointer.
+///
+/// Invariant: a record is changed by its only owner, and a change of a name or polarity is reported
+/// first (NoteChange). See docs/architecture.md, "Storage and its invariants".
 struct Object::Record {
     enum Content : char { NAME, COMMENT, NETLIST, PIN };
 
     explicit Record(Content recordContent = NAME) : content(recordContent) {}
-    /// All but the name.
+    /// Copies all but the name, which comes with the block.
     Record(Record const &model) : objectType(model.objectType), content(model.content) {}
     Record &operator=(Record const &) = delete;
 
     inline Basis::StringBase<char> const &GetComment() const;
-    /// Of a record that nobody shares and whose content is not NAME.
+    /// The comment for writing. The record is not shared, and its content is not NAME.
     inline Basis::StringBase<char> &OwnComment();
-    /// For a record whose name, kind or polarity is about to change.
+    /// Called before the name, kind or polarity changes, so that no index of names or order of pins
+    /// is used that no longer holds.
     inline void NoteChange() const;
 
     Basis::StringBase<char> name;
@@ -38,7 +45,8 @@ struct Object::Record {
 
 /// The record of an object that is no pin and has a comment.
 struct Object::CommentRecord : Object::Record {
-    /// Of an object that gets its first comment, or becomes more than an object with one.
+    /// For an object that gets its first comment, and for the record of a netlist, which has one,
+    /// too.
     explicit CommentRecord(Record const &model, Content recordContent = COMMENT)
         : Record(recordContent), comment(model.GetComment()) {
         objectType = model.objectType;
@@ -48,13 +56,13 @@ struct Object::CommentRecord : Object::Record {
     Basis::StringBase<char> comment;
 };
 
-/// The record of a netlist that is found by its name, which is a model's.
+/// The record of a netlist of a model in an engine: the engine finds the model by this name.
 struct Object::NetlistRecord : Object::CommentRecord {
     NetlistRecord(Record const &model, unsigned long &counter)
         : CommentRecord(model, NETLIST), renames(counter) {}
     NetlistRecord(NetlistRecord const &) = default;
 
-    unsigned long &renames; ///< counts changes of names, and outlives the netlist
+    unsigned long &renames; ///< the counter of the engine, which outlives the netlist
 };
 
 /// The record of a pin.
@@ -65,7 +73,7 @@ struct Object::PinRecord : Object::Record {
     PinRecord(PinRecord const &) = default;
 
     Polarity::Value polarity;
-    PinFamilyPtr family; ///< none for a pin that no component made
+    PinFamilyPtr family; ///< null for a pin that no component made
     BitVectorValue defaultValue;
     Basis::StringBase<char> comment;
 };
@@ -76,6 +84,7 @@ inline Basis::StringBase<char> const &Object::Record::GetComment() const {
 }
 
 inline Basis::StringBase<char> &Object::Record::OwnComment() {
+    assert(content != NAME && "this record has no room for a comment");
     return content == PIN ? static_cast<PinRecord *>(this)->comment
                           : static_cast<CommentRecord *>(this)->comment;
 }

@@ -1,3 +1,5 @@
+// What a component and its instances share, see the header.
+
 #include "vesk_hdl/netlist/storage/PinFamily.h"
 
 #include <cassert>
@@ -13,17 +15,19 @@ namespace Vesk_Hdl {
 
 namespace {
 
+/// Whether neither pin comes before the other.
 bool AreEqualInOrder(Pin const &a, Pin const &b) {
     return a.GetPolarity() == b.GetPolarity() &&
            NaturalCompare(a.GetNameRef(), b.GetNameRef()) == 0;
 }
 
-/// Null if two pins are equal: then there are several orders, and which of them a sort gives
-/// depends on where it begins.
+/// The sorted order of pins. Null if two of them are equal: then several orders are possible, and
+/// which one a sort gives depends on the order that it begins with, so that each instance has to
+/// sort its own.
 std::unique_ptr<PinFamily::Order> MakeOrder(PtrArray<Pin *> const &pins) {
     PtrArray<Pin *> now;
     PtrArray<Pin *> sorted;
-    std::unordered_map<Pin const *, int> places; // in `now`
+    std::unordered_map<Pin const *, int> places; // the index of each pin in `now`
     for (int i = 0; i < pins.GetSize(); ++i) {
         now.Add(pins.GetAt(i));
         sorted.Add(pins.GetAt(i));
@@ -37,6 +41,7 @@ std::unique_ptr<PinFamily::Order> MakeOrder(PtrArray<Pin *> const &pins) {
     order->places.resize(places.size());
     for (int i = 0; i < sorted.GetSize(); ++i)
         order->places[static_cast<std::size_t>(places[sorted.GetAt(i)])] = i;
+    // Puts each pin where it belongs by one exchange, and records the exchange.
     for (int i = 0; i < sorted.GetSize(); ++i) {
         Pin const *const other = now.GetAt(i);
         if (other == sorted.GetAt(i))
@@ -60,7 +65,7 @@ void PinFamily::AddPin(PtrArray<Pin *> const &pins) noexcept {
     if (size < MIN_INDEXED)
         return;
     try {
-        int place = size - 1;
+        int place = size - 1; // the earlier pins are in the index already
         if (!index) {
             index = std::make_unique<TextIndex>(TextIndex::CASE_IGNORED);
             place = 0;
@@ -68,14 +73,14 @@ void PinFamily::AddPin(PtrArray<Pin *> const &pins) noexcept {
         for (; place < size; ++place)
             Index(pins, place);
     } catch (std::bad_alloc const &) {
-        NoteChange(); // an index that lacks a pin would call it absent
+        NoteChange(); // an index that lacks a pin would report it as absent
     }
 }
 
 void PinFamily::Index(PtrArray<Pin *> const &pins, int place) {
     Basis::StringBase<char> const &name = pins.GetAt(place)->GetNameRef();
     if (index->Find(name.View()))
-        return; // the first pin of a name is the one that is found
+        return; // required: the first pin of a name is found
     // NOLINTNEXTLINE(performance-no-int-to-ptr): a small number in the slot of a pointer
     index->Put(name, reinterpret_cast<void *>(static_cast<std::uintptr_t>(place)));
 }

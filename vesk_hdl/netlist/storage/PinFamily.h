@@ -13,43 +13,46 @@
 
 namespace Vesk_Hdl {
 
-/// What a component shares with its instances: where a pin of a name is, and how pins are sorted.
-/// The pins of an instance are copies of the component's in the same order, so that one index and
-/// one sorted order serve a million instances.
+/// What a component shares with its instances: the index of pins by name, and the sorted orders of
+/// pins. The pins of an instance are copies of the component's pins in the same order, so that one
+/// index and one sorted order serve a million instances.
 ///
-/// The component, each instance and the data of each pin own the family together: an instance
-/// answers for its pins when its component is gone.
+/// The component, each instance and the record of each pin own the family together, so that an
+/// instance can find and sort its pins after its component is gone.
 ///
-/// Index and orders hold as long as no pin of the family gets another name or polarity. A pin that
-/// changes says so (NoteChange), and from then on every question is answered by a walk.
+/// Invariant: index and orders hold as long as no pin of the family gets another name or polarity.
+/// A pin that changes reports it (NoteChange), and from then on each question is answered by a
+/// walk. See docs/architecture.md, "Storage and its invariants".
 class PinFamily {
 public:
-    /// How the first `places.size()` pins of a component are sorted. No two of them are equal.
+    /// How the first `places.size()` pins of a component are sorted. No two of them are equal, so
+    /// that only one order is possible.
     struct Order {
-        std::vector<std::pair<int, int>> swaps; ///< exchanges of places that sort, in this order
+        std::vector<std::pair<int, int>> swaps; ///< exchanges that sort, one after the other
         std::vector<int> places;                ///< the sorted place of each pin
     };
-    static constexpr int ABSENT = -1;
-    static constexpr int UNKNOWN = -2;
+    static constexpr int ABSENT = -1;  ///< no pin has that name
+    static constexpr int UNKNOWN = -2; ///< only a walk can answer
 
     explicit PinFamily(Component *owner) : component(owner) {}
     PinFamily(PinFamily const &) = delete;
     PinFamily &operator=(PinFamily const &) = delete;
 
-    /// The component as it was when the family began: one that is gone must not be used.
+    /// The component that began the family. It may be gone: a caller of Instance::GetComponent has
+    /// to know.
     Component *GetComponent() const { return component; }
 
-    /// The component got a pin, its last one. Does not throw: without memory for the index it is
-    /// given up.
+    /// Called when the component got a pin, the last of `pins`. It does not throw: if memory runs
+    /// out, the index is given up.
     void AddPin(PtrArray<Pin *> const &pins) noexcept;
+    /// Called before a pin gets another name or polarity.
     void NoteChange() { hasChanged.store(true, std::memory_order_relaxed); }
     bool HasChanged() const { return hasChanged.load(std::memory_order_relaxed); }
 
-    /// The place of the first pin of that name among the component's pins, or ABSENT. UNKNOWN if
-    /// only a walk can say.
+    /// The place of the first pin of a name among the component's pins, or ABSENT, or UNKNOWN.
     int Find(std::string_view name) const;
-    /// How these pins of an instance, which nobody sorted yet, are sorted. The order lives as long
-    /// as the family. Null if the pins have to be sorted for themselves.
+    /// The sorted order of the pins of an instance, which are not sorted yet. It is valid as long
+    /// as the family. Null if these pins have to be sorted by themselves.
     Order const *GetOrder(PtrArray<Pin *> const &pins);
 
 private:
@@ -60,14 +63,15 @@ private:
 
     Component *const component;
     std::unique_ptr<TextIndex> index; ///< from a name to a place; null while there are few pins
-    /// By the number of pins: instances that are older than a pin of the component go without it.
-    /// Null for pins of which some are equal.
+    /// The orders by number of pins: an instance that was made before the component got a pin does
+    /// not have it. Null for pins of which two are equal in the order.
     std::map<int, std::unique_ptr<Order>> orders;
     std::atomic<bool> hasChanged{false};
     std::atomic<unsigned int> owners{0};
 };
 
-/// One of the owners of a family, or of none.
+/// One owner of a family, or of none. Counting is that of strings, without a lock in a process of
+/// one thread; std::shared_ptr would be twice as large in each pin.
 class PinFamilyPtr {
 public:
     PinFamilyPtr() = default;
@@ -88,7 +92,7 @@ private:
     PinFamily *family = nullptr;
 };
 
-/// The one order of pins: by polarity, then by name.
+/// Sorts pins by polarity, then by name in natural order.
 void SortPins(PtrArray<Pin *> &pins);
 
 } // namespace Vesk_Hdl

@@ -1,6 +1,10 @@
 #pragma once
 
-// The base layer whole: strings, expressions, exceptions, files, plain functions, version, clock.
+// The whole base layer: strings, regular expressions, exceptions, files, functions on plain
+// character strings, version and clock.
+//
+// It knows nothing of designs. The rooms above it use these types in their interfaces, so that a
+// client that includes any header of them gets the ones that it needs.
 
 #include "vesk_hdl/text/basis/Exception.h"
 #include "vesk_hdl/text/basis/File.h"

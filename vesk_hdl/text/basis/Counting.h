@@ -1,13 +1,15 @@
 #pragma once
 
 #include <atomic>
+#include <cassert>
 
 #if __has_include(<sys/single_threaded.h>)
 #include <sys/single_threaded.h>
 #endif
 
-/// Counting the owners of shared memory. It is atomic counting; while the process has one thread
-/// only, nobody is there to count at the same time, and the bus need not be locked for it.
+/// Counts the owners of shared memory. The count is atomic. As long as the process has one thread,
+/// plain loads and stores do, which saves the locked instructions: names are copied so often that
+/// this is visible (docs/performance.md, "Why it is so").
 namespace Basis::Counting {
 
 inline bool IsSingleThreaded() {
@@ -25,10 +27,11 @@ inline void Join(std::atomic<unsigned int> &owners) noexcept {
         owners.fetch_add(1, std::memory_order_relaxed);
 }
 
-/// Whether the one who leaves was the last, and so has the memory to free.
+/// Whether the owner that leaves was the last one and has to free the memory.
 inline bool Leave(std::atomic<unsigned int> &owners) noexcept {
-    // Somebody who holds the only copy need not take part in the counting.
+    // No other thread can join: it would need a copy to copy from, and this is the only one.
     unsigned int const count = owners.load(std::memory_order_acquire);
+    assert(count > 0 && "memory without an owner is in use");
     if (count == 1)
         return true;
     if (!IsSingleThreaded())

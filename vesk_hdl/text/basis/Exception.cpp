@@ -1,3 +1,5 @@
+// The base of the exceptions.
+
 #include "vesk_hdl/text/basis/Exception.h"
 
 #include <string>
@@ -7,6 +9,7 @@
 
 namespace Basis {
 
+/// Apart from the class, so that it can grow without a change of the binary interface.
 struct Exception::Record {
     std::string module;
     std::string sourceFile;
@@ -31,6 +34,7 @@ Exception &Exception::operator=(Exception const &other) {
 
 Exception::~Exception() { delete record; }
 
+/// Made by setDescription, so that this operation can be const and cannot fail.
 wchar_t const *Exception::getLocalized() const { return record->localized.c_str(); }
 
 void Exception::report() const {

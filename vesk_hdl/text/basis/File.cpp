@@ -1,3 +1,6 @@
+// Files through the descriptors of the system. The streams of the standard library do not report
+// which error ended a write, and let no client decide about each block.
+
 #include "vesk_hdl/text/basis/File.h"
 
 #include <algorithm>
@@ -15,9 +18,10 @@ namespace Basis {
 
 namespace {
 
-constexpr std::size_t BLOCK = 64 * 1024;
+constexpr std::size_t BLOCK = 64 * 1024; ///< bytes; files are read and written in such blocks
 
-/// Reads all there is behind a descriptor; false with errno set if reading breaks off.
+/// Reads from a descriptor up to its end; false with errno set if reading breaks off. The size of a
+/// pipe or device is not known before, so that the text grows by doubling.
 bool ReadAll(int descriptor, std::string &text) {
     for (;;) {
         std::size_t const old = text.size();
@@ -30,6 +34,8 @@ bool ReadAll(int descriptor, std::string &text) {
     }
 }
 
+/// Writes a text and returns 0, or the errno that ended it. A signal does not end it unless the
+/// guard says so: a client that wants to stop at Ctrl-C sets a guard.
 int WriteAll(int descriptor, std::string_view text, Stream::Guard *guard) {
     int error = guard ? guard->Allow(text.size()) : 0;
     while (error == 0 && !text.empty()) {
@@ -50,14 +56,16 @@ struct Stream::Record {
     int descriptor = -1; ///< of a file that is written, otherwise -1
     int error = 0;
     Guard *guard = nullptr;
-    std::string text; ///< read: the whole file; written: a block, empty before the first text
-    std::size_t position = 0; ///< in the text; what stands before is read, or not yet written
+    std::string text; ///< reading: the whole file; writing: a block, empty before the first text
+    std::size_t position =
+        0; ///< in the text: what is before it has been read, or is not yet written
 
     Record() = default;
     Record(Record const &) = delete;
     Record &operator=(Record const &) = delete;
     ~Record() { Close(); }
 
+    /// After a failure text is dropped: a file with a hole would look whole.
     void Put(std::string_view whole) {
         if (descriptor < 0 || error != 0)
             return;
@@ -72,6 +80,8 @@ struct Stream::Record {
     int Close() {
         if (descriptor >= 0) {
             Flush();
+            // The descriptor is closed even if a signal interrupts the call; a second call could
+            // close the file of another thread.
             if (::close(descriptor) != 0 && error == 0 && errno != EINTR)
                 error = errno;
             descriptor = -1;
@@ -92,7 +102,7 @@ Stream &Stream::Write(std::string_view text) {
     if (text.size() > record->text.size() - record->position) {
         record->Flush();
         record->text.resize(BLOCK);
-        if (text.size() > BLOCK) {
+        if (text.size() > BLOCK) { // would not fit into a block: it goes to the file as it is
             record->Put(text);
             return *this;
         }
@@ -141,6 +151,7 @@ Stream *File::open(char const *name, Stream::Access access, bool) {
             error = ReadAll(record->descriptor, record->text) ? 0 : errno;
         } catch (std::exception const &) { // more than the memory holds, as from an endless device
         }
+        // The file is closed before the first line runs: one that fails leaves no descriptor open.
         ::close(record->descriptor);
         record->descriptor = -1;
         if (error != 0) {

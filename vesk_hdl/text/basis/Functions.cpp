@@ -1,3 +1,5 @@
+// Functions on plain character strings.
+
 #include "vesk_hdl/text/basis/Functions.h"
 
 #include <charconv>
@@ -11,7 +13,9 @@ namespace Basis {
 
 namespace {
 
-/// Matches from left to right; on a mismatch the latest star takes one character more.
+/// Matches from left to right. On a mismatch the latest star takes one character more; earlier
+/// stars need no second try, since the latest one can take whatever they could leave. So the time
+/// is at most the product of both lengths.
 template <class Fold> bool Matches(char const *text, char const *pattern, Fold fold) {
     char const *star = nullptr;
     char const *retry = nullptr;
@@ -62,7 +66,7 @@ int strnicmp(char const *a, char const *b, std::uint64_t count) {
 
 bool strtol(char const *text, long &value) {
     text = OrEmpty(text);
-    if (*text == '+' && Ascii::IsDigit(text[1]))
+    if (*text == '+' && Ascii::IsDigit(text[1])) // from_chars takes "-" but not "+"
         ++text;
     char const *const end = text + std::strlen(text);
     long number = 0;
@@ -76,7 +80,7 @@ bool strtol(char const *text, long &value) {
 } // namespace Basis
 
 char *orvform(char const *format, ...) {
-    thread_local std::string buffer;
+    thread_local std::string buffer; // of the thread's own: several engines may run at once
     va_list arguments;
     va_start(arguments, format);
     buffer = Basis::Printf(format ? format : "", arguments);

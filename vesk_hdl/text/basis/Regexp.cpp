@@ -1,3 +1,6 @@
+// A small matcher of regular expressions. That of the standard library depends on the locale and
+// can overflow the stack with a long text.
+
 #include "vesk_hdl/text/basis/Regexp.h"
 
 #include <algorithm>
@@ -8,7 +11,7 @@ namespace {
 
 using CharSet = std::bitset<256>;
 
-/// One place of the pattern: which characters may stand there, and whether none or many may.
+/// One item of the pattern: which characters it accepts, and whether none or many of them.
 struct Item {
     CharSet accepted;
     bool optional = false;
@@ -17,7 +20,8 @@ struct Item {
 
 std::size_t Code(char c) { return static_cast<unsigned char>(c); }
 
-/// Reads a bracket class from behind its "[" to behind its "]".
+/// Reads a bracket class whose "[" is read already, and its "]". A "]" at its beginning and a "-"
+/// at its end are ordinary characters.
 CharSet ReadClass(char const *&p) {
     CharSet set;
     bool const inverted = *p == '^';
@@ -37,6 +41,7 @@ CharSet ReadClass(char const *&p) {
     return inverted ? ~set : set;
 }
 
+/// Reads one item without what may follow it ("?", "*", "+").
 CharSet ReadOne(char const *&p) {
     char const c = *p++;
     if (c == '[')
@@ -67,8 +72,10 @@ Basis_Regexp::Basis_Regexp(char const *pattern) : record(new Record) {
 
 Basis_Regexp::~Basis_Regexp() { delete record; }
 
+/// Walks over all possible matches at once, one character at a time, so that no pattern makes the
+/// time grow faster than the text.
 Basis_Range Basis_Regexp::Match(std::string_view text) const {
-    // States are places in front of an item; each remembers the earliest start that leads to it.
+    // State i means: items before i have matched. It holds the earliest start that leads there.
     std::vector<Item> const &items = record->items;
     std::vector<std::size_t> starts(items.size() + 1, std::string_view::npos);
     std::vector<std::size_t> next(starts.size());
@@ -78,7 +85,7 @@ Basis_Range Basis_Regexp::Match(std::string_view text) const {
     for (std::size_t at = 0; at < text.size(); ++at) {
         if (!found)
             starts[0] = std::min(starts[0], at);
-        for (std::size_t i = 0; i < items.size(); ++i)
+        for (std::size_t i = 0; i < items.size(); ++i) // an optional item may match nothing
             if (items[i].optional)
                 starts[i + 1] = std::min(starts[i + 1], starts[i]);
         next.assign(next.size(), std::string_view::npos);

@@ -1,3 +1,5 @@
+// The string of the library: a counted text that copies share until one of them changes.
+
 #include "vesk_hdl/text/basis/StringBase.h"
 
 #include <algorithm>
@@ -20,14 +22,16 @@ namespace Basis {
 
 namespace {
 
-constexpr std::size_t LONGEST = 0xFFFFFFEFU;
+/// Lengths are 32 bits wide. The block around the text must not overflow them either, and
+/// 0xFFFFFFFF is no index.
+constexpr std::size_t MAX_LENGTH = 0xFFFFFFEFU;
 
 } // namespace
 
 constinit StringBase<char>::EmptyRep StringBase<char>::empty = {{{1}, 0, 0}, {}};
 
 StringBase<char>::Rep *StringBase<char>::NewRep(std::size_t capacity, std::size_t extra) {
-    if (capacity > LONGEST)
+    if (capacity > MAX_LENGTH)
         throw std::length_error("Basis::StringBase: text too long");
     void *const memory = std::malloc(sizeof(Rep) + capacity + 1 + extra);
     if (!memory)
@@ -35,6 +39,7 @@ StringBase<char>::Rep *StringBase<char>::NewRep(std::size_t capacity, std::size_
     return new (memory) Rep{{1}, 0, static_cast<unsigned int>(capacity)};
 }
 
+/// The room begins after the NUL at the next address that is aligned for a pointer.
 StringBase<char> StringBase<char>::MakeWithRoom(std::string_view text, std::size_t extra,
                                                 void *&room) {
     std::size_t const bytes = sizeof(Rep) + text.size() + 1;
@@ -51,13 +56,15 @@ void StringBase<char>::Release(Rep *rep) noexcept {
         std::free(rep);
 }
 
-/// Makes the text this string's own, `length` characters long, and gives it for writing: the old
-/// characters up to the new length stay, further ones are the caller's to fill.
+/// Makes the text this string's own and `length` characters long, and returns it for writing. The
+/// old characters up to the new length stay; the caller fills the others. A text that is changed
+/// again and again grows by half, so that appending character by character takes linear time; a
+/// text that is shared gets no more than it needs.
 char *StringBase<char>::Writable(std::size_t length) {
     bool const own = rep != &empty.rep && rep->owners.load(std::memory_order_acquire) == 1;
     if (!own || length > rep->capacity) {
         std::size_t const grown = own ? std::size_t{rep->capacity} * 3 / 2 : 0;
-        Rep *const wider = NewRep(length > grown ? length : std::min(grown, LONGEST));
+        Rep *const wider = NewRep(length > grown ? length : std::min(grown, MAX_LENGTH));
         std::memcpy(wider->Text(), rep->Text(), std::min<std::size_t>(length, rep->length));
         Release(rep);
         rep = wider;
@@ -109,7 +116,7 @@ StringBase<char> &StringBase<char>::operator+=(std::string_view text) {
     if (text.empty())
         return *this;
     std::size_t const old = GetLength();
-    // A piece of this very text must outlive the growth: a second owner keeps it.
+    // A piece of this very text must stay valid until it is copied: a second owner keeps the block.
     bool const ownPiece = text.data() >= GetText() && text.data() <= GetText() + old;
     StringBase const keep = ownPiece ? *this : StringBase();
     std::memcpy(Writable(old + text.size()) + old, text.data(), text.size());
@@ -130,7 +137,7 @@ void StringBase<char>::Empty() {
 }
 
 int StringBase<char>::Compare(StringBase const &other, CompareType type) const {
-    if (rep == other.rep)
+    if (rep == other.rep) // copies share their text
         return 0;
     bool const equal = type == COMPARE_IGNORING_CASE
                            ? Ascii::EqualIgnoringCase(View(), other.View())
@@ -243,7 +250,7 @@ bool StringBase<char>::ReadLine(Stream *stream) {
     std::string_view line;
     if (!stream || !stream->ReadLine(line))
         return false;
-    *this = StringBase(line.substr(0, line.find('\0')));
+    *this = StringBase(line.substr(0, line.find('\0'))); // a string holds no NUL
     return true;
 }
 

@@ -1,3 +1,5 @@
+// A date and time in parts. tm counts months from 0 and years from 1900.
+
 #include "vesk_hdl/text/basis/Timestamp.h"
 
 using Text = Basis::StringBase<char>;
@@ -7,6 +9,7 @@ TP_TIMESTAMP::TP_TIMESTAMP() : moment() {
     localtime_r(&now, &moment);
 }
 
+/// gmtime_r fails if the year does not fit an int.
 TP_TIMESTAMP::TP_TIMESTAMP(std::time_t instant) : moment() {
     std::time_t const epoch = 0;
     if (!gmtime_r(&instant, &moment))

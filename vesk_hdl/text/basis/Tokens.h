@@ -6,9 +6,12 @@
 
 namespace Basis {
 
-/// The walk of StringBase::NextTokenRange over any text.
+/// The step of StringBase::NextTokenRange, for any text. Names are split with it as well as lines,
+/// so that both agree about odd texts such as "A((3)".
 inline bool NextToken(std::string_view text, Basis_Range &range, std::string_view separators,
                       bool skipEmpty) {
+    // Where the last step ended is read off the range alone: (1, 0) before the first token, (i + 2,
+    // i) after an empty one whose separator is at i.
     bool const starting = range.first == 1 && range.last == 0;
     bool const afterEmpty = !starting && range.first > range.last;
     std::size_t begin = starting ? 0 : static_cast<std::size_t>(range.last) + (afterEmpty ? 1 : 2);
@@ -16,7 +19,7 @@ inline bool NextToken(std::string_view text, Basis_Range &range, std::string_vie
         begin = text.find_first_not_of(separators, begin);
     if (begin >= text.size())
         return false;
-    // One separator, the common case, is found a block at a time.
+    // The standard library searches for one character, the common case, a block at a time.
     std::size_t end = separators.size() == 1 ? text.find(separators[0], begin)
                                              : text.find_first_of(separators, begin);
     end = std::min(end, text.size());

@@ -2,6 +2,8 @@
 
 namespace Basis {
 
+/// VESK_HDL_VERSION comes from the build and is defined for this source alone, so that a new
+/// version recompiles nothing else.
 StringBase<char> Version::getValue(char const *property) {
     return StringBase<char>(property) == "version" ? VESK_HDL_VERSION : "";
 }

@@ -4,10 +4,11 @@
 
 namespace Basis {
 
-/// Properties of the build.
+/// Properties that are fixed when the library is built.
 class VESK_HDL_API Version {
 public:
-    /// "version" gives the library's version, such as "1.2.3"; anything else the empty string.
+    /// The version of the library, such as "1.2.3", for the property "version" in exactly this
+    /// spelling. Any other property, and null, gives the empty string.
     static StringBase<char> getValue(char const *property);
 };
 

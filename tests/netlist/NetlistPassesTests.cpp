@@ -18,6 +18,10 @@ TEST(NetlistPasses, VhdlDummies) {
              {"port q out; q u1.Y; q u2.Y; q u3.A", "out q <- q_DUMMY\nq_DUMMY: u1.Y u2.Y u3.A\n"},
              {"port q out; q u1.IO", "out q <- q_DUMMY\nq_DUMMY: u1.IO\n"},
              {"port d in; d u1.IO", "in d\nd_DUMMY: u1.IO <- d\n"},
+             // The first dummy takes a pin that went to the in port meanwhile: that is driven no
+             // more.
+             {"port q out; port d in; q u1.Y; d u1.Y; q u2.A",
+              "out q <- q_DUMMY\nin d: u1.Y!\nq_DUMMY: u1.Y u2.A\n"},
              // What is legal stays.
              {"port z bi; z u1.IO; z u2.Y; z u3.Y; port q out; q u1.Y; port d in; d u1.A;"
               "n u2.A; n u3.IO",

@@ -91,8 +91,9 @@ TEST(Netlist, RemoveFreesPinsAndNames) {
 TEST(Netlist, FindsNothingThatWasRenamedAndRemoved) {
     Design design(Short("sig s; sig D(3:0)"));
     Netlist &netlist = design.netlist;
-    for (char const *const name : {"s", "D(3:0)"}) {
-        Signal *const signal = netlist.GetSignal(name);
+    for (char const *const name : {"s", "D(3:0)", "late"}) {
+        Signal *const found = netlist.GetSignal(name);
+        Signal *const signal = found ? found : AddScalar(netlist, name);
         signal->SetName("E(1:0)");
         EXPECT_EQ(signal, netlist.GetSignal(name));
         netlist.Remove(signal);

@@ -126,14 +126,6 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
             FUZZ_EXPECT(told.At(i).View() == members[static_cast<std::size_t>(i)], "member %d", i);
     }
 
-    FUZZ_EXPECT(!Engine::IsVerilogKeyword(raw.c_str()) || Matches(raw, std::regex("[a-z0-9]+")),
-                "keywords are small");
-    FUZZ_EXPECT(!Engine::IsVhdlKeyword(raw.c_str()) || Matches(raw, BASE), "keywords are names");
-    FUZZ_EXPECT(
-        HdlUtilities::AddDummySuffix(raw.c_str()).GetIndexOfString("_DUMMY", Text::COMPARE_EXACT) !=
-            Basis::NOT_FOUND,
-        "a suffix");
-
     std::string const normal = Normal(raw);
     std::size_t const open = normal.find('(');
     bool const hasBase = open != std::string::npos && normal.find(')') != std::string::npos &&

@@ -235,23 +235,6 @@ def adder(c, rng):
         carry = [following]
 
 
-def multiplier(c, rng):
-    a, b = c.signal(rng.randint(3, 5), "input"), c.signal(rng.randint(3, 5), "input")
-    product = c.signal(len(a) + len(b), "output")
-    c.model.append(f"assign {cat(product)} = {cat(a)} * {cat(b)};")
-    high = [0] * len(a)
-    for row, factor in enumerate(reversed(b), 1):
-        carry, partial = [0], c.nets(len(a))
-        sums = (product[:len(a)] if row == len(b) else c.nets(len(a))) + [product[-row]]
-        for place in reversed(range(len(a))):
-            following = c.nets(1) if place else sums[:1]
-            c.cell("AND2", A=[a[place]], B=[factor], Y=[partial[place]])
-            c.cell("FA", A=[partial[place]], B=[high[place]], CI=carry, S=[sums[place + 1]],
-                   CO=following)
-            carry = following
-        high = sums[:-1]
-
-
 def shifter(c, rng):
     width = rng.randint(5, 20)
     stages = rng.randint(2, (width - 1).bit_length())
@@ -435,7 +418,7 @@ class RandomLogic:
         return True
 
 
-KINDS = {"adder": adder, "multiplier": multiplier, "shifter": shifter, "counter": counter,
+KINDS = {"adder": adder, "shifter": shifter, "counter": counter,
          "register_file": register_file, "random_logic": RandomLogic}
 
 

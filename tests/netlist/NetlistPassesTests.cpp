@@ -66,6 +66,19 @@ TEST(NetlistPasses, ANameDoesNotComeBackInALaterStage) {
     EXPECT_EQ("out x_DUMMY(3): u1.Y u2.Y u3.A\nin x\nx_DUMMY: u3.Y <- x\n", Wiring(design.netlist));
 }
 
+/// The dummy of "a" has the name of a port. Where that port's dummy is made later, it also takes
+/// the places of the first dummy. The order is that of a hash table: of these names some come so.
+TEST(NetlistPasses, ACompoundListsTheLastOfTwoDummiesOfOneName) {
+    for (std::string const name : {"a", "b", "c", "d", "e", "f"}) {
+        Design design(CellsAnd("port " + name + "_DUMMY out; port " + name + " out; " + name +
+                               "_DUMMY u1.A; " + name + " u2.A; " + name + ",n m"));
+        design.netlist.CreateVhdlDummySignals();
+        auto const *const compound =
+            dynamic_cast<CompoundBus *>(design.netlist.GetSignal((name + ",n").c_str()));
+        EXPECT_EQ(compound->GetAt(0), design.netlist.GetSignal((name + "_DUMMY").c_str())) << name;
+    }
+}
+
 TEST(NetlistPasses, VerilogDummiesConcernInPortsAlone) {
     Design design(CellsAnd("port q out; q u1.A; q u1.Y; q u2.Y; port d in; d u3.Y"));
     design.netlist.CreateVerilogDummySignals();

@@ -225,16 +225,6 @@ class Circuit:
             wire + ";" for wire in wires] + self.model + ["endmodule"]
 
 
-def adder(c, rng):
-    width = rng.randint(5, 14)
-    a, b, carry = c.signal(width, "input"), c.signal(width, "input"), c.signal(1, "input")
-    total, out = c.signal(width, "output"), c.signal(1, "output")
-    c.model.append(f"assign {cat(out + total)} = {cat(a)} + {cat(b)} + {cat(carry)};")
-    for place, following in zip(reversed(range(width)), c.signal(width - 1) + out):
-        c.cell("FA", A=[a[place]], B=[b[place]], CI=carry, S=[total[place]], CO=[following])
-        carry = [following]
-
-
 def shifter(c, rng):
     width = rng.randint(5, 20)
     stages = rng.randint(2, (width - 1).bit_length())
@@ -418,8 +408,8 @@ class RandomLogic:
         return True
 
 
-KINDS = {"adder": adder, "shifter": shifter, "counter": counter,
-         "register_file": register_file, "random_logic": RandomLogic}
+KINDS = {"shifter": shifter, "counter": counter, "register_file": register_file,
+         "random_logic": RandomLogic}
 
 
 def main():

@@ -1,7 +1,5 @@
 #include "vesk_hdl/netlist/Pin.h"
 
-#include <limits>
-
 #include <gtest/gtest.h>
 
 #include "tests/support/Lines.h"
@@ -161,20 +159,6 @@ TEST(Pin, WhatCopiesShareChangesForOneAlone) {
     EXPECT_STREQ("B", kept->GetName());
     EXPECT_TRUE(kept->GetPolarity() == Polarity::INPUT && kept->HasComment());
     EXPECT_STREQ("1", kept->GetDefaultValue().GetValue());
-}
-
-TEST(Pin, KeepsAnyPolarity) {
-    for (int const bits : {65536, -65536, 32768, std::numeric_limits<int>::min()}) {
-        auto const value = static_cast<Polarity::Value>(bits);
-        Component component("C");
-        component.AddPin("A", value, "");
-        Instance const instance("u", &component);
-        ScalarPin set("B", Polarity::INPUT);
-        set.SetPolarity(value);
-        for (Pin const *const pin :
-             std::vector<Pin const *>{component.GetPin("A"), &set, instance.GetPin("A")})
-            EXPECT_EQ(value, pin->GetPolarity().GetValue());
-    }
 }
 
 TEST(Pin, IsListedOnceHoweverItCameToItsSignal) {

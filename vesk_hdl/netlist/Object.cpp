@@ -8,6 +8,7 @@
 #include "vesk_hdl/text/basis/Counting.h"
 #include "vesk_hdl/text/basis/Functions.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
+#include "vesk_hdl/text/basis/StringEdit.h"
 
 namespace Vesk_Hdl {
 
@@ -33,7 +34,7 @@ Object::Record *Object::NoRecord() {
 template <class Made, class... Model>
 Object::Record *Object::MakeRecord(std::string_view name, Model &&...model) {
     void *room = nullptr;
-    StringBase<char> text = StringBase<char>::MakeWithRoom(name, sizeof(Made), room);
+    StringBase<char> text = Basis::StringEdit::MakeWithRoom(name, sizeof(Made), room);
     auto *const made = new (room) Made(std::forward<Model>(model)...);
     made->name = std::move(text);
     return made;

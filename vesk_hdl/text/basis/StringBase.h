@@ -7,11 +7,6 @@
 
 class Basis_Regexp;
 
-namespace Vesk_Hdl {
-class Object;
-class StringArray;
-} // namespace Vesk_Hdl
-
 /// A pair of character indices, both inclusive. `first` greater than `last` is an empty range;
 /// (1, 0) is where every walk with NextTokenRange starts.
 struct Basis_Range {
@@ -22,6 +17,7 @@ struct Basis_Range {
 namespace Basis {
 
 class Stream;
+struct StringEdit;
 
 /// The answer of every search that finds nothing.
 inline constexpr unsigned int NOT_FOUND = 0xFFFFFFFFU;
@@ -131,8 +127,7 @@ private:
         char terminator[4];
     };
 
-    friend class Vesk_Hdl::Object;
-    friend class Vesk_Hdl::StringArray;
+    friend struct StringEdit;
 
     /// A text that has `extra` bytes behind it in its block, aligned as a pointer is: they last as
     /// long as any copy of the text does.

@@ -277,7 +277,7 @@ std::vector<HostileKind> NetKinds() {
          8000,
          COPIED},
         {"open-pins",
-         "open pins that a write gives nets, and a line behind it",
+         "open pins that a write gives nets, and a line after it",
          {Once(BUFFER + "Set Open Pin false\n"), Each("ADD INSTANCE C U{i}\n"),
           Once(WRITE + "ADD SIGNAL z\n" + WRITE)}},
         {"unknown-pins",

@@ -89,12 +89,12 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
             compound &= Matches(member, BASE) || Bus::IsBusName(Text(member.c_str())) ||
                         BusIndex::IsBusIndexName(Text(member.c_str()));
         FUZZ_EXPECT(CompoundBus::IsCompoundBusName(name) == compound, "compound");
-        StringArray told;
-        CompoundBus::ParseCompoundBusName(name, told, false);
-        FUZZ_EXPECT(static_cast<std::size_t>(told.GetSize()) == (compound ? members.size() : 0),
+        StringArray found;
+        CompoundBus::ParseCompoundBusName(name, found, false);
+        FUZZ_EXPECT(static_cast<std::size_t>(found.GetSize()) == (compound ? members.size() : 0),
                     "members");
-        for (int i = 0; i < told.GetSize(); ++i)
-            FUZZ_EXPECT(told.At(i).View() == members[static_cast<std::size_t>(i)], "member %d", i);
+        for (int i = 0; i < found.GetSize(); ++i)
+            FUZZ_EXPECT(found.At(i).View() == members[static_cast<std::size_t>(i)], "member %d", i);
     }
 
     std::string const normal = Normal(raw);

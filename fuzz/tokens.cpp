@@ -1,5 +1,5 @@
 // The tokenizer of command lines: without quotes against a plain split; with quotes, tokens written
-// down with quotes again read as the same tokens, and each stands where it is said to stand.
+// down with quotes again read as the same tokens, and each has the place that the parser reports.
 
 #include <algorithm>
 #include <vector>

@@ -90,7 +90,7 @@ class Circuit:
         self.lines.append(("ASSIGN CONSTANT", target, self.rng.choice(texts)))
 
     def tie(self, value):
-        """A bit with that constant value, for places where no constant can stand."""
+        """A bit with that constant value, for places that take no constant."""
         for values in [] if self.ties else ([0], [1], self.rng.choices((0, 1), k=5)):
             bits = self.signal(len(values))
             self.constant([bits[0][0].part()], values, not bits[0][0].indices)
@@ -177,7 +177,7 @@ class Circuit:
 
     def mention(self, parts):
         """Names that exist have any spelling. A new one is written as it is mentioned first, and
-        only round brackets tell that it is a part of a bus."""
+        only round brackets make it a part of a bus."""
         key = tuple(signal.name + part for signal, part in parts)
         if key in self.mentioned and not (len(parts) == 1 and parts[0][0].grows):
             return self.word(self.brackets(self.mentioned[key]))

@@ -35,14 +35,14 @@ template <class Operation> int SlotOf(Operation operation) {
     return static_cast<int>(words[0] / static_cast<std::intptr_t>(sizeof(void *)));
 }
 
-/// Its one operation comes behind all slots of the class.
-template <class Class> struct Behind : Class {
+/// Has one more virtual operation, whose slot follows those of the class.
+template <class Class> struct Extended : Class {
     virtual void Next() {}
 };
 
-/// These are the virtual operations of the class, in this order, behind the destructor's two.
+/// These are the virtual operations of the class, in this order, after the two of the destructor.
 template <class Class, class... Operations> void ExpectSlots(Operations... operations) {
-    for (int next = 2; int const slot : {SlotOf(operations)..., SlotOf(&Behind<Class>::Next)})
+    for (int next = 2; int const slot : {SlotOf(operations)..., SlotOf(&Extended<Class>::Next)})
         EXPECT_EQ(next++, slot) << typeid(Class).name();
 }
 
@@ -84,8 +84,8 @@ template <class... Classes> void ExpectSize(std::size_t pointers) {
 /// The classes have these sizes, and no slots of their own.
 template <class Base, class... Classes> void ExpectLike(std::size_t pointers) {
     ExpectSize<Classes...>(pointers);
-    for (int const next : {SlotOf(&Behind<Classes>::Next)...})
-        EXPECT_EQ(SlotOf(&Behind<Base>::Next), next) << typeid(Base).name();
+    for (int const next : {SlotOf(&Extended<Classes>::Next)...})
+        EXPECT_EQ(SlotOf(&Extended<Base>::Next), next) << typeid(Base).name();
 }
 
 TEST(Interface, SizesAndClassesWithoutSlotsOfTheirOwn) {

@@ -18,7 +18,8 @@ Signal *AddScalar(Netlist &netlist, char const *name, Polarity const &polarity =
     return signal;
 }
 
-/// The same order from whole digit runs behind the common beginning.
+/// Computes the order in another way: finds the first difference, then compares whole runs of
+/// digits.
 int ModelCompare(std::string const &a, std::string const &b) {
     auto const at = [](std::string const &text, std::size_t i) {
         return i < text.size() ? static_cast<signed char>(std::toupper(text[i] & 0xFF)) : 0;
@@ -66,7 +67,7 @@ TEST(Netlist, TheNewerOfTwoIsFound) {
     netlist.Add(bus);
     EXPECT_EQ(second, netlist.GetSignal("s"));
     EXPECT_EQ(bus, netlist.GetParentBus("s"));
-    netlist.Remove(first); // takes the name out of the map, whoever bears it
+    netlist.Remove(first); // takes the name out of the map, although the second signal has it
     EXPECT_EQ(nullptr, netlist.GetSignal("s"));
     EXPECT_EQ("S S(3:0) s(1:0)", NamesOf(netlist.GetSignalIterator()));
 }

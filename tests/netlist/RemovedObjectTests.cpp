@@ -1,5 +1,5 @@
-// What was removed is still pointed at, and whoever removed it sees to that. What works on an
-// object's own data does not look there.
+// Pointers to a removed object stay where they are; the client that removed it has to clear them.
+// Operations on the other objects' own data must not follow such a pointer.
 
 #include <deque>
 #include <memory>

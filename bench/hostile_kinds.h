@@ -25,7 +25,7 @@ struct HostileKind {
     char const *inherent = nullptr;
 };
 
-/// Those that were thought up and those that follow from the grammar of each command.
+/// The kinds of the tables, then those that follow from the grammar of each command.
 std::vector<HostileKind> const &GetHostileKinds();
 /// Null if there is none of that name.
 HostileKind const *FindHostileKind(std::string_view name);

@@ -1,4 +1,4 @@
-// Runs the tool and its peers on one netlist, in turn, and tells what the tool needs of their time
+// Runs the tool and its peers on one netlist, in turn, and prints the tool's share of their time
 // and memory. The tool reads commands and writes VHDL and Verilog; the peers read and write Verilog
 // alone. The minimal model does the tool's work without its rules.
 

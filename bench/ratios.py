@@ -1,6 +1,6 @@
 #!/usr/bin/env python3
-"""ratios.py NOW LAST: the steps of two runs, CPU time of the one for each of the other, and NOW
-becomes LAST. Both are what Google Benchmark writes as JSON; a step that only one knows stands alone.
+"""ratios.py NOW LAST: prints the CPU times of the steps of two runs and their ratio, then NOW becomes
+LAST. Both are what Google Benchmark writes as JSON. A step that only one of them has gets no ratio.
 """
 import json
 import os
@@ -21,8 +21,8 @@ if last:
     print(f"\n{'step':<32}{'now':>15}{'last':>15}  ratio")
     for name, (time, unit) in now.items():
         before = last.get(name)
-        told = f"{before[0]:12.0f} {before[1]}{time / before[0]:7.2f}" if before else f"{'-':>15}"
-        print(f"{name:<32}{time:12.0f} {unit}{told}")
+        change = f"{before[0]:12.0f} {before[1]}{time / before[0]:7.2f}" if before else f"{'-':>15}"
+        print(f"{name:<32}{time:12.0f} {unit}{change}")
 with open(sys.argv[2], "w", encoding="utf-8") as kept:
     json.dump({"benchmarks": [{"name": name, "cpu_time": time, "time_unit": unit,
                                "run_type": "iteration"}

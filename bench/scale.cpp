@@ -1,4 +1,4 @@
-// Runs the tool on designs of growing size and tells how its time and memory grow.
+// Runs the tool on designs of growing size and prints how its time and memory grow.
 
 #include <algorithm>
 #include <cstdio>

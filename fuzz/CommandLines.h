@@ -8,5 +8,6 @@
 // What the targets share that read whole command files. Linked into a fuzzer, it mutates their
 // inputs line by line, with lines made from the grammar of the commands.
 
-/// The lines of an input behind some that declare what they use, each up to its first NUL byte.
+/// Lines that declare what the others use, then the lines of an input, each up to its first NUL
+/// byte.
 std::vector<std::string> CommandLines(std::uint8_t const *data, std::size_t size);

@@ -1,6 +1,6 @@
 // The checks of whole command files: they refuse the lines that a run refuses, with the same words,
-// and behind the lines that would write they leave the design as a write does, so that it goes on
-// as in a run and comes to the same text. What is found has its place on a line.
+// and after a line that would write the design is as after a write, so that later lines run alike
+// and the written text is the same. Each finding has a place on a line.
 
 #include <vector>
 
@@ -33,7 +33,7 @@ std::string TextsOf(Model &model) {
 
 int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
     std::vector<std::string> lines = CommandLines(data, size);
-    lines.emplace_back("ADD SIGNAL behindTheLastWrite");
+    lines.emplace_back("ADD SIGNAL afterTheLastWrite");
     Session run("hdlNetlist");
     Capture capture;
     run.GetModel().SetWriteOpener(&capture);

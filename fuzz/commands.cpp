@@ -1,6 +1,6 @@
-// Whole command files, with both languages written into memory. After each line the netlist hangs
-// together; the same lines, read token array by token array, write the same text, and so does a
-// file of them, unless a line is refused, which ends it.
+// Whole command files, with both languages written into memory. After each line the netlist is
+// consistent. The same lines as arrays of tokens write the same text, and so does a file of them,
+// up to the first refused line, which ends it.
 
 #include <vector>
 
@@ -13,7 +13,7 @@ using namespace Vesk_Hdl;
 
 namespace {
 
-/// Runs lines and tells all that came out of it: refusals and texts.
+/// Runs lines and returns all that they gave: messages of refusals and written texts.
 template <class Run> std::string Outcome(std::vector<std::string> lines, Run run) {
     CommandFactory factory;
     Model model(&factory);
@@ -62,16 +62,16 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
             model.Execute(line.c_str());
         } catch (...) {
             fault = Inconsistency(*model.GetNetlist());
-            FUZZ_EXPECT(fault.empty(), "%s, behind %s", fault.c_str(), line.c_str());
+            FUZZ_EXPECT(fault.empty(), "%s, after %s", fault.c_str(), line.c_str());
             throw;
         }
         fault = Inconsistency(*model.GetNetlist());
-        FUZZ_EXPECT(fault.empty(), "%s, behind %s", fault.c_str(), line.c_str());
+        FUZZ_EXPECT(fault.empty(), "%s, after %s", fault.c_str(), line.c_str());
     });
     std::string const byTokens = Outcome(lines, [](Model &model, std::string const &line) {
         model.Execute(StringArray(line.c_str(), " ", true, "\"\"''"));
     });
-    bool const timed = byLine.find("Copyright") != std::string::npos; // a header tells the time
+    bool const timed = byLine.find("Copyright") != std::string::npos; // a header holds the time
     FUZZ_EXPECT(timed || byLine == byTokens, "\n%s\nis not\n%s", byLine.c_str(), byTokens.c_str());
     std::string byFile = byLine;
     try {

@@ -1,5 +1,5 @@
-// What the tool tells of refused lines: every line is answered, the place lies in the line, and
-// both forms can be shown.
+// The diagnostics of refused lines: the place of each lies in its line, and both forms can be
+// shown.
 
 #include <cerrno>
 #include <sstream>
@@ -24,7 +24,7 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
         auto const diagnostic = session.RunLine(line, place);
         if (!diagnostic)
             continue;
-        // One column behind the end, or behind a blank there, is where a word is missing.
+        // A missing word is marked one column after the end, or after a blank there.
         FUZZ_EXPECT(diagnostic->place.column <= line.size() + 2, "%u", diagnostic->place.column);
         FUZZ_EXPECT(diagnostic->place.column > 0 || line.empty(), "no column");
         for (ReportStyle::Format const format : {ReportStyle::TEXT, ReportStyle::JSON}) {

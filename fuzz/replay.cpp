@@ -18,7 +18,8 @@ int main(int argc, char **argv) {
     for (std::filesystem::path const &file : files) {
         std::ifstream stream(file, std::ios::binary);
         std::string const bytes{std::istreambuf_iterator<char>(stream), {}};
-        std::fprintf(stderr, "%s\n", file.c_str()); // the last one told is the one that failed
+        std::fprintf(stderr, "%s\n",
+                     file.c_str()); // the last name is that of the input that failed
         LLVMFuzzerTestOneInput(reinterpret_cast<std::uint8_t const *>(bytes.data()), bytes.size());
     }
     std::fprintf(stderr, "%zu inputs\n", files.size());

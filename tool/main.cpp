@@ -18,8 +18,9 @@
 
 namespace {
 
-/// Standard output may be a file on a full disk.
-int ToldAll(int exitCode) {
+/// The exit code, or 1 if the rest of the output cannot be written: standard output may be a file
+/// on a full disk.
+int FlushStdout(int exitCode) {
     if (std::cout.flush())
         return exitCode;
     std::cerr << "vesk-hdl: error: cannot write to standard output\n";
@@ -44,18 +45,21 @@ int ParseAndRun(int argc, char **argv) {
     try {
         app.parse(argc, argv);
     } catch (CLI::ParseError const &error) {
-        return app.exit(error) == 0 ? ToldAll(ALL_WELL) : USAGE_ERROR;
+        return app.exit(error) == 0 ? FlushStdout(ALL_WELL) : USAGE_ERROR;
     }
-    return ToldAll(action());
+    return FlushStdout(action());
 }
 
 } // namespace
 
 int main(int argc, char **argv) {
-    std::signal(SIGXFSZ, SIG_IGN); // a file that may not grow is an error like any other
+    // Without this the process would be killed when a file meets the limit of `ulimit -f`. Ignored,
+    // the write fails with EFBIG and the user reads which file it was.
+    std::signal(SIGXFSZ, SIG_IGN);
     try {
         return ParseAndRun(argc, argv);
     } catch (std::bad_alloc const &) {
+        // No stream: it might want memory.
         std::fputs("vesk-hdl: error: out of memory\n", stderr);
     } catch (std::exception const &error) {
         std::fprintf(stderr, "vesk-hdl: error: %s\n", error.what());

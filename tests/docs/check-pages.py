@@ -2,12 +2,12 @@
 """check-pages.py TOOL SOURCE PAGE...: what the pages show is what happens.
 
 Each page is run from top to bottom in a shell of its own, in an empty folder with a link `examples`
-and with TOOL in the PATH. Its fenced blocks tell by their info strings what they are:
+and with TOOL in the PATH. The info string of a fenced block says what it is:
 
     console      lines `$ COMMAND` and the output of each; a command fails only if `$ echo $?` follows
     save=NAME    a file that the reader writes
     file=NAME    a file that is there by now, byte for byte
-    part=NAME    lines that stand in a file of SOURCE
+    part=NAME    lines that are part of a file of SOURCE
 
 Any other block is left alone.
 """
@@ -18,8 +18,8 @@ import subprocess
 import sys
 import tempfile
 
-# Lines that take minutes: the tool that is built already stands in for the one that they build.
-STAND_INS = {
+# Lines that take minutes, with what runs in their place: the tool that is built already is used.
+REPLACED = {
     "cmake --build --preset release > build.log":
         'mkdir -p build/release/tool && ln -s "$TOOL" build/release/tool/vesk-hdl',
 }
@@ -44,7 +44,7 @@ def check(tool, source, page):
         os.symlink(source + "/examples", room + "/examples")
 
         def step(line, command, output):
-            script.append(f"{STAND_INS.get(command, command)}\n__status=$?\n"
+            script.append(f"{REPLACED.get(command, command)}\n__status=$?\n"
                           f"printf '{MARK}%d{MARK}' $__status; (exit $__status)\n")
             expected.append((line, command, output))
 

@@ -74,9 +74,9 @@ TEST(CommandLanguage, EachKeywordRunsOnJustEnoughArgumentsAndNeedsAModel) {
 }
 
 struct AttrRow {
-    char const *words;   ///< what may stand behind keyword and owner, several between semicolons
+    char const *words;   ///< after keyword and owner; several lines are separated by semicolons
     char const *message; ///< null for invalid arguments
-    char const *attrs;   ///< afterwards, of U or behind it; null if all are as they were
+    char const *attrs;   ///< afterwards: U and those after it, or all; null if nothing changed
 };
 
 void ExpectAttrs(std::string const &family, std::vector<AttrRow> const &rows) {
@@ -220,7 +220,7 @@ TEST(CommandLanguage, Options) {
     }
 }
 
-TEST(CommandReference, ItsExamplesRunAndItsWrongLinesAreRefusedAsTold) {
+TEST(CommandReference, ItsExamplesRunAndItsWrongLinesAreRefusedAsItSays) {
     for (int i = 0; i < CommandReference::GetCount(); ++i) {
         CommandHelp const &help = *CommandReference::GetAt(i);
         SCOPED_TRACE(help.keyword);
@@ -232,8 +232,8 @@ TEST(CommandReference, ItsExamplesRunAndItsWrongLinesAreRefusedAsTold) {
         for (int line = 0; line < lines.GetSize(); ++line)
             EXPECT_EQ(Refusal(design.model, {lines.GetAt(line).GetText()}), "");
         EXPECT_EQ(design.model.GetCommandManager()->GetDoneCommandCount(), lines.GetSize());
-        std::string const told = help.message + std::string(*help.message ? "\n" : "");
-        EXPECT_EQ(Refusal(design.model, {help.wrong}), told);
+        std::string const expected = help.message + std::string(*help.message ? "\n" : "");
+        EXPECT_EQ(Refusal(design.model, {help.wrong}), expected);
         EXPECT_EQ(help.words, Tokens(help.keyword).GetSize());
         EXPECT_EQ(CommandReference::FindFor(Tokens(Lower(help.keyword) + " x")), &help);
         EXPECT_EQ(CommandReference::FindFor(Tokens("'" + Lower(help.keyword) + "'")), &help);

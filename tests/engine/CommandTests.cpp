@@ -10,27 +10,27 @@ using namespace Vesk_Hdl;
 
 namespace {
 
-/// A command that tells the keyword that made it as its refusal.
-template <int N> class TellingCommand : public Command {
+/// A command whose lines are always refused. N distinguishes two creators.
+template <int N> class RefusedCommand : public Command {
 public:
     static inline int alive = 0;
-    explicit TellingCommand(Model *owner) : Command(owner) { ++alive; }
-    ~TellingCommand() override { --alive; }
+    explicit RefusedCommand(Model *owner) : Command(owner) { ++alive; }
+    ~RefusedCommand() override { --alive; }
     bool ParseArguments(StringArray const &tokens) override { return tokens.GetSize() < 9; }
     void Execute() override { GetModel()->AddComponent(nullptr); }
     char const *GetKeyword() const override { return N == 1 ? "100% one" : "two"; }
-    static Command *Make(Model *owner, StringArray const &) { return new TellingCommand(owner); }
+    static Command *Make(Model *owner, StringArray const &) { return new RefusedCommand(owner); }
 };
 
 int CreatorOf(CommandFactory const &factory, char const *line) {
     auto const creator = factory.GetCommandCreator(line);
-    return creator == TellingCommand<1>::Make ? 1 : creator == TellingCommand<2>::Make ? 2 : 0;
+    return creator == RefusedCommand<1>::Make ? 1 : creator == RefusedCommand<2>::Make ? 2 : 0;
 }
 
 TEST(CommandFactory, TheLongestKeywordWins) {
     CommandFactory factory;
-    factory.AddCommandCreator("  TELL   a ", TellingCommand<1>::Make);
-    factory.AddCommandCreator("Tell A b c d", TellingCommand<2>::Make);
+    factory.AddCommandCreator("  TELL   a ", RefusedCommand<1>::Make);
+    factory.AddCommandCreator("Tell A b c d", RefusedCommand<2>::Make);
     using Row = std::pair<char const *, int>;
     for (auto const &[line, creator] :
          {Row{"tell A", 1}, Row{"TELL a b c", 1}, Row{"  tell   a b C d e", 2},
@@ -38,23 +38,23 @@ TEST(CommandFactory, TheLongestKeywordWins) {
           Row{"tell\ta", 0}, Row{"x tell a", 0}, Row{"tell '' a", 0}, Row{"", 0}})
         EXPECT_EQ(creator, CreatorOf(factory, line)) << line;
     factory.AddCommandCreator(StringArray("TELL A", " ", true, nullptr),
-                              TellingCommand<2>::Make); // in place of the former
+                              RefusedCommand<2>::Make); // in place of the former
     EXPECT_EQ(2, CreatorOf(factory, "tell a"));
     CommandFactory copy;
     copy = factory;
-    factory.AddCommandCreator("late", TellingCommand<1>::Make);
+    factory.AddCommandCreator("late", RefusedCommand<1>::Make);
     EXPECT_EQ(1, CreatorOf(copy, "LATE"));
     EXPECT_EQ(nullptr, factory.CreateCommand(nullptr, "unknown"));
     for (int i = 0; i < 40; ++i) // more than a place of the library's keywords has
-        factory.AddCommandCreator(("many k" + std::to_string(i)).c_str(), TellingCommand<1>::Make);
-    factory.AddCommandCreator("MANY K39", TellingCommand<2>::Make);
+        factory.AddCommandCreator(("many k" + std::to_string(i)).c_str(), RefusedCommand<1>::Make);
+    factory.AddCommandCreator("MANY K39", RefusedCommand<2>::Make);
     for (auto const &[line, creator] : {Row{"Many K0", 1}, Row{"many k38 x", 1}, Row{"MANY k39", 2},
                                         Row{"many k40", 0}, Row{"'many k20'", 1}})
         EXPECT_EQ(creator, CreatorOf(factory, line)) << line;
     std::string endless = "word";
     for (int i = 0; i < 100000; ++i)
         endless += " word";
-    factory.AddCommandCreator(endless.c_str(), TellingCommand<1>::Make);
+    factory.AddCommandCreator(endless.c_str(), RefusedCommand<1>::Make);
     EXPECT_EQ(1, CreatorOf(factory, ("'" + endless + "'").c_str()));
 }
 
@@ -89,23 +89,23 @@ TEST(Model, EachLineHasItsOwnTokensAlsoInsideAnother) {
 
 TEST(CommandManager, KeepsWhatRanAndDeletesWhatFailed) {
     Design design;
-    design.factory.AddCommandCreator("tell", TellingCommand<1>::Make);
+    design.factory.AddCommandCreator("tell", RefusedCommand<1>::Make);
     CommandManager &manager = *design.model.GetCommandManager();
     for (auto const &[line, message] :
          {std::pair{"unknown", "Command not find.\n"},
           {"tell", "Invalid Name.\n"},
           {"tell 2 3 4 5 6 7 8 9", "100% one: Invalid Arguments.\n"}}) {
         EXPECT_EQ(message, Refusal(design.model, {line})) << line;
-        EXPECT_EQ(0, TellingCommand<1>::alive) << line;
+        EXPECT_EQ(0, RefusedCommand<1>::alive) << line;
         EXPECT_EQ(0, manager.GetDoneCommandCount()) << line;
     }
-    manager.AddDoneCommand(new TellingCommand<1>(nullptr));
+    manager.AddDoneCommand(new RefusedCommand<1>(nullptr));
     manager.AddDoneCommand(nullptr);
     EXPECT_EQ("", Refusal(design.model, {"noop"}));
     EXPECT_EQ(2, manager.GetDoneCommandCount());
     manager.Clear();
     EXPECT_EQ(0, manager.GetDoneCommandCount());
-    EXPECT_EQ(0, TellingCommand<1>::alive);
+    EXPECT_EQ(0, RefusedCommand<1>::alive);
 }
 
 struct OwnRefusal : Exception {

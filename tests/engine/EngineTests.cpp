@@ -42,6 +42,22 @@ TEST(Engine, ModelsByName) {
     EXPECT_EQ(engine.GetModel(""), engine.GetCurrentModel());
 }
 
+TEST(Engine, TheFirstOfTwoModelsOfOneNameIsFound) {
+    for (int const more : {0, 20}) { // found by a walk, by index
+        Engine engine;
+        for (char const *const name : {"a", "b"})
+            engine.CreateAndAddModel(name, nullptr);
+        for (int i = 0; i < more; ++i)
+            engine.CreateAndAddModel(std::to_string(i).c_str(), nullptr);
+        Model *const first = engine.GetModel("a");
+        Model *const second = engine.GetModel("b");
+        second->SetName("A");
+        EXPECT_TRUE(engine.GetModel("a") == first && !engine.GetModel("b"));
+        EXPECT_TRUE(engine.RemoveModel("a"));
+        EXPECT_EQ(engine.GetModel("a"), second);
+    }
+}
+
 TEST(Model, Names) {
     Model model;
     EXPECT_STREQ("hdlNetlist", model.GetName());

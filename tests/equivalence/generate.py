@@ -90,7 +90,7 @@ class Circuit:
         self.lines.append(("ASSIGN CONSTANT", target, self.rng.choice(texts)))
 
     def tie(self, value):
-        """A bit with that constant value, for places where no constant can stand."""
+        """A bit with that constant value, for places that take no constant."""
         for values in [] if self.ties else ([0], [1], self.rng.choices((0, 1), k=5)):
             bits = self.signal(len(values))
             self.constant([bits[0][0].part()], values, not bits[0][0].indices)
@@ -177,7 +177,7 @@ class Circuit:
 
     def mention(self, parts):
         """Names that exist have any spelling. A new one is written as it is mentioned first, and
-        only round brackets tell that it is a part of a bus."""
+        only round brackets make it a part of a bus."""
         key = tuple(signal.name + part for signal, part in parts)
         if key in self.mentioned and not (len(parts) == 1 and parts[0][0].grows):
             return self.word(self.brackets(self.mentioned[key]))
@@ -223,33 +223,6 @@ class Circuit:
                 f"{signal.way or ''} {kind}{bounds}{signal.name}")
         return [f"module {self.name} ({', '.join(ports)});"] + [
             wire + ";" for wire in wires] + self.model + ["endmodule"]
-
-
-def adder(c, rng):
-    width = rng.randint(5, 14)
-    a, b, carry = c.signal(width, "input"), c.signal(width, "input"), c.signal(1, "input")
-    total, out = c.signal(width, "output"), c.signal(1, "output")
-    c.model.append(f"assign {cat(out + total)} = {cat(a)} + {cat(b)} + {cat(carry)};")
-    for place, following in zip(reversed(range(width)), c.signal(width - 1) + out):
-        c.cell("FA", A=[a[place]], B=[b[place]], CI=carry, S=[total[place]], CO=[following])
-        carry = [following]
-
-
-def multiplier(c, rng):
-    a, b = c.signal(rng.randint(3, 5), "input"), c.signal(rng.randint(3, 5), "input")
-    product = c.signal(len(a) + len(b), "output")
-    c.model.append(f"assign {cat(product)} = {cat(a)} * {cat(b)};")
-    high = [0] * len(a)
-    for row, factor in enumerate(reversed(b), 1):
-        carry, partial = [0], c.nets(len(a))
-        sums = (product[:len(a)] if row == len(b) else c.nets(len(a))) + [product[-row]]
-        for place in reversed(range(len(a))):
-            following = c.nets(1) if place else sums[:1]
-            c.cell("AND2", A=[a[place]], B=[factor], Y=[partial[place]])
-            c.cell("FA", A=[partial[place]], B=[high[place]], CI=carry, S=[sums[place + 1]],
-                   CO=following)
-            carry = following
-        high = sums[:-1]
 
 
 def shifter(c, rng):
@@ -435,8 +408,8 @@ class RandomLogic:
         return True
 
 
-KINDS = {"adder": adder, "multiplier": multiplier, "shifter": shifter, "counter": counter,
-         "register_file": register_file, "random_logic": RandomLogic}
+KINDS = {"shifter": shifter, "counter": counter, "register_file": register_file,
+         "random_logic": RandomLogic}
 
 
 def main():

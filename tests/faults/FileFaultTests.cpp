@@ -41,7 +41,7 @@ std::size_t OpenDescriptors() {
     return static_cast<std::size_t>(std::distance(begin(all), end(all)));
 }
 
-TEST(Faults, AWriteThatFailsIsToldAndLosesNothing) {
+TEST(Faults, AWriteThatFailsIsReportedAndLosesNothing) {
     TempDir folder;
     std::signal(SIGXFSZ, SIG_IGN);
     WriteFile(folder.Path("file"), "");
@@ -94,7 +94,7 @@ TEST(Faults, ReadsWithoutEndLeaveNoDescriptor) {
     EXPECT_TRUE(design.model.Read(folder.Path("good").c_str()));
 }
 
-/// Whom a client names opens the files instead of the library.
+/// The opener that a client sets opens the files instead of the library.
 TEST(Faults, AClientOpensTheFiles) {
     struct Opener : WriteOpener {
         std::string asked;
@@ -115,7 +115,7 @@ TEST(Faults, AClientOpensTheFiles) {
     EXPECT_STREQ(design.model.GetLastWrite().fileName, "elsewhere");
 }
 
-/// Lets blocks pass until it has enough, and keeps what it is asked and told.
+/// Allows blocks of text up to a limit, and records its calls.
 struct Rationing : WriteOpener {
     int Open(char const *, bool) override {
         asked += "open ";

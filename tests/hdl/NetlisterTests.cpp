@@ -122,6 +122,9 @@ TEST(VerilogNetlister, WritesAttributesOfTheComponentUnlessTheInstanceHasThem) {
                         "ADD INSTANCE ATTRIBUTE u2 size 5;"
                         "SET INSTANCE ATTRIBUTE OPTION u2 size -GENERIC=NONE;"
                         "SET COMPONENT ATTRIBUTE OPTION C LATER -SYNATTR=ASSIGN"));
+    auto *const second = new AttributeString("keep", "second"); // of a name only the first counts
+    second->SetSynAttr("ASSIGN");
+    design.netlist.GetComponent("C")->AddAttr(second);
     std::string const text = Written(design).verilog;
     for (auto const &[line, isThere] : {std::pair{"attribute KEEP of u1", false},
                                         {"attribute LATER of u1", true},
@@ -129,6 +132,7 @@ TEST(VerilogNetlister, WritesAttributesOfTheComponentUnlessTheInstanceHasThem) {
                                         {"attribute KEEP of u2", true},
                                         {"defparam u2.", false},
                                         {"attribute KEEP of u3", true},
+                                        {"second", false},
                                         {"defparam u3.SIZE", true}})
         EXPECT_EQ(isThere, text.find(line) != std::string::npos) << line << " in\n" << text;
 }

@@ -1,9 +1,13 @@
-// What a compiled client has built in besides the signatures: virtual slots, sizes, bases, numbers.
+// What a compiled client has built in besides the names of operations, which check-exports
+// compares: virtual slots, sizes, fields, bases, numbers, types of results. What does not compile
+// here breaks clients.
 
+#include <algorithm>
 #include <array>
 #include <bit>
 #include <cstdint>
 #include <cstring>
+#include <type_traits>
 #include <typeinfo>
 
 #include <gtest/gtest.h>
@@ -31,14 +35,14 @@ template <class Operation> int SlotOf(Operation operation) {
     return static_cast<int>(words[0] / static_cast<std::intptr_t>(sizeof(void *)));
 }
 
-/// Its one operation comes behind all slots of the class.
-template <class Class> struct Behind : Class {
+/// Has one more virtual operation, whose slot follows those of the class.
+template <class Class> struct Extended : Class {
     virtual void Next() {}
 };
 
-/// These are the virtual operations of the class, in this order, behind the destructor's two.
+/// These are the virtual operations of the class, in this order, after the two of the destructor.
 template <class Class, class... Operations> void ExpectSlots(Operations... operations) {
-    for (int next = 2; int const slot : {SlotOf(operations)..., SlotOf(&Behind<Class>::Next)})
+    for (int next = 2; int const slot : {SlotOf(operations)..., SlotOf(&Extended<Class>::Next)})
         EXPECT_EQ(next++, slot) << typeid(Class).name();
 }
 
@@ -80,8 +84,8 @@ template <class... Classes> void ExpectSize(std::size_t pointers) {
 /// The classes have these sizes, and no slots of their own.
 template <class Base, class... Classes> void ExpectLike(std::size_t pointers) {
     ExpectSize<Classes...>(pointers);
-    for (int const next : {SlotOf(&Behind<Classes>::Next)...})
-        EXPECT_EQ(SlotOf(&Behind<Base>::Next), next) << typeid(Base).name();
+    for (int const next : {SlotOf(&Extended<Classes>::Next)...})
+        EXPECT_EQ(SlotOf(&Extended<Base>::Next), next) << typeid(Base).name();
 }
 
 TEST(Interface, SizesAndClassesWithoutSlotsOfTheirOwn) {
@@ -164,5 +168,139 @@ static_assert(String::TRIM_BOTH_ENDS == 2 && Basis::Stream::ACCESS_APPEND == 6);
 COUNT(0, L::SYNTHESIS_QRT, L::SYNTHESIS_EXEMPLAR, L::SYNTHESIS_SYNPLICITY, L::SYNTHESIS_SYNOPSYS,
       L::SYNTHESIS_VERILOG2001, L::SYNTHESIS_PRECISION);
 COUNT(10, L::CASE_DEFAULT, L::CASE_UPPER, L::CASE_LOWER);
+
+// The type of a result is not part of an exported name.
+
+template <class Result> struct Giving {
+    template <class C, class... Arguments> constexpr Giving(Result (C::*)(Arguments...) const) {}
+    template <class C, class... Arguments> constexpr Giving(Result (C::*)(Arguments...)) {}
+    template <class... Arguments> constexpr Giving(Result (*)(Arguments...)) {}
+};
+using M = Model;
+using N = Netlist;
+[[maybe_unused]] constexpr Giving<String> STRINGS[] = {&String::Extract,
+                                                       &Basis::FileName::GetTail,
+                                                       &Basis::Version::getValue,
+                                                       &StringArray::GetAt,
+                                                       &StringArray::operator[],
+                                                       &StringArray::Concatenate,
+                                                       &StringSetIterator::operator*,
+                                                       &TextFileOutStream::GetFileName,
+                                                       &TextMemOutStream::GetValue,
+                                                       &M::GetName,
+                                                       &M::GetSourceFileName,
+                                                       &N::GetSourceFileName,
+                                                       &O::GetName,
+                                                       &O::GetComment,
+                                                       &O::GetBaseName,
+                                                       &Polarity::GetValueName,
+                                                       &BitVectorValue::GetValue,
+                                                       &A::GetValueString,
+                                                       &A::GetValueTypeName,
+                                                       &A::GetGeneric,
+                                                       &A::GetSynAttr,
+                                                       &AttributeUser::GetUserType,
+                                                       &AttributeString::GetValue,
+                                                       &AttributeBit::GetValue,
+                                                       &S::GetDummySignalName,
+                                                       &Bus::GetBusSliceName,
+                                                       &BusIndex::GetIndex,
+                                                       &P::GetPolarityName,
+                                                       &Instance::GetComponentName,
+                                                       &HdlUtilities::CurrentTimeString,
+                                                       &HdlUtilities::GetVersion,
+                                                       &HdlUtilities::AddDummySuffix,
+                                                       &HdlUtilities::RemoveQuotes};
+[[maybe_unused]] constexpr Giving<bool> FLAGS[] = {&Engine::UseModel,
+                                                   &Engine::RemoveModel,
+                                                   &Engine::CreateAndAddModel,
+                                                   &Engine::ReadCommandFile,
+                                                   &Engine::WriteCommandFile,
+                                                   &Command::ParseArguments,
+                                                   &CommandManager::CreateAndExecute,
+                                                   &M::Read,
+                                                   &M::Write,
+                                                   &M::AddPin,
+                                                   &M::AddInstance,
+                                                   &M::AddSignal,
+                                                   &M::AddComponent,
+                                                   &M::ConnectSignalToPin,
+                                                   &M::ConnectSignals,
+                                                   &M::AssignConstantToPin,
+                                                   &M::IsModified,
+                                                   &A::SetGeneric,
+                                                   &A::SetSynAttr,
+                                                   &O::IsNamed,
+                                                   &S::IsPort,
+                                                   &S::HasMultiDriver,
+                                                   &S::IsNeededToDeclared,
+                                                   &Bus::IsBusName,
+                                                   &CompoundBus::IsCompoundBusName,
+                                                   &BusIndex::IsBusIndexName,
+                                                   &Instance::GetOpenPin,
+                                                   &StringArray::GetIntAt,
+                                                   &BitVectorValue::HasBaseAndLength,
+                                                   &PtrArray<S *>::Contains,
+                                                   &PtrArray<S *>::Remove,
+                                                   &Iterator<S *>::HasMore,
+                                                   &Basis::File::close,
+                                                   &Basis::strtol};
+[[maybe_unused]] constexpr Giving<int> NUMBERS[] = {&PtrArrayBase::GetSize,
+                                                    &PtrArray<S *>::Add,
+                                                    &PtrArray<S *>::GetIndex,
+                                                    &StringArray::GetSize,
+                                                    &StreamDst::GetIndentLevel,
+                                                    &BitVectorValue::GetBase,
+                                                    &BitVectorValue::GetLength,
+                                                    &S::GetWidth,
+                                                    &CompoundBus::GetSize,
+                                                    &N::GetLongestPortName,
+                                                    &N::GetLongestSignalName,
+                                                    &N::GetLongestPinName,
+                                                    &CommandManager::GetDoneCommandCount,
+                                                    &Basis::stricmp,
+                                                    &Basis::strnicmp};
+[[maybe_unused]] constexpr Giving<Polarity> POLARITIES[] = {&S::GetPortPolarity, &P::GetPolarity};
+[[maybe_unused]] constexpr Giving<BitVectorValue> VALUES[] = {
+    &S::GetConstantValue, &P::GetDefaultValue, &AttributeBitVector::GetBitVectorValue};
+
+// Types and order of the fields that clients set.
+
+using V = HdlOptions::VhdlOption;
+using H = HdlOptions;
+[[maybe_unused]] constexpr bool H::*SWITCHES[] = {&H::writeHeader, &H::portOnePerLine,
+                                                  &H::macroNetlist};
+[[maybe_unused]] constexpr String H::*TEXTS[] = {&H::application, &H::commandStr, &H::device,
+                                                 &H::purpose, &H::reference};
+[[maybe_unused]] constexpr bool V::*VHDL_SWITCHES[] = {
+    &V::suppressConfiguration, &V::flattenBus, &V::useDefaultLibrary,
+    &V::useAttrType,           &V::openPin,    &V::suppressComponent};
+[[maybe_unused]] constexpr StringArray V::*LIBRARIES[] = {&V::libraries, &V::useLibraries};
+[[maybe_unused]] constexpr L::CaseType L::*CASES[] = {&L::signalCase, &L::instanceCase,
+                                                      &L::componentCase};
+constexpr bool Ascend(std::initializer_list<std::size_t> o) { return std::ranges::is_sorted(o); }
+static_assert(Ascend({offsetof(H, vhdlOption), offsetof(H, verilogOption), offsetof(H, writeHeader),
+                      offsetof(H, application), offsetof(H, commandStr), offsetof(H, device),
+                      offsetof(H, purpose), offsetof(H, reference), offsetof(H, portOnePerLine),
+                      offsetof(H, macroNetlist)}));
+static_assert(Ascend({offsetof(V, suppressConfiguration), offsetof(V, flattenBus),
+                      offsetof(V, useDefaultLibrary), offsetof(V, libraries),
+                      offsetof(V, useLibraries), offsetof(V, useAttrType), offsetof(V, openPin),
+                      offsetof(V, suppressComponent)}));
+static_assert(Ascend({offsetof(L, synthesisType), offsetof(L, signalCase),
+                      offsetof(L, instanceCase), offsetof(L, componentCase),
+                      offsetof(L, includes)}));
+
+// Bases, and what is abstract.
+
+template <class... C> constexpr bool AreAbstract = (std::is_abstract_v<C> && ...);
+template <class Base, class... C> constexpr bool Extend = (std::is_base_of_v<Base, C> && ...);
+static_assert(AreAbstract<Command, StreamDst, O, A, S, P>);
+static_assert(Extend<O, A, S, P, Component, Instance, N> &&
+              Extend<AttributeHolder, S, P, Component, Instance, N> &&
+              Extend<S, ScalarSignal, Bus, BusSlice, BusIndex, CompoundBus> &&
+              Extend<P, ScalarPin, BusPin, BusIndexPin> && Extend<Basis::Exception, Exception> &&
+              Extend<OutStream, TextFileOutStream, TextMemOutStream> &&
+              Extend<PtrArrayBase, PtrArray<S *>> && Extend<PtrArray<S *>, OwnPtrArray<S *>>);
 
 } // namespace

@@ -18,7 +18,7 @@ std::unique_ptr<Attribute> Make(char const *type, char const *name, char const *
 
 TEST(Attribute, ValuesOfTheSevenTypes) {
     struct Row {
-        char const *type, *values; ///< what is given, and what is told
+        char const *type, *values; ///< what is set, and what GetValueString returns
         char const *ofNull;
     };
     for (Row const &row :
@@ -93,7 +93,8 @@ TEST(AttributeHolder, CopiesAreDeep) {
     target.AddAttr(new AttributeString("C", ""));
     Iterator<Attribute *> walk = target.GetAttrIterator();
     target = source;
-    ASSERT_TRUE(walk.HasMore()); // the walk is over the holder's array, whatever stands in it
+    ASSERT_TRUE(
+        walk.HasMore()); // an iterator stays at the holder's array when its elements are replaced
     EXPECT_STREQ("A", walk.Current()->GetName());
     target = *&target;
     EXPECT_EQ("A=x NONE NONE; B()=y NONE NONE", AttrsOf(target));

@@ -117,7 +117,7 @@ TEST(Names, WidthsAndDirections) {
          {Row{"D(3:0)", 4, true}, Row{"D(0:3)", 4, false}, Row{"D(2:2)", 1, false},
           Row{"D(3:-3)", 0, false}, // in an object a name loses its hyphens
           Row{"D", 0, false}, Row{"D(2147483646:0)", 2147483647, true},
-          Row{"D(2147483647:0)", 2147483647, true}, // all an int can tell
+          Row{"D(2147483647:0)", 2147483647, true}, // the largest int
           Row{"D(2147483648:2147483647)", 2147483647, false}}) {
         Bus const bus(name);
         BusPin const pin(name, Polarity::INPUT);

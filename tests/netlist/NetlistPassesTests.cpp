@@ -18,6 +18,10 @@ TEST(NetlistPasses, VhdlDummies) {
              {"port q out; q u1.Y; q u2.Y; q u3.A", "out q <- q_DUMMY\nq_DUMMY: u1.Y u2.Y u3.A\n"},
              {"port q out; q u1.IO", "out q <- q_DUMMY\nq_DUMMY: u1.IO\n"},
              {"port d in; d u1.IO", "in d\nd_DUMMY: u1.IO <- d\n"},
+             // The first dummy takes a pin that went to the in port meanwhile: that is driven no
+             // more.
+             {"port q out; port d in; q u1.Y; d u1.Y; q u2.A",
+              "out q <- q_DUMMY\nin d: u1.Y!\nq_DUMMY: u1.Y u2.A\n"},
              // What is legal stays.
              {"port z bi; z u1.IO; z u2.Y; z u3.Y; port q out; q u1.Y; port d in; d u1.A;"
               "n u2.A; n u3.IO",
@@ -60,6 +64,19 @@ TEST(NetlistPasses, ANameDoesNotComeBackInALaterStage) {
                            "x_DUMMY(3) u3.A; x u3.Y"));
     design.netlist.CreateVhdlDummySignals();
     EXPECT_EQ("out x_DUMMY(3): u1.Y u2.Y u3.A\nin x\nx_DUMMY: u3.Y <- x\n", Wiring(design.netlist));
+}
+
+/// The dummy of "a" has the name of a port. Where that port's dummy is made later, it also takes
+/// the places of the first dummy. The order is that of a hash table: of these names some come so.
+TEST(NetlistPasses, ACompoundListsTheLastOfTwoDummiesOfOneName) {
+    for (std::string const name : {"a", "b", "c", "d", "e", "f"}) {
+        Design design(CellsAnd("port " + name + "_DUMMY out; port " + name + " out; " + name +
+                               "_DUMMY u1.A; " + name + " u2.A; " + name + ",n m"));
+        design.netlist.CreateVhdlDummySignals();
+        auto const *const compound =
+            dynamic_cast<CompoundBus *>(design.netlist.GetSignal((name + ",n").c_str()));
+        EXPECT_EQ(compound->GetAt(0), design.netlist.GetSignal((name + "_DUMMY").c_str())) << name;
+    }
 }
 
 TEST(NetlistPasses, VerilogDummiesConcernInPortsAlone) {

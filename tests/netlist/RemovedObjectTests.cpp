@@ -1,5 +1,5 @@
-// What was removed is still pointed at, and whoever removed it sees to that. What works on an
-// object's own data does not look there.
+// Pointers to a removed object stay where they are; the client that removed it has to clear them.
+// Operations on the other objects' own data must not follow such a pointer.
 
 #include <deque>
 #include <memory>
@@ -109,12 +109,17 @@ TEST(RemovedSignal, CompoundsPinsAndLinksTakeItAsItIs) {
 
 /// The slice that takes the place of a widened bus is the netlist's until a client removes it.
 TEST(RemovedSignal, MayBeTheSliceOfAWidenedBus) {
-    Design design(Short("sig D(3:0); D(7:0) n"));
-    Bus *const wide = design.netlist.GetParentBus("D");
+    Design design(Short("sig a; sig b; sig D(3:0); D(7:0) n"));
+    Netlist &netlist = design.netlist;
+    netlist.SortNetlist();
+    Bus *const wide = netlist.GetParentBus("D");
     Signal *const slice = wide->GetBusSliceIterator().Current();
     wide->RemoveBusSlice(slice);
-    design.netlist.Remove(slice);
-    EXPECT_EQ("D(7:0) <- n\nn\n", Wiring(design.netlist));
+    netlist.Remove(slice);
+    netlist.GetSignal("a")->SetName("z");
+    netlist.SortNetlist(); // which moves "b" from the place where the last removal saw it
+    netlist.Remove(netlist.GetSignal("b"));
+    EXPECT_EQ("D(7:0) <- n\nn\nz\n", Wiring(netlist));
 }
 
 /// Each level lists the one below it twice: what looks below a member never ends.

@@ -113,7 +113,7 @@ TEST(Signal, ACommentMayBeItsName) {
 /// A walk leaves out a compound that it is in already.
 TEST(Signal, ACompoundMayBeInItself) {
     Bits bits;
-    CompoundBus own("A,own"), outer("A,a"), inner("B,b");
+    CompoundBus own("A,own"), outer("A,a"), inner("B,b"), above("C,c");
     for (Signal *const member : std::vector<Signal *>{&bits.scalar, &own})
         own.AddBusMember(member);
     for (Signal *const member : std::vector<Signal *>{&inner, &bits.lower})
@@ -122,10 +122,13 @@ TEST(Signal, ACompoundMayBeInItself) {
         inner.AddBusMember(member);
     inner.SetAt(0, &bits.scalar);
     inner.SetAt(2, &outer);
+    for (Signal *const member : std::vector<Signal *>{&outer, &bits.lower})
+        above.AddBusMember(member);
     using Row = std::tuple<CompoundBus *, int, int, char const *>;
     for (auto const &[compound, size, width, dummy] :
          {Row{&own, 2, 1, "A_DUMMY"}, Row{&outer, 2, 6, "A_DUMMY,D_DUMMY(3:0),a_DUMMY"},
-          Row{&inner, 3, 6, "A_DUMMY,D_DUMMY(3:0),a_DUMMY"}}) {
+          Row{&inner, 3, 6, "A_DUMMY,D_DUMMY(3:0),a_DUMMY"},
+          Row{&above, 2, 7, "A_DUMMY,D_DUMMY(3:0),a_DUMMY,a_DUMMY"}}) {
         SCOPED_TRACE(compound->GetName());
         EXPECT_EQ(size, compound->GetSize());
         EXPECT_EQ(width, compound->GetWidth());
@@ -188,11 +191,14 @@ TEST(Signal, LongListsStillRefuseWhatTheyHold) {
         ForEach(s.GetPinIterator(), [&n](Pin *) { ++n; });
         return n;
     };
+    signal.Connect(&other);
     for (int i = 0; i < 100000; ++i)
         signal.Connect(&pins.emplace_back("p", Polarity::INPUT));
     for (ScalarPin &pin : pins)
         signal.Connect(&pin);
     signal.Disconnect(&pins[70000]);
+    signal.Disconnect(&other);
+    EXPECT_FALSE(signal.GetSignalIterator().HasMore());
     EXPECT_EQ(99999, count(signal));
     signal.Connect(&pins[70000]); // gone from the index, too
     other.CloneConnection(&signal);

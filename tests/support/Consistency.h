@@ -4,9 +4,9 @@
 
 #include "vesk_hdl/Vesk_Hdl.h"
 
-/// Walks over everything that hangs together in a netlist and tells the first thing that is not as
-/// it must be between two commands; "" if all is well. Under an address sanitizer the walk also
-/// finds each pointer that outlived its object.
+/// Walks over all objects of a netlist and what they point at. The result is the first thing that
+/// is not as it must be between two commands; "" if there is none. Under an address sanitizer the
+/// walk also finds each pointer that outlived its object.
 ///
 /// - A name finds an object of that name, whatever its case; the object is one of the array's.
 /// - The signal of a pin lists the pin, unless the library made it and joined them one way: for a

@@ -37,7 +37,7 @@ Lines Pieces(std::string const &text);
 std::vector<std::pair<std::string, std::string>> Pairs(std::string const &text);
 
 /// Lines from a short form of them: "port q out; sig n; q u1.A; u1.B = 1" declares a port and a
-/// signal, connects and assigns. Lines that begin with ADD or SET stand as they are.
+/// signal, connects and assigns. Lines that begin with ADD or SET are taken unchanged.
 Lines Short(std::string const &text);
 
 /// A component CELL with pins of all forms and directions, and its instances u1, u2 and u3.

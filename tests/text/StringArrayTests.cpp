@@ -10,7 +10,7 @@ using Text = Basis::StringBase<char>;
 
 namespace {
 
-/// All strings, a bar behind each.
+/// All strings, a bar after each.
 std::string Bars(StringArray const &array) {
     std::string text;
     for (int i = 0; i < array.GetSize(); ++i)
@@ -43,7 +43,7 @@ TEST(StringArray, ParsesCommandLines) {
     }
 }
 
-TEST(StringArray, TellsWhereTokensStand) {
+TEST(StringArray, ReportsThePlacesOfTokens) {
     for (auto const &[text, skipEmpty, expected] :
          {std::tuple{"  a bc  d", true, "2-2 4-5 8-8 "},
           {R"(a "b c" ''  'd)", true, "0-0 2-6 8-9 12-13 "},
@@ -51,10 +51,10 @@ TEST(StringArray, TellsWhereTokensStand) {
           {R"("a"  b)", false, "0-2 5-4 5-5 "}}) {
         std::vector<Basis_Range> places;
         StringArray().Parse(text, " ", skipEmpty, "\"\"''", &places);
-        std::string told;
+        std::string found;
         for (Basis_Range const &place : places)
-            told += std::to_string(place.first) + "-" + std::to_string(place.last) + " ";
-        EXPECT_EQ(told, expected) << text;
+            found += std::to_string(place.first) + "-" + std::to_string(place.last) + " ";
+        EXPECT_EQ(found, expected) << text;
     }
 }
 

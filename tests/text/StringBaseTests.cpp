@@ -18,7 +18,8 @@ namespace {
 constexpr Text::CompareType EXACT = Text::COMPARE_EXACT;
 constexpr Text::CompareType NO_CASE = Text::COMPARE_IGNORING_CASE;
 
-/// All tokens, a bar behind each. `inTurn` has the separator of each call; the last one stays.
+/// All tokens, a bar after each. `inTurn` has the separator of each call; later calls use the last
+/// one.
 std::string Walk(Text const &text, std::string const &inTurn, bool skipEmpty) {
     std::string tokens;
     Basis_Range range = {1, 0};
@@ -37,7 +38,7 @@ TEST(StringBase, WalksFromTokenToToken) {
          {Row{"  ", " ", true, ""}, Row{"inst.pin", ".", true, "inst|pin|"},
           Row{"  a  b ", " ", true, "a|b|"}, Row{"A(3:0)", "(:)", true, "A|3|0|"},
           Row{"A(:3:0)", "(:)", true, "A|3|0|"}, Row{"x y.z", " :", true, "x|y.z|"},
-          // The search goes on behind the one separator that ended the token.
+          // The search goes on after the one separator that ended the token.
           Row{"a  b:c", " :", true, "a| b|c|"}, Row{"", ",", false, ""}, Row{",", ",", false, "|"},
           Row{",,", ",", false, "||"}, Row{",a", ",", false, "|a|"}, Row{"a,", ",", false, "a|"},
           Row{"a,,,b", ",", false, "a|||b|"}, Row{",a:b", ",:", false, "|a|b|"}})

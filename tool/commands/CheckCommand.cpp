@@ -1,3 +1,5 @@
+// The command line of `check`, and the loop over its files. What is found is decided in tool/check.
+
 #include "tool/commands/CheckCommand.h"
 
 #include <algorithm>
@@ -30,7 +32,7 @@ struct CheckOptions {
     ReportOptions report;
 };
 
-/// Whether the user wants nothing told of a check.
+/// Whether a check is switched off: by --off, or by --only for others.
 bool IsOff(CheckOptions const &options, Checks::Row const &row) {
     auto const isIn = [&row](std::vector<std::string> const &names) {
         return std::find(names.begin(), names.end(), row.name) != names.end();
@@ -38,7 +40,8 @@ bool IsOff(CheckOptions const &options, Checks::Row const &row) {
     return isIn(options.off) || (!options.only.empty() && !isIn(options.only));
 }
 
-/// Standard error up to a limit. A message beyond it is left out, and so are all that follow.
+/// Standard error up to a limit. The first message that would pass it is left out as a whole, and
+/// so are all that follow: half a JSON object would be of no use.
 class LimitedError : public std::streambuf {
 public:
     /// The most bytes; 0 for no limit.
@@ -69,8 +72,9 @@ int CheckFiles(CheckOptions const &options, LimitedError &output, Place &place) 
                                                                         : Checks::NO_LANGUAGE;
     std::ostream stream(&output);
     Reporter reporter(stream, options.report.GetStyle());
-    // The design dies with the process: to take it apart object by object would only cost time.
-    // "used", so that no optimizer takes away what a search for leaks starts from.
+    // Never deleted: the system frees the memory of a process faster than the destructors of a
+    // million objects. The pointer is kept ("used") so that a leak checker still reaches the
+    // design.
     [[gnu::used]] static Checks::Checker *lasting = nullptr;
     Checks::Checker &checker = *(lasting = new Checks::Checker(options.modelName, requested));
     for (Checks::Row const &row : Checks::All())
@@ -85,6 +89,8 @@ int CheckFiles(CheckOptions const &options, LimitedError &output, Place &place) 
         std::string line;
         while (!output.IsBeyondLimit() && reader.Next(line)) {
             ++place.line;
+            // A refused line is reported and the check goes on: what follows may be wrong because
+            // of it, but most is not.
             if (auto const diagnostic = checker.RunLine(line, place))
                 refuse(*diagnostic);
         }
@@ -151,7 +157,7 @@ int List(bool asMarkdown) {
 
 void AddCheckCommand(CLI::App &app, Action &action) {
     CLI::App &check = *app.add_subcommand(
-        "check", "Tell what will be illegal, wrong or suspicious in the written text");
+        "check", "Report what will be illegal, wrong or suspicious in the written text");
     auto const options = std::make_shared<CheckOptions>();
     check.add_option("FILE", options->files, "Command files, in order; '-' is standard input");
     AddModelOption(check, options->modelName);

@@ -2,5 +2,5 @@
 
 #include "tool/commands/Common.h"
 
-/// `check`: what of the written text will be illegal, wrong or suspicious, told without a write.
+/// `check`: reports what of the written text will be illegal, wrong or suspicious, without a write.
 void AddCheckCommand(CLI::App &app, Action &action);

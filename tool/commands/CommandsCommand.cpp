@@ -1,3 +1,6 @@
+// Prints the reference of the command language from the help that the library has for each command.
+// docs/commands.md is this output.
+
 #include "tool/commands/CommandsCommand.h"
 
 #include <algorithm>
@@ -35,7 +38,7 @@ std::string GrammarOf(CommandHelp const &command) {
     return std::string(command.keyword) + (*command.grammar ? " " : "") + command.grammar;
 }
 
-/// A text with a word in front of it, wrapped into lines that stand under each other.
+/// Prints a text after a word, wrapped into lines that begin in the same column.
 void PrintWrapped(std::ostream &stream, std::string const &head, std::string const &text) {
     std::size_t column = head.size();
     stream << head;
@@ -61,6 +64,7 @@ void PrintScreen(std::ostream &stream, CommandHelp const &command) {
     for (ArgumentHelp const &help : arguments)
         width = std::max(width, std::string_view(help.word).size());
     for (ArgumentHelp const &help : arguments) {
+        // Meanings are aligned below each other.
         std::string word = std::string("    ") + help.word;
         word.resize(4 + width + 2, ' ');
         PrintWrapped(stream, word, help.meaning);
@@ -130,6 +134,8 @@ bool PrintCommands(std::ostream &stream, std::vector<std::string> const &words) 
     std::string asked;
     for (std::string const &word : words)
         asked += (asked.empty() ? "" : " ") + word;
+    // A whole keyword shows that command alone, although others may hold its words: "ADD COMPONENT"
+    // is also in "ADD COMPONENT PIN COMMENT".
     CommandHelp const *const exact = CommandReference::Find(asked.c_str());
     for (int i = 0; i < CommandReference::GetCount(); ++i) {
         CommandHelp const &command = *CommandReference::GetAt(i);

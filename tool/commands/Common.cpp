@@ -1,3 +1,5 @@
+// What the subcommands share: options, their defaults and the messages that are not about a line.
+
 #include "tool/commands/Common.h"
 
 #include <charconv>
@@ -14,6 +16,8 @@ ReportStyle ReportOptions::GetStyle() const {
         char const *const value = std::getenv(name);
         return value && *value;
     };
+    // A user may ask for no colour by NO_COLOR (no-color.org), and a dumb terminal shows escape
+    // sequences as text.
     char const *const terminal = std::getenv("TERM");
     bool const dumb = terminal && std::strcmp(terminal, "dumb") == 0;
     ReportStyle style;
@@ -57,6 +61,8 @@ void AddLimitOptions(CLI::App &command, LimitOptions &options) {
             .add_option(
                 name,
                 [option = name, bytes = size](CLI::results_t const &given) {
+                    // 0 means that there is no limit, and is what BytesOf gives for a text that is
+                    // no size: a user who asks for no memory at all made a mistake.
                     *bytes = BytesOf(given.back());
                     if (*bytes == 0)
                         throw CLI::ValidationError(option, given.back() +
@@ -68,6 +74,7 @@ void AddLimitOptions(CLI::App &command, LimitOptions &options) {
             ->type_name("SIZE");
 }
 
+/// For builds that have to give the same bytes again (reproducible-builds.org).
 std::optional<std::time_t> HeaderTime() {
     constexpr char NAME[] = "SOURCE_DATE_EPOCH";
     constexpr std::time_t LAST = 253402300799; // of the year 9999: the header has four digits
@@ -84,6 +91,7 @@ std::optional<std::time_t> HeaderTime() {
 
 std::function<std::string(char const *)> EndMessages(ReportStyle style, char const *eraser,
                                                      char const *consequence) {
+    // The message is made before any signal comes: a handler may not format text.
     return [=](char const *signal) {
         std::ostringstream text;
         text << eraser;

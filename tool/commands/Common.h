@@ -22,7 +22,7 @@ constexpr int USAGE_ERROR = 2;
 /// Names standard input or output among files.
 constexpr char STANDARD_STREAM[] = "-";
 
-/// How the user wants to be told what is wrong.
+/// How messages are shown to the user.
 struct ReportOptions {
     std::string format = "text";
     std::string colour = "auto";

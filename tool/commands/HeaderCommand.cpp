@@ -24,7 +24,10 @@ struct HeaderOptions {
 int WriteHeader(HeaderOptions const &options) {
     ReportStyle const style = ReportOptions().GetStyle();
     Signals::EndProgram(EndMessages(style, "", "; the file is as it was before"));
+    // The same way to the disk as that of a WRITE line: the old file stays until the new one is
+    // complete.
     OutputFiles outputs;
+    // "-" is a name for this tool only; the library would make a file of that name.
     if (options.file == STANDARD_STREAM)
         outputs.SendNextToStandardOutput();
     TextFileOutStream stream(options.file.c_str());
@@ -35,6 +38,7 @@ int WriteHeader(HeaderOptions const &options) {
     header.Write(options.time ? HdlUtilities::TimeString(*options.time)
                               : HdlUtilities::CurrentTimeString());
     stream.Close();
+    // What the write command of the library would report.
     WriteStatus status;
     status.error = stream.GetError();
     outputs.Finish(status);

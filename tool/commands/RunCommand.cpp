@@ -1,3 +1,5 @@
+// The command line of `run`, and one run from the first line to the last file.
+
 #include "tool/commands/RunCommand.h"
 
 #include <cstring>
@@ -40,8 +42,8 @@ struct RunOptions : SessionOptions {
     ReportOptions report;
 };
 
-/// A name of a file that stays right when the current folder changes.
-std::string Lasting(std::string const &file) {
+/// The absolute name of a file, which stays right when the current folder changes.
+std::string ToAbsolute(std::string const &file) {
     if (file.empty() || file == STANDARD_STREAM)
         return file;
     std::error_code error;
@@ -70,7 +72,8 @@ void RefuseToOverwrite(RunOptions const &options) {
     for (std::string const &output : {options.vhdlFile, options.verilogFile})
         if (output != STANDARD_STREAM && inputs.Holds(output))
             throw CLI::ValidationError(output, "is an input, too");
-    std::error_code error; // a terminal or the null device takes both
+    // A terminal and the null device take the text of both languages.
+    std::error_code error;
     if (!fs::is_character_file(options.vhdlFile, error) &&
         IsSamePlace(options.vhdlFile, options.verilogFile))
         throw CLI::ValidationError(options.verilogFile, "is to hold the VHDL, too");
@@ -92,6 +95,8 @@ public:
         try {
             memory.Apply();
             good = Prepare() && RunFiles();
+            // With --keep-going the files are written in spite of refused lines: the user asked for
+            // what can be had.
             if (good || (session && options.keepGoing && !outputs.IsBeyondLimit()))
                 good &= WriteFiles();
         } catch (std::bad_alloc const &) {
@@ -126,12 +131,13 @@ private:
         return false;
     }
 
-    /// Makes names lasting, enters the output folder and makes the design.
+    /// Makes names absolute, enters the output folder and makes the design.
     bool Prepare() {
+        // First, as the names are relative to the folder from which the user started the tool.
         for (std::string const &file : options.files)
-            paths.push_back(Lasting(file));
-        options.vhdlFile = Lasting(options.vhdlFile);
-        options.verilogFile = Lasting(options.verilogFile);
+            paths.push_back(ToAbsolute(file));
+        options.vhdlFile = ToAbsolute(options.vhdlFile);
+        options.verilogFile = ToAbsolute(options.verilogFile);
         try {
             if (!options.restriction.folder.empty())
                 outputs.Restrict(options.restriction);
@@ -139,6 +145,8 @@ private:
             return Fail(About(options.restriction.folder,
                               "cannot confine files to it: " + error.code().message()));
         }
+        // All command files, also those that are read later, are safe from the write commands of
+        // each.
         for (std::string const &path : paths)
             inputs.Add(path);
         outputs.Protect(&inputs);
@@ -150,12 +158,13 @@ private:
         if (error)
             return Fail(
                 About(options.outputDir, "cannot enter the output folder: " + error.message()));
-        // The design dies with the process: to take it apart object by object would only cost time.
-        // "used", so that no optimizer takes away what a search for leaks starts from.
+        // Never deleted: the system frees the memory of a process faster than the destructors of a
+        // million objects. The pointer is kept ("used") so that a leak checker reaches the design.
         [[gnu::used]] static Session *lasting = nullptr;
         session = lasting = new Session(options.modelName);
+        // Hints are not shown in a quiet run, and some of them search the design.
         session->SetHints(!options.quiet);
-        outputs.SetListener([this](char const *file) { progress.TellWrite(file); });
+        outputs.SetListener([this](char const *file) { progress.ShowWrite(file); });
         session->GetModel().SetWriteOpener(&outputs);
         session->GetModel().GetOptions()->headerTime = options.headerTime;
         return true;
@@ -180,6 +189,7 @@ private:
         bool good = true;
         while (GoesOn(good) && reader.Next(line)) {
             ++place.line;
+            // The end of the line counts too, so that the bar reaches 100 %.
             progress.CountLine(line.size() + 1);
             if (std::optional<Diagnostic> const diagnostic = session->RunLine(line, place))
                 good = Fail(*diagnostic);
@@ -218,6 +228,8 @@ private:
             return number;
         };
         auto const any = [](auto) { return true; };
+        // A bit of a port is a port too. Only what is declared counts, so that each port counts
+        // once.
         auto const isPort = [](Signal const *signal) {
             return signal->IsPort() && signal->IsNeededToDeclared();
         };
@@ -230,6 +242,7 @@ private:
             {"ports", std::to_string(count(netlist.GetSignalIterator(), isPort))},
             {"lines", std::to_string(progress.GetLines())},
             {"time", Seconds(progress.GetSeconds())},
+            // ru_maxrss is in units of 1024 bytes.
             {"peak memory", Bytes(static_cast<double>(usage.ru_maxrss) * 1024)}};
         for (auto const &[name, value] : rows)
             std::cerr << std::left << std::setw(12) << name << std::right << std::setw(12) << value
@@ -256,7 +269,7 @@ void AddRunCommand(CLI::App &app, Action &action) {
         ->required();
     AddModelOption(run, options->modelName);
     run.add_option("--vhdl", options->vhdlFile,
-                   "Write the design as VHDL behind the last line; '-' is standard output");
+                   "Write the design as VHDL after the last line; '-' is standard output");
     run.add_option("--verilog", options->verilogFile, "The same as Verilog");
     AddOutputDirOption(run, options->outputDir);
     CLI::Option *const restrict =
@@ -281,9 +294,9 @@ void AddRunCommand(CLI::App &app, Action &action) {
         ->needs(restrict);
     AddLimitOptions(run, options->limits);
     run.add_flag("--keep-going", options->keepGoing,
-                 "Go on after a refused line; the exit code still tells of it");
-    run.add_flag("--stats", options->stats, "Tell the size of the design, time and memory");
-    run.add_flag("--quiet", options->quiet, "Errors a line each, without hints, and no bar");
+                 "Go on after a refused line; the exit code is 1 all the same");
+    run.add_flag("--stats", options->stats, "Print the size of the design, time and memory");
+    run.add_flag("--quiet", options->quiet, "One line for each error, without hints, and no bar");
     run.add_option("--progress", options->progress,
                    "A bar on standard error; 'auto' means on a terminal, when the work lasts")
         ->check(CLI::IsMember({"auto", "always", "never"}))

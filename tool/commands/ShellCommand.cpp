@@ -1,3 +1,6 @@
+// The interactive shell: lines of the user are commands of the library, or one of the few words
+// that the shell itself knows.
+
 #include "tool/commands/ShellCommand.h"
 
 #include <cstdio>
@@ -41,6 +44,8 @@ std::string HistoryFile() {
     char const *const home = std::getenv("HOME");
     if (!(state && *state) && !(home && *home))
         return "";
+    // The XDG base directory specification has this folder for data that outlasts a run and is no
+    // configuration.
     fs::path const folder =
         (state && *state ? fs::path(state) : fs::path(home) / ".local" / "state") / "vesk-hdl";
     std::error_code error;
@@ -56,7 +61,7 @@ char const *DirectionOf(Signal const &signal) {
                                            : "inout";
 }
 
-/// Calls `act` with each object until Ctrl-C.
+/// Calls `act` with each object until Ctrl-C: `show` may print a million lines.
 template <class T, class Act> void Visit(Iterator<T> objects, Act act) {
     for (; objects.HasMore() && !Signals::IsInterrupted(); objects.Advance())
         if (T const object = objects.Current())
@@ -83,12 +88,13 @@ public:
             return SOMETHING_REFUSED;
         }
         Signals::MarkInterrupts(EndMessages(ReportOptions().GetStyle(), "\n", LOST));
-        std::cout << "vesk-hdl " << HdlUtilities::GetVersion() << ", \"help\" tells more\n";
+        std::cout << "vesk-hdl " << HdlUtilities::GetVersion() << "; type \"help\" for help\n";
         LineEditor editor("vesk-hdl> ", HistoryFile(),
                           [this](std::string_view line) { return Complete(line, model); });
         for (;;) {
             std::optional<std::string> const line = editor.Next();
-            bool const interrupted = Signals::IsInterrupted(); // by a signal that no key sent
+            // While a line is edited Ctrl-C is a key: this is a signal from another process.
+            bool const interrupted = Signals::IsInterrupted();
             Signals::ClearInterrupt();
             if (!line && !interrupted)
                 break;
@@ -103,7 +109,8 @@ public:
             ++place.line;
             if (!words.empty() && !RunOwn(words))
                 RunLine(*line);
-            std::cout.clear(); // an interrupt may have kept it from writing
+            // An interrupt may have ended a write to the terminal, which leaves the streams failed.
+            std::cout.clear();
             std::clearerr(stdout);
             Signals::ClearInterrupt();
         }
@@ -112,7 +119,8 @@ public:
     }
 
 private:
-    /// The limit is for the design; the editor of lines is not made to fail.
+    /// The memory limit holds while a command runs. The line editor runs without it, since editline
+    /// does not expect an allocation to fail.
     void RunLine(std::string const &line) {
         std::optional<Diagnostic> diagnostic;
         try {
@@ -160,6 +168,8 @@ private:
             });
         else if (thing == "signals" || thing == "ports")
             Visit(netlist.GetSignalIterator(), [&](Signal *signal) {
+                // A bit of a port is a port too. Only what is declared counts, so that each port is
+                // shown once.
                 if (thing == "signals" || (signal->IsPort() && signal->IsNeededToDeclared()))
                     ShowSignal(*signal);
             });

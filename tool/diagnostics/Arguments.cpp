@@ -1,3 +1,7 @@
+// Matches the tokens of a line with the arguments of its command. The library only says that
+// arguments are invalid; the tool finds out which one, from the same tables that the commands are
+// made from.
+
 #include "tool/diagnostics/Arguments.h"
 
 #include <algorithm>
@@ -12,6 +16,7 @@ namespace {
 bool IsPin(ArgumentKind kind) { return kind == COMPONENT_PIN || kind == INSTANCE_PIN; }
 bool IsName(ArgumentKind kind) { return kind == UPPERCASE_NAMES || kind == LOWERCASE_NAMES; }
 
+/// The point must be followed by the name of a pin: "u1." names none.
 bool NamesPin(std::string_view token) {
     std::size_t const point = FindPinPoint(token);
     return point != token.npos && point + 1 < token.size();
@@ -30,16 +35,21 @@ bool Fits(ArgumentKind kind, std::string_view token) {
         return false;
     if (IsPin(kind))
         return NamesPin(token);
+    // Polarities are matched by their beginnings, so that no list of words can hold them all.
     if (kind == POLARITY)
         return Polarity::GetValue(std::string(token).c_str()) != Polarity::INVALID;
     if (ArgumentHelp const &help = CommandReference::GetArgument(kind); help.fixed)
         return IsChosen(help.choices, token);
+    // The library takes an empty value and an empty comment, but no empty name.
     return !token.empty() || kind == VALUE || kind == TEXT;
 }
 
 } // namespace
 
 std::vector<GivenArgument> MatchArguments(CommandHelp const &command, StringArray const &tokens) {
+    // An optional argument is taken as given if enough tokens are left for the required ones after
+    // it. An attribute type is recognized by its words instead, because the name that follows it
+    // may be followed by a value or not.
     auto required = std::count_if(command.arguments.begin(), command.arguments.end(),
                                   [](Argument const &argument) { return !argument.optional; });
     std::vector<GivenArgument> given;
@@ -71,7 +81,7 @@ std::string HintForUnfit(CommandHelp const &command, Argument const &argument,
         return "";
     if (!IsName(argument.kind))
         return std::string("a ") + help.word + " is " + help.meaning;
-    // Each of the two commands has a word for signals that the other one refuses.
+    // UPPERCASE takes "siganl" and LOWERCASE takes "signal": each refuses the word of the other.
     Vocabulary::Words const words = help.choices[0].words;
     for (ArgumentKind const kind : {UPPERCASE_NAMES, LOWERCASE_NAMES})
         if (IsChosen(CommandReference::GetArgument(kind).choices, token))
@@ -91,6 +101,7 @@ std::vector<NamePart> NamesIn(Argument const &argument, std::string_view token) 
             names.push_back({kind == COMPONENT_PIN ? COMPONENT : INSTANCE, 0, point});
             names.push_back({PIN, point + 1, token.size() - point - 1});
         }
+        // The name of a bundle names its members too: the library may refuse one of them.
         if (kind == SIGNAL) {
             Basis::StringBase<char> const text(token);
             Basis_Range member = {1, 0};

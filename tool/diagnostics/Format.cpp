@@ -5,6 +5,7 @@
 
 namespace {
 
+/// The decimal point is that of the C locale: the tool sets no other one for numbers.
 template <class... Numbers> std::string Print(char const *format, Numbers... numbers) {
     std::array<char, 64> text = {};
     std::snprintf(text.data(), text.size(), format, numbers...);

@@ -1,3 +1,5 @@
+// Hints that search the design: what the user most likely meant, or what is in the way.
+
 #include "tool/diagnostics/Hints.h"
 
 #include "tool/diagnostics/Words.h"
@@ -17,6 +19,7 @@ Pin const *PinOfThatBase(Iterator<Pin *> pins, std::string const &wanted) {
     for (; pins.HasMore() && compared < MAX_PINS_COMPARED; pins.Advance(), ++compared)
         if (Pin const *const pin = pins.Current()) {
             std::string_view const name = pin->GetNameRef().View();
+            // The base name is cut off only where the first letters agree, as it takes memory.
             if (BeginsWith(name, base.View()) &&
                 SameIgnoringCase(pin->GetBaseName().View(), base.View()))
                 return pin;
@@ -37,6 +40,7 @@ std::string HintForMissing(int kind, std::string_view name) {
     case Exception::SIGNAL_NOT_FOUND: {
         Basis::StringBase<char> form(name);
         Object::NormalizeName(form);
+        // A bit never brings its bus into being, so that its bus has to be declared.
         if (!BusIndex::IsBusIndexName(form))
             return "declare it first with ADD SIGNAL or ADD PORT";
         return "declare the bus first: ADD SIGNAL " +
@@ -62,6 +66,8 @@ std::string HintForMissingPin(Model const &model, bool ofInstance, std::string c
 }
 
 std::string HintForTaken(Model const &model, std::string const &name) {
+    // The library refuses a name that a component, an instance or a signal has, and a second bus of
+    // one base name.
     std::pair<char const *, Object const *> const owners[] = {
         {"component", model.GetComponent(name.c_str())},
         {"instance", model.GetInstance(name.c_str())},

@@ -1,3 +1,5 @@
+// Finds keywords for a line that begins with none.
+
 #include "tool/diagnostics/Keywords.h"
 
 #include <algorithm>
@@ -16,6 +18,8 @@ constexpr std::size_t MAX_WORD = 40; ///< no word of a keyword comes near it
 /// The number of edits (a letter more, less, other, or two exchanged) between two texts, case
 /// ignored.
 int Distance(std::string_view left, std::string_view right) {
+    // The table of edit distances (optimal string alignment), of which three rows are enough: an
+    // exchange of two letters looks two rows back.
     std::size_t const width = right.size() + 1;
     std::vector<int> before(width);
     std::vector<int> row(width);
@@ -48,6 +52,7 @@ std::string KeywordPart(StringArray const &tokens) {
 }
 
 std::vector<std::string_view> NextKeywordWords(std::string_view words) {
+    // With a blank at the end only whole words match: "ADD C" does not go on with "OMPONENT".
     std::string const begin = std::string(words) + (words.empty() ? "" : " ");
     std::vector<std::string_view> found;
     for (int i = 0; i < CommandReference::GetCount(); ++i) {
@@ -71,6 +76,9 @@ CommandHelp const *NearestKeyword(std::string_view keywordPart) {
         std::string begin; // as many words as the keyword has
         for (int word = 0; word < candidate.words && word < static_cast<int>(given.size()); ++word)
             (begin += word > 0 ? " " : "") += given[static_cast<std::size_t>(word)];
+        // More edits than a third of the letters make another word. A later keyword has to be
+        // nearer than the one that was found before, so that the first of two equally near ones is
+        // shown.
         int const length = static_cast<int>(std::strlen(candidate.keyword));
         int const farthest = nearest ? std::min(length / 3, least - 1) : length / 3;
         if (std::abs(static_cast<int>(begin.size()) - length) > farthest)

@@ -1,5 +1,7 @@
 #include "tool/diagnostics/LineTokens.h"
 
+/// The library's own parser reports the places, so that a caret is never beside the token that was
+/// refused.
 void LineTokens::Read(std::string const &line) { tokens.ParseLine(line.c_str(), &places); }
 
 std::string_view LineTokens::At(int index) const { return tokens.At(index).View(); }

@@ -1,3 +1,6 @@
+// Explains a refused line: marks the token that the refusal is about and adds hints. What was
+// refused is taken from the kind and the subject of the exception, never from its text.
+
 #include "tool/diagnostics/RefusalExplainer.h"
 
 #include <algorithm>
@@ -55,6 +58,7 @@ public:
                      Model const &onModel, bool wantHints)
         : LineDiagnostic(line, place), refusal(refused), model(onModel), withHints(wantHints),
           command(CommandReference::FindFor(tokens.GetTokens())) {
+        // Messages of the library end in a line feed, which is not part of what is shown.
         std::string_view text = refusal.getDescription();
         while (text.ends_with('\n'))
             text.remove_suffix(1);
@@ -62,10 +66,14 @@ public:
     }
 
     Diagnostic Explain() {
+        // The first argument is marked unless something better is found below; without a command,
+        // the first word.
         Mark(std::min(command ? command->words : 0, tokens.GetSize() - 1));
         if (command)
             given = MatchArguments(*command, tokens.GetTokens());
         ExplainKind();
+        // The engine separates words at blanks only. A tab in a line is easy to miss, as it looks
+        // like blanks.
         if (diagnostic.source.find('\t') != std::string::npos)
             Hint("words are separated by blanks: a tab is a letter like any other");
         return std::move(diagnostic);
@@ -127,6 +135,7 @@ void RefusalExplainer::ExplainKind() {
         MarkSubject({ATTRIBUTE});
         Hint("the attribute is not of type User: add it with -TYPE=User");
         break;
+    // An option is one token, a prefix and a word: the word is what is wrong.
     case Exception::INVALID_ATTRIBUTE_TYPE:
         ExplainWord(Vocabulary::TYPE);
         break;
@@ -149,6 +158,8 @@ void RefusalExplainer::ExplainKeyword() {
         Hint("the keyword goes on with " + Alternatives(words));
         return;
     }
+    // No keyword begins like this line. Either the line is misspelled, or its first word is
+    // something else altogether.
     CommandHelp const *const nearest = NearestKeyword(part);
     if (!nearest) {
         Hint("`vesk-hdl commands` lists all keywords");
@@ -166,7 +177,7 @@ void RefusalExplainer::ExplainKeyword() {
     Hint("the nearest keyword is " + Quoted(nearest->keyword));
 }
 
-/// The first token that does not fit its argument, or the place where one is missing.
+/// Marks the first token that does not fit its argument, or the place where one is missing.
 void RefusalExplainer::ExplainArguments() {
     for (GivenArgument const &each : given)
         if (each.token < 0) {
@@ -177,11 +188,13 @@ void RefusalExplainer::ExplainArguments() {
             Hint(HintForUnfit(*command, each.argument, At(each)));
             break;
         }
+    // The grammar in any case: the line may be wrong in more than one place.
     Hint("the grammar is " + std::string(command->keyword) + (*command->grammar ? " " : "") +
          command->grammar);
 }
 
-/// A word that an option does not take. Of an option that is given twice the later one counts.
+/// Marks a word that an option does not take. If an option is given twice, the library reads the
+/// later one, so that the search is from the end.
 void RefusalExplainer::ExplainWord(Vocabulary::Choice const &choice) {
     auto const found = std::find_if(given.rbegin(), given.rend(), [&](GivenArgument const &each) {
         return each.token >= 0 && BeginsWith(At(each), choice.prefix);
@@ -209,9 +222,12 @@ void RefusalExplainer::ExplainMissingPin() {
     Hint(HintForMissingPin(model, ofInstance, holder, pin));
 }
 
-/// Marks the name in the line that the refusal is about, one of these kinds: the name of something
-/// new first, since it is what a taken name is.
+/// Marks the name that the refusal is about, where it occurs in the line as one of these kinds. A
+/// line such as "ADD INSTANCE U1 U1" may hold the name twice: a taken name is the new one, so names
+/// that the line declares are looked at first.
 GivenArgument const *RefusalExplainer::MarkSubject(Kinds kinds) {
+    // The subject of a refusal is spelled as the library stores names, with round brackets; the
+    // line need not be.
     auto const normalized = [](std::string_view text) {
         Basis::StringBase<char> form(text);
         Object::NormalizeName(form);
@@ -248,6 +264,7 @@ public:
         std::string const file(write.fileName.View());
         diagnostic.message = "cannot write " + file + ": " + FailureOf(write);
         CommandHelp const *const command = CommandReference::FindFor(tokens.GetTokens());
+        // The last token of that text: the file name comes after the options.
         for (int token = command ? command->words : 0; token < tokens.GetSize(); ++token)
             if (tokens.At(token) == file)
                 Mark(token);

@@ -1,3 +1,6 @@
+// Writes diagnostics as text or as JSON. Text of a command file comes from strangers: whatever is
+// shown passes SanitizeForTerminal or JsonString.
+
 #include "tool/diagnostics/Reporter.h"
 
 #include <algorithm>
@@ -8,8 +11,8 @@
 
 namespace {
 
-constexpr std::size_t MOST_SOURCE = 160; ///< bytes of a line that are shown around the caret
-constexpr std::size_t SOURCE_BEFORE = 60;
+constexpr std::size_t MAX_SOURCE = 160;   ///< bytes of a line that are shown around the caret
+constexpr std::size_t SOURCE_BEFORE = 60; ///< of these, before the caret
 constexpr char CLIPPED[] = "...";
 
 struct Word {
@@ -28,6 +31,7 @@ Word const &WordOf(Severity severity) {
     return severity == Severity::ERROR ? ERROR_WORD : WARNING_WORD;
 }
 
+// Bytes that a terminal or JSON treats as commands, and bytes that continue a UTF-8 character.
 bool IsControl(char c) { return static_cast<unsigned char>(c) < ' ' || c == '\x7f'; }
 bool Continues(char c) { return (static_cast<unsigned char>(c) & 0xC0) == 0x80; }
 
@@ -37,7 +41,7 @@ std::size_t CharactersIn(std::string_view text) {
            static_cast<std::size_t>(std::count_if(text.begin(), text.end(), Continues));
 }
 
-/// Length of the UTF-8 sequence that begins here, 0 if it is none.
+/// Length of the UTF-8 sequence that the text begins with; 0 if it begins with none.
 std::size_t SequenceAt(std::string_view text) {
     unsigned char const lead = static_cast<unsigned char>(text[0]);
     std::size_t const length = lead < 0x80                   ? 1
@@ -49,7 +53,7 @@ std::size_t SequenceAt(std::string_view text) {
         !std::all_of(text.begin() + 1, text.begin() + static_cast<std::ptrdiff_t>(length),
                      Continues))
         return 0;
-    // Overlong forms, surrogates and what lies behind U+10FFFF.
+    // Overlong forms, surrogates and code points above U+10FFFF are no UTF-8 (RFC 3629).
     unsigned char const second = length > 1 ? static_cast<unsigned char>(text[1]) : 0;
     bool const bad = (lead == 0xE0 && second < 0xA0) || (lead == 0xED && second > 0x9F) ||
                      (lead == 0xF0 && second < 0x90) || (lead == 0xF4 && second > 0x8F);
@@ -66,15 +70,16 @@ struct Window {
 Window WindowOf(std::string_view line, unsigned column) {
     std::size_t const at = std::min<std::size_t>(column - 1, line.size());
     std::size_t begin = 0;
-    if (line.size() > MOST_SOURCE && at > SOURCE_BEFORE) {
+    if (line.size() > MAX_SOURCE && at > SOURCE_BEFORE) {
         begin = at - SOURCE_BEFORE;
         while (begin < at && Continues(line[begin]))
             ++begin;
     }
     std::string_view const rest = line.substr(begin);
-    if (rest.size() <= MOST_SOURCE)
+    if (rest.size() <= MAX_SOURCE)
         return {rest, begin, false};
-    std::size_t end = MOST_SOURCE;
+    std::size_t end = MAX_SOURCE;
+    // Neither end of the part is in the middle of a character.
     while (end > 0 && Continues(rest[end]))
         --end;
     return {rest.substr(0, end), begin, true};
@@ -115,6 +120,7 @@ std::string JsonString(std::string_view text) {
         std::size_t const length = SequenceAt(text);
         char const c = text[0];
         if (length == 0)
+            // The replacement character: a JSON text with other bytes would be refused as a whole.
             json += "\\ufffd";
         else if (c == '"' || c == '\\')
             json.append({'\\', c});
@@ -139,7 +145,8 @@ void SetSource(Diagnostic &diagnostic, std::string_view line) {
     diagnostic.sourceGoesOn = window.goesOn;
 }
 
-/// In one piece: standard error is not buffered, and others may write to it.
+/// Writes all at once: standard error is not buffered, and lines of several processes that share it
+/// would mix.
 void Reporter::Show() {
     output << stream.str();
     output.flush();
@@ -152,6 +159,7 @@ void Reporter::Report(Diagnostic const &diagnostic) {
 }
 
 void Reporter::ReportNext(Diagnostic const &diagnostic) {
+    // A hundred thousand findings would otherwise take as many system calls.
     constexpr int ENOUGH = 32 * 1024;
     Put(diagnostic);
     if (stream.tellp() > ENOUGH)
@@ -193,10 +201,11 @@ void Reporter::ReportText(Diagnostic const &diagnostic) {
     }
 }
 
-/// The line and, below it, a caret under what is to blame.
+/// Shows the line and, below it, a caret under the token that is wrong.
 void Reporter::ReportSource(Diagnostic const &diagnostic, char const *colour, char const *plain) {
     if (diagnostic.place.column == 0 || diagnostic.source.empty())
         return;
+    // Findings of `check` keep a part of a long line; a refused line is here as a whole.
     bool const isPart = diagnostic.sourceBegin > 0 || diagnostic.sourceGoesOn;
     auto const [source, begin, goesOn] =
         isPart ? Window{diagnostic.source, diagnostic.sourceBegin, diagnostic.sourceGoesOn}
@@ -204,6 +213,7 @@ void Reporter::ReportSource(Diagnostic const &diagnostic, char const *colour, ch
     std::size_t const at =
         std::min<std::size_t>(diagnostic.place.column - 1 - begin, source.size());
     bool const clipFront = begin > 0;
+    // Columns are bytes for editors; the caret is placed by characters.
     std::size_t const marked = CharactersIn(source.substr(at, diagnostic.place.length));
     stream << "  " << (clipFront ? CLIPPED : "") << SanitizeForTerminal(source)
            << (goesOn ? CLIPPED : "") << '\n'

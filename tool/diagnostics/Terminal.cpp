@@ -1,5 +1,7 @@
 #include "tool/diagnostics/Terminal.h"
 
+/// A command file or a file name may hold escape sequences that rewrite the screen or, in some
+/// terminals, type commands.
 std::string SanitizeForTerminal(std::string_view text) {
     std::string shown(text);
     bool afterC2 = false; // where U+0080 to U+009F, controls too, begin in UTF-8

@@ -4,6 +4,7 @@
 
 namespace {
 
+/// ASCII only, as the library compares names; the functions of <cctype> depend on the locale.
 char Lower(char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c; }
 
 } // namespace
@@ -34,10 +35,11 @@ std::string Alternatives(std::span<std::string_view const> words) {
 std::string Quoted(std::string_view text) { return '"' + Shortened(text) + '"'; }
 
 std::string Shortened(std::string_view text) {
-    constexpr std::size_t MOST = 160;
-    constexpr std::size_t PART = 78; // in front of the dots and behind them
-    if (text.size() <= MOST)
+    constexpr std::size_t MAX_SHOWN = 160;
+    constexpr std::size_t PART = 78; // before and after the dots
+    if (text.size() <= MAX_SHOWN)
         return std::string(text);
+    // The cuts are not in the middle of a UTF-8 character.
     auto const continues = [](char c) { return (static_cast<unsigned char>(c) & 0xC0) == 0x80; };
     std::size_t front = PART;
     std::size_t back = text.size() - PART;

@@ -56,6 +56,8 @@ private:
 
     bool Step(char const *name) {
         int const parent = folders.empty() ? AT_FDCWD : Folder();
+        // O_PATH: only the right to pass through is needed. O_NOFOLLOW: a link that was put here
+        // meanwhile is not followed but reported.
         Descriptor next(::openat(parent, name, O_PATH | O_NOFOLLOW | O_DIRECTORY | O_CLOEXEC));
         if (next.Get() < 0)
             return false;
@@ -79,7 +81,8 @@ private:
         std::string const target = ReadLink(Folder(), link);
         if (target.empty())
             return false;
-        if (++links > FilePlace::MOST_LINKS) {
+        // As the kernel does: links that lead to each other would never end.
+        if (++links > FilePlace::MAX_LINKS) {
             errno = ELOOP;
             return false;
         }
@@ -125,6 +128,7 @@ Confinement::Confinement(std::string const &folder) : device(0), inode(0) {
         throw std::system_error(errno, std::generic_category());
     if (!S_ISDIR(status.st_mode))
         throw std::system_error(ENOTDIR, std::generic_category());
+    // By device and inode: the folder is recognized under any of its names.
     device = status.st_dev;
     inode = status.st_ino;
 }
@@ -144,6 +148,8 @@ bool Confinement::Find(std::string const &name, FilePlace &place) const {
     if (!walk.ToFolderOf(name[0] == '/' ? name : here.string() + "/" + name))
         return false;
     for (;;) {
+        // The last component may be a link as well. Each of its targets has to lie in the folder
+        // too.
         if (!walk.IsBelow(device, inode)) {
             errno = EXDEV;
             return false;

@@ -1,3 +1,6 @@
+// Resolves the name of an output. A file is replaced by renaming another one, which would replace a
+// link by a file; so links are followed here, down to the folder that holds the file itself.
+
 #include "tool/session/FilePlace.h"
 
 #include <array>
@@ -8,6 +11,8 @@
 
 namespace {
 
+/// Links on /proc such as /proc/self/fd/1 name open files: the text of such a link is not always a
+/// path.
 bool IsOnProc(int folder) {
     struct statfs system = {};
     return ::fstatfs(folder, &system) == 0 && system.f_type == PROC_SUPER_MAGIC;
@@ -17,7 +22,9 @@ bool IsOnProc(int folder) {
 
 bool FilePlace::Find(std::string const &path) {
     std::string way = path;
-    for (int links = 0; links <= MOST_LINKS; ++links) {
+    for (int links = 0; links <= MAX_LINKS; ++links) {
+        // Only the last component is resolved by hand: the kernel follows links in the folders
+        // before it.
         std::size_t const begin = way.rfind('/') + 1; // 0 without a "/"
         std::string const front = begin == 0 ? "./" : way.substr(0, begin);
         name = way.substr(begin);
@@ -42,6 +49,7 @@ bool FilePlace::Find(std::string const &path) {
 
 bool FilePlace::Look() {
     exists = ::fstatat(folder.Get(), name.c_str(), &status, AT_SYMLINK_NOFOLLOW) == 0;
+    // A file that does not exist yet is a place too; any other error is one.
     return exists || errno == ENOENT;
 }
 
@@ -58,6 +66,7 @@ bool IsSamePlace(std::string const &left, std::string const &right) {
         return false;
     if (one.exists || other.exists)
         return one.exists && other.exists && IsSame(one.status, other.status);
+    // Neither file exists: they would be one file if they got the same name in the same folder.
     struct stat oneFolder = {};
     struct stat otherFolder = {};
     return one.name == other.name && ::fstat(one.folder.Get(), &oneFolder) == 0 &&

@@ -21,7 +21,7 @@ struct FilePlace {
     bool Look();
     bool IsLink() const { return exists && S_ISLNK(status.st_mode); }
 
-    static constexpr int MOST_LINKS = 40; ///< on one way, as the kernel counts
+    static constexpr int MAX_LINKS = 40; ///< on one way, as the kernel counts
 };
 
 /// Where a link in a folder leads; empty with `errno` set if it is none or cannot be read.

@@ -7,6 +7,8 @@
 
 void InputFiles::Add(std::string const &path) {
     struct stat status = {};
+    // Standard input may be a file that was redirected: a write to it would lose lines that are
+    // still to be read.
     int const failed = path == "-" ? ::fstat(STDIN_FILENO, &status) : ::stat(path.c_str(), &status);
     if (failed == 0 && S_ISREG(status.st_mode))
         files.push_back(status);

@@ -6,7 +6,8 @@
 
 namespace {
 
-// What a sanitizer keeps beside the memory of the program counts as data too: terabytes.
+// The shadow memory of a sanitizer, which is terabytes, counts as data of the process: under a
+// sanitizer no limit can be set.
 #if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
 constexpr bool SANITIZED = true;
 #elif defined(__has_feature)
@@ -20,6 +21,7 @@ constexpr unsigned long long UNIT = 1024; ///< in each, those of the one before
 
 } // namespace
 
+/// RLIMIT_DATA and not RLIMIT_AS: address space that is only reserved costs nothing.
 void MemoryLimit::Apply() {
     if (SANITIZED || size == 0 || applied || ::getrlimit(RLIMIT_DATA, &former) != 0)
         return;
@@ -58,6 +60,7 @@ unsigned long long BytesOf(std::string_view text) {
             return 0;
     }
     for (; units > 0; --units)
+        // An overflow gives 0, which the options refuse.
         size = size > std::numeric_limits<unsigned long long>::max() / UNIT ? 0 : size * UNIT;
     return size;
 }

@@ -20,6 +20,7 @@ LineReader::LineReader(int ownDescriptor, std::string text)
     : descriptor(ownDescriptor), error(0), block(std::move(text)) {}
 
 LineReader::~LineReader() {
+    // Standard input belongs to the process.
     if (descriptor > STDIN_FILENO)
         ::close(descriptor);
 }
@@ -37,6 +38,8 @@ bool LineReader::Fill() {
     ssize_t got = 0;
     do
         got = ::read(descriptor, block.data(), BLOCK);
+    // A signal whose handler only sets a mark ends the read early; nothing is lost by reading
+    // again.
     while (got < 0 && errno == EINTR);
     if (got < 0)
         error = errno;
@@ -57,9 +60,13 @@ bool LineReader::Next(std::string &line) {
         }
         line.append(block, position, end - position);
         position = end + 1;
+        // Files from DOS end their lines in "\r\n"; a carriage return would become part of the last
+        // word.
         if (!line.empty() && line.back() == '\r')
             line.pop_back();
         return true;
     }
+    // A last line without an end is a line. After an error the beginning of a line is none: half a
+    // command must not run.
     return some && error == 0;
 }

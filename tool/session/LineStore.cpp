@@ -8,7 +8,7 @@
 
 namespace {
 
-constexpr std::size_t MOST_IN_MEMORY = 1024 * 1024;
+constexpr std::size_t MAX_IN_MEMORY = 1024 * 1024;
 
 /// A file that ends with its descriptor, -1 if there is no place for it.
 int OpenUnnamed() {
@@ -45,11 +45,12 @@ LineStore::~LineStore() {
 }
 
 void LineStore::Add(std::string const &line) {
+    // Without the lines the findings are reported all the same, but the source is not shown.
     if (isLost)
         return;
     // With both characters, so that a line that ends in a carriage return keeps it.
     block.append(line).append("\r\n");
-    if (block.size() > MOST_IN_MEMORY && !Flush()) {
+    if (block.size() > MAX_IN_MEMORY && !Flush()) {
         isLost = true;
         block = {};
     }
@@ -71,5 +72,7 @@ std::unique_ptr<LineReader> LineStore::Read() {
         return std::make_unique<LineReader>(-1, block);
     if (!Flush() || ::lseek(file, 0, SEEK_SET) != 0)
         return std::make_unique<LineReader>(-1, std::string());
+    // A descriptor of its own for the reader, which closes it. Both share the position in the file:
+    // that is why there is one reader at a time.
     return std::make_unique<LineReader>(::fcntl(file, F_DUPFD_CLOEXEC, 3), std::string());
 }

@@ -1,3 +1,6 @@
+// Opens what write commands write. The order of the tests in Find and IsAllowed decides which
+// reason the user reads, when several apply.
+
 #include "tool/session/OutputFiles.h"
 
 #include <algorithm>
@@ -16,6 +19,7 @@ constexpr std::array<std::string_view, 6> HDL_SUFFIXES = {".vhd", ".vhdl", ".v",
                                                           ".vh",  ".sv",   ".svh"};
 
 bool EndsIn(std::string_view name, std::string_view suffix) {
+    // In any case: file systems that ignore case open .V for .v.
     auto const same = [](char a, char b) {
         auto const lower = [](char c) { return c >= 'A' && c <= 'Z' ? c - 'A' + 'a' : c; };
         return lower(a) == lower(b);
@@ -47,11 +51,14 @@ int OutputFiles::Open(char const *fileName, bool append) {
     reason.clear();
     beyondLimit = false;
     if (std::exchange(nextIsStandardOutput, false))
+        // A copy, since the library closes what it is given; above 2, so that it never takes the
+        // place of a standard stream that is closed.
         return ::fcntl(STDOUT_FILENO, F_DUPFD_CLOEXEC, STDERR_FILENO + 1);
     FilePlace place;
     if (!Find(fileName, place))
         return -1;
     if (place.isOpenFile || (place.exists && !S_ISREG(place.status.st_mode)))
+        // A pipe, a device or an open file cannot be replaced by renaming.
         return OpenDirectly(fileName, append);
     return append && place.exists ? unfinished.BeginAppending(std::move(place), reason)
                                   : unfinished.Begin(std::move(place), reason);
@@ -91,6 +98,7 @@ bool OutputFiles::IsAllowed(FilePlace const &place) {
     if (!place.exists)
         return true;
     if (place.status.st_nlink > 1)
+        // Its other name may lie outside the folder.
         return Refuse(EMLINK, "it has other names (hard links), which --restrict does not allow");
     if (!restriction.overwrite && own.count(IdentityOf(place.status)) == 0)
         return Refuse(EEXIST,
@@ -114,6 +122,7 @@ int OutputFiles::OpenDirectly(char const *fileName, bool append) const {
 int OutputFiles::Allow(std::size_t bytes) {
     if (Signals::IsInterrupted())
         return EINTR;
+    // So written, the sum cannot overflow.
     if (bytes > most - written) {
         beyondLimit = true;
         return EDQUOT;
@@ -125,8 +134,9 @@ int OutputFiles::Allow(std::size_t bytes) {
 void OutputFiles::Finish(Vesk_Hdl::WriteStatus &status) {
     if (status.error == 0 && unfinished.IsBegun())
         status.error = PutInPlace();
+    // Also after a failure to put it in place: the old file stays.
     unfinished.Undo();
-    if (status.error == 0 || status.error == ECANCELED) // an exception says what happened
+    if (status.error == 0 || status.error == ECANCELED) // an exception reports what happened
         return;
     if (beyondLimit && status.error == EDQUOT)
         reason = "all files together would pass the " + SizeText(most) +
@@ -136,7 +146,8 @@ void OutputFiles::Finish(Vesk_Hdl::WriteStatus &status) {
     status.reason = reason.c_str();
 }
 
-/// In a restricted run the file counts as made by this run from now on.
+/// In a restricted run a file that this run made may be written again. It is known by its inode,
+/// which is another one after each write.
 int OutputFiles::PutInPlace() {
     auto const made = IdentityOf(unfinished.GetStatus());
     auto const former = IdentityOf(unfinished.GetFormerStatus());

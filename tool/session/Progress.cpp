@@ -37,6 +37,7 @@ void Progress::Look() {
     Clock::time_point const now = Clock::now();
     if (now < nextDraw)
         return;
+    // Drawing costs a system call and, over a slow line, much more.
     nextDraw = now + PAUSE;
     Draw();
 }
@@ -46,6 +47,7 @@ void Progress::Draw() {
     double const rate = static_cast<double>(doneBytes) / seconds;
     std::string text;
     if (total > 0) {
+        // A file may grow while it is read, so that more than its size comes.
         double const part =
             std::min(static_cast<double>(doneBytes) / static_cast<double>(total), 1.0);
         auto const full = static_cast<std::size_t>(part * BAR);
@@ -54,18 +56,21 @@ void Progress::Draw() {
     }
     text += Bytes(static_cast<double>(doneBytes)) + "  " + std::to_string(lines) + " lines  " +
             Bytes(rate) + "/s";
+    // Lines cost about the same throughout a file: the bytes that are left are a fair measure of
+    // the time.
     if (total > doneBytes && rate > 0)
         text += "  " + Seconds(static_cast<double>(total - doneBytes) / rate) + " left";
     Put(text);
 }
 
-void Progress::TellWrite(char const *fileName) {
+void Progress::ShowWrite(char const *fileName) {
     if (shown && Clock::now() >= nextDraw)
         Put("writing " + SanitizeForTerminal(fileName));
 }
 
 void Progress::Put(std::string const &text) {
-    // The last column stays free: a terminal might go on to the next line behind it.
+    // The last column stays free: some terminals go on to the next line after a letter in it, and
+    // the eraser would then clear the wrong line.
     std::size_t const room = static_cast<std::size_t>(ColumnsOfTerminal()) - 1;
     std::fprintf(stderr, "%s%s", ERASER, text.substr(0, room).c_str());
     std::fflush(stderr);

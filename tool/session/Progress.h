@@ -3,7 +3,7 @@
 #include <chrono>
 #include <string>
 
-/// A bar on standard error that tells how far the reading of lines is. It appears only when the
+/// A bar on standard error that shows how far the reading of lines is. It appears only when the
 /// work lasts, and asks for the time only once in many lines.
 class Progress {
 public:
@@ -23,8 +23,8 @@ public:
             Look();
     }
     /// A file is being written.
-    void TellWrite(char const *fileName);
-    /// Takes the bar off the screen, so that something else can be told.
+    void ShowWrite(char const *fileName);
+    /// Takes the bar off the screen, so that a message can be printed.
     void Clear();
 
     /// What a message begins with that takes the bar off by itself.

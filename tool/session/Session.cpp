@@ -14,6 +14,7 @@ Session::Session(std::string const &modelName) {
 
 std::optional<Diagnostic> Session::RunLine(std::string const &line, StringArray const *tokens,
                                            Place const &place) {
+    // The library takes the line as a C string and would run what is in front of the NUL.
     if (std::size_t const at = line.find('\0'); at != std::string::npos)
         return ExplainNul(line, place, at);
     int const writesBefore = model->GetLastWrite().number;
@@ -25,8 +26,8 @@ std::optional<Diagnostic> Session::RunLine(std::string const &line, StringArray 
     } catch (Exception const &refusal) {
         return ExplainRefusal(line, place, refusal, *model, withHints);
     }
-    // Commands are kept as done until somebody clears them, and the tool never looks back. One at a
-    // time: its memory is then at hand for the next one.
+    // The manager keeps each command that ran until Clear is called; the tool never asks for
+    // them. Cleared after each line, so that the next command gets the same memory.
     model->GetCommandManager()->Clear();
     WriteStatus const &write = model->GetLastWrite();
     if (write.number == writesBefore || write.error == 0)
@@ -36,6 +37,7 @@ std::optional<Diagnostic> Session::RunLine(std::string const &line, StringArray 
 
 WriteStatus const &Session::Write(char const *language, std::string const &file) {
     StringArray tokens;
+    // As tokens and not as a line: the file name may hold blanks and quotes.
     for (char const *const token : {"WRITE", language, file.c_str()})
         tokens.Add(token);
     model->Execute(tokens);

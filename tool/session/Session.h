@@ -11,8 +11,8 @@ class Session {
 public:
     explicit Session(std::string const &modelName);
 
-    /// Runs a line. Tells what is wrong if it was refused, or if a file that it writes did not
-    /// reach the disk whole; the place comes back with the column of the token that is to blame.
+    /// Runs a line. The result is a diagnostic if the line was refused, or if a file that it writes
+    /// did not reach the disk whole; its place has the column of the token that is wrong.
     std::optional<Diagnostic> RunLine(std::string const &line, Place const &place) {
         return RunLine(line, nullptr, place);
     }

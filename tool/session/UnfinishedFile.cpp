@@ -1,3 +1,7 @@
+// Writes a file so that others see the old text or the new one. Whatever ends the program in
+// between, a hidden file without a lock is all that can be left; the next run on the same file
+// removes it.
+
 #include "tool/session/UnfinishedFile.h"
 
 #include <algorithm>
@@ -15,7 +19,8 @@ namespace {
 
 constexpr mode_t PERMISSIONS = 0777;
 
-/// How a signal handler undoes the file that is being written.
+/// How a signal handler undoes the file that is being written. A handler may not take memory or
+/// locks, so that all it needs is kept here.
 struct HandlerUndo {
     enum Way { NOTHING, REMOVE, CUT };
 
@@ -38,16 +43,16 @@ static_assert(std::atomic<HandlerUndo::Way>::is_always_lock_free);
 
 /// Long names are cut: should two files share a hidden one, their writers take turns.
 std::string HiddenNameOf(std::string const &name) {
-    constexpr std::size_t MOST = 80;
-    std::size_t length = std::min(name.size(), MOST);
+    constexpr std::size_t MAX_KEPT = 80;
+    std::size_t length = std::min(name.size(), MAX_KEPT);
     while (length < name.size() && length > 0 &&
            (static_cast<unsigned char>(name[length]) & 0xC0) == 0x80)
         --length; // not in the middle of a character of UTF-8
     return "." + name.substr(0, length) + "." + std::to_string(::geteuid()) + ".vesk-hdl";
 }
 
-/// Waits for the lock. False if an interrupt ends the wait; a file system without locks is taken
-/// as it is.
+/// Waits for the lock. False if an interrupt ends the wait. On a file system without locks the run
+/// goes on without one.
 bool Lock(int file) {
     while (!Signals::IsInterrupted())
         if (::flock(file, LOCK_EX) == 0 || errno != EINTR)
@@ -95,6 +100,7 @@ bool UnfinishedFile::Make() {
     }
     undo.folder = place.folder.Get();
     std::snprintf(undo.name.data(), undo.name.size(), "%s", hiddenName.c_str());
+    // Last: the handler reads the rest when it sees this.
     undo.way = HandlerUndo::REMOVE;
     return true;
 }
@@ -120,6 +126,8 @@ bool UnfinishedFile::RemoveLeftover(std::string &reason) {
         return false;
     }
     struct stat named = {};
+    // While this run waited, the other one may have finished and a third one may have made a file
+    // of that name.
     if (::fstatat(folder, hiddenName.c_str(), &named, AT_SYMLINK_NOFOLLOW) == 0 &&
         IsSame(named, opened))
         ::unlinkat(folder, hiddenName.c_str(), 0);
@@ -143,14 +151,16 @@ int UnfinishedFile::BeginAppending(FilePlace wanted, std::string &reason) {
         errno = EAGAIN;
         return -1;
     }
+    // Text that is appended goes into the file itself. If the write fails the file is cut to its
+    // former length.
     undo.file = file.Get();
     undo.length = status.st_size;
     undo.way = HandlerUndo::CUT;
     return Lend();
 }
 
-/// The lock lasts until the last descriptor is closed: this object keeps one until the file has its
-/// name.
+/// A copy of the descriptor for the library, which closes it. The lock belongs to both and lasts
+/// until the second one is closed, when the file has its name.
 int UnfinishedFile::Lend() const { return ::fcntl(file.Get(), F_DUPFD_CLOEXEC, STDERR_FILENO + 1); }
 
 int UnfinishedFile::Finish() {
@@ -169,7 +179,8 @@ int UnfinishedFile::Finish() {
     return error;
 }
 
-/// Where the group cannot be kept, the new group may do no more than others may.
+/// Only root may give a file away. If the former group cannot be kept, members of the new group get
+/// no more rights than all others have.
 void UnfinishedFile::GiveModeAndOwner() const {
     struct stat const &old = place.status;
     mode_t mode = old.st_mode & PERMISSIONS;

@@ -1,3 +1,6 @@
+// Completion offers what the grammar of the command allows at the cursor. It reads the same tables
+// as the commands, so that a new command needs nothing here.
+
 #include "tool/shell/Completion.h"
 
 #include <algorithm>
@@ -30,7 +33,8 @@ public:
     }
 
 private:
-    /// Not what would want quotes: half of it, put in without them, would name something else.
+    /// Names with blanks or quotes are left out: they are typed in quotes, and a beginning that is
+    /// inserted without quotes would name something else.
     void Offer(std::string_view candidate) {
         bool const wantsQuotes = candidate.find_first_of(" \"'") != std::string_view::npos;
         if (BeginsWith(candidate, word) && !wantsQuotes)
@@ -64,6 +68,7 @@ private:
         for (std::size_t i = first; i < before.size(); ++i)
             words += (words.empty() ? "" : " ") + before[i];
         std::string const last = before.empty() ? word : before.back() + word;
+        // Keywords are offered in the case in which the user types.
         bool const lower =
             std::any_of(last.begin(), last.end(), [](char c) { return c >= 'a' && c <= 'z'; });
         for (std::string_view const next : NextKeywordWords(words))
@@ -93,8 +98,8 @@ private:
         }
     }
 
-    /// Whether that word is what gives an argument, which may be left out. An option is known by
-    /// its words; any other argument is taken to be there.
+    /// Whether the word may be the value of an argument. An option is recognized by its words. Any
+    /// other optional argument is taken as given, since its words can be anything.
     static bool MayBe(Argument const &argument, std::string const &text) {
         ArgumentHelp const &help = CommandReference::GetArgument(argument.kind);
         if (!argument.optional || help.choices.empty())
@@ -108,7 +113,7 @@ private:
 
     void OfferArgument(Argument const &argument) {
         if (argument.declares)
-            return; // a new name
+            return; // a new name: names that exist would be refused
         OfferKind(argument.kind);
         OfferKind(argument.alternative);
     }
@@ -136,7 +141,7 @@ private:
         }
     }
 
-    /// Holders up to the point, then the pins of the one that is named.
+    /// Offers owners until a point is typed, then the pins of the owner before it.
     template <class T, class Holder> void OfferPins(Iterator<T> holders, Holder const *holder) {
         if (FindPinPoint(word) == std::string::npos) {
             ForEach(holders, [this](Object const *each) {
@@ -154,11 +159,15 @@ private:
         fs::path const typed(word);
         fs::path const folder = typed.parent_path();
         std::error_code error;
-        for (auto const &entry :
-             fs::directory_iterator(folder.empty() ? fs::path(".") : folder, error)) {
-            bool const isFolder = entry.is_directory(error);
-            Offer((folder / entry.path().filename()).string() + (isFolder ? "/" : ""));
-            if (isFolder && BeginsWith((folder / entry.path().filename()).string(), word))
+        // A folder that cannot be read, or not to its end, only offers less: nothing here may
+        // throw.
+        fs::directory_iterator entry(folder.empty() ? fs::path(".") : folder, error);
+        for (; !error && entry != fs::directory_iterator(); entry.increment(error)) {
+            std::error_code unknown; // whether a dangling link is a folder
+            std::string const name = (folder / entry->path().filename()).string();
+            bool const isFolder = entry->is_directory(unknown);
+            Offer(name + (isFolder ? "/" : ""));
+            if (isFolder && BeginsWith(name, word))
                 result.wordEnds = false;
         }
     }

@@ -6,7 +6,7 @@
 
 #include "vesk_hdl/Vesk_Hdl.h"
 
-/// What may stand where the last word of a line begins.
+/// The words that the last word of a line may become.
 struct Completions {
     std::size_t begin = 0;               ///< index of that word in the line; words end at blanks
     std::vector<std::string> candidates; ///< sorted, each the whole word

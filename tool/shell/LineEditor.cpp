@@ -1,3 +1,5 @@
+// The line editor: editline with the keys, the history and the completion of the shell.
+
 #include "tool/shell/LineEditor.h"
 
 #include <clocale>
@@ -10,8 +12,9 @@
 
 namespace {
 
-constexpr int LONGEST_HISTORY = 1000;
+constexpr int MAX_HISTORY = 1000;
 
+/// Prints candidates in columns, as shells do.
 void List(std::vector<std::string> const &candidates) {
     constexpr std::size_t COLUMNS = 80;
     std::size_t width = 0;
@@ -50,7 +53,8 @@ struct LineEditor::Record {
         HistEvent event;
         if (historyFile.empty())
             return;
-        // Nobody else is to read it, so it is made before it is written.
+        // Lines may hold names of customers: only the user may read the file. editline makes it
+        // with the permissions of the umask, so that it is made here first.
         int const made = ::open(historyFile.c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600);
         if (made < 0)
             return;
@@ -60,13 +64,14 @@ struct LineEditor::Record {
 
     static char *Prompt(EditLine *editor) { return Of(editor).prompt.data(); }
 
-    /// TAB: puts in what all candidates have in common; lists them if there is a choice.
+    /// TAB: inserts what all candidates have in common; lists them if nothing more is common.
     static unsigned char CompleteWord(EditLine *editor, int) {
         LineInfo const *const line = el_line(editor);
         std::string const text(line->buffer, line->cursor);
         Completions const found = Of(editor).completer(text);
         std::string const word = text.substr(found.begin);
         std::string common = CommonBeginning(found.candidates);
+        // A blank after the only candidate, so that the next word can be typed at once.
         if (found.candidates.size() == 1 && found.wordEnds)
             common += ' ';
         if (common.empty())
@@ -97,13 +102,14 @@ struct LineEditor::Record {
 LineEditor::LineEditor(std::string const &prompt, std::string const &historyFile,
                        Completer completer)
     : record(std::make_unique<Record>()) {
-    std::setlocale(LC_CTYPE, ""); // letters beyond ASCII; the library does not look at it
+    // editline asks the locale for letters beyond ASCII; the library does not depend on it.
+    std::setlocale(LC_CTYPE, "");
     record->prompt = prompt;
     record->historyFile = historyFile;
     record->completer = std::move(completer);
     record->history = history_init();
     HistEvent event;
-    history(record->history, &event, H_SETSIZE, LONGEST_HISTORY);
+    history(record->history, &event, H_SETSIZE, MAX_HISTORY);
     history(record->history, &event, H_SETUNIQUE, 1);
     if (!historyFile.empty())
         history(record->history, &event, H_LOAD, historyFile.c_str());

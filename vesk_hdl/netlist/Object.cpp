@@ -11,6 +11,7 @@
 #include "vesk_hdl/text/basis/Counting.h"
 #include "vesk_hdl/text/basis/Functions.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
+#include "vesk_hdl/text/basis/StringEdit.h"
 
 namespace Vesk_Hdl {
 
@@ -39,7 +40,7 @@ Object::Record *Object::NoRecord() {
 template <class Made, class... Model>
 Object::Record *Object::MakeRecord(std::string_view name, Model &&...model) {
     void *room = nullptr;
-    StringBase<char> text = StringBase<char>::MakeWithRoom(name, sizeof(Made), room);
+    StringBase<char> text = Basis::StringEdit::MakeWithRoom(name, sizeof(Made), room);
     static_assert(alignof(Made) <= alignof(void *), "the room is aligned as a pointer is");
     auto *const made = new (room) Made(std::forward<Model>(model)...);
     made->name = std::move(text); // the record now owns the block that it is in, see Release

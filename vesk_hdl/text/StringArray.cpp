@@ -9,6 +9,7 @@
 #include "vesk_hdl/text/IntroSort.h"
 #include "vesk_hdl/text/basis/Functions.h"
 #include "vesk_hdl/text/basis/OrEmpty.h"
+#include "vesk_hdl/text/basis/StringEdit.h"
 #include "vesk_hdl/text/basis/Tokens.h"
 
 namespace Vesk_Hdl {
@@ -271,7 +272,7 @@ void StringArray::ParseLine(char const *line, std::vector<Basis_Range> *places) 
         if (count == strings.size())
             strings.emplace_back(token);
         else
-            strings[count].Assign(token);
+            Basis::StringEdit::Assign(strings[count], token);
         ++count;
     });
     if (!isPlain) {

@@ -7,11 +7,6 @@
 
 class Basis_Regexp;
 
-namespace Vesk_Hdl {
-class Object;
-class StringArray;
-} // namespace Vesk_Hdl
-
 /// A pair of character indices, counted from 0 and both inclusive. A range whose `first` is greater
 /// than its `last` is empty; (1, 0) is where every walk with NextTokenRange starts.
 struct Basis_Range {
@@ -22,6 +17,7 @@ struct Basis_Range {
 namespace Basis {
 
 class Stream;
+struct StringEdit;
 
 /// The result of every search that finds nothing: an index that no string has.
 inline constexpr unsigned int NOT_FOUND = 0xFFFFFFFFU;
@@ -184,8 +180,7 @@ private:
         char terminator[4];
     };
 
-    friend class Vesk_Hdl::Object;
-    friend class Vesk_Hdl::StringArray;
+    friend struct StringEdit;
 
     /// A text that is followed by `extra` bytes in its block, aligned as a pointer is. They last as
     /// long as any copy of the text, see docs/architecture.md, "Storage and its invariants".

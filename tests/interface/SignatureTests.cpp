@@ -343,6 +343,12 @@ HAVE(I, From<void(Text, C *)>(), As<C *() const>(&I::GetComponent), As<P *(Text)
      As<void(PinArray &) const>(&I::GetOutPortConnectedToInPin, &I::GetInPortConnectedToOutPin),
      As<bool(PinArray &, bool) const>(&I::GetOpenPin));
 
+HAVE(DummyPlan, As<int() const>(&DummyPlan::GetSize),
+     As<DummyPlan::Step const &(int) const>(&DummyPlan::GetAt),
+     As<DummyPlan::Step const *(Signal const *) const>(&DummyPlan::Find),
+     As<bool(Pin const &, DummyPlan::Reason &)>(&DummyPlan::FindReason),
+     As<bool(Signal const &)>(&DummyPlan::HasSeveralDrivers));
+
 HAVE(N, As<void()>(&N::SortNetlist, &N::CreateVhdlDummySignals, &N::CreateVerilogDummySignals),
      As<int(Signals &)>(&N::GetLongestPortName, &N::GetLongestSignalName), From<void(Text)>(),
      As<void()>(&N::ConnectOpenPinToDummy, &N::SetBoxTypeAttribute),

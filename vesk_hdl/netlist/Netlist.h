@@ -12,7 +12,7 @@ namespace Vesk_Hdl {
 ///
 /// Each of the three kinds stands in an array, which gives the order of all output, and in a map,
 /// which finds by name whatever the case and the brackets. Buses are also found by their base name.
-/// Sources: Netlist.cpp (contents), Netlist_passes.cpp (the rewriting before a write).
+/// Sources: Netlist.cpp (contents), passes/Netlist_passes.cpp (the rewriting before a write).
 class VESK_HDL_API Netlist : public Object, public AttributeHolder {
 public:
     static char const DEFAULT_NETLIST_NAME[]; ///< "HDL_NETLIST"
@@ -103,7 +103,6 @@ private:
 
     void GetWiredOrOutputSignals(StringSet &names);
     void GetFeedBackSignals(bool outPortToInPin, StringSet &names);
-    void FindFeedBack(StringSet &read, PtrArray<Signal *> &driven);
     void AddDummySignals(bool portTakesDummy, StringSet &names);
 
     std::unique_ptr<Record> record;

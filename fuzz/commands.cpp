@@ -7,6 +7,7 @@
 #include "fuzz/CommandLines.h"
 #include "fuzz/Fuzz.h"
 #include "tests/support/Consistency.h"
+#include "tests/support/Dummies.h"
 #include "tests/support/MemoryFile.h"
 
 using namespace Vesk_Hdl;
@@ -52,6 +53,28 @@ std::string OutcomeOfFile(std::vector<std::string> const &lines) {
     return capture.Take();
 }
 
+/// The plan of the dummy signals foresees what a write makes.
+void ComparePlan(std::vector<std::string> const &lines) {
+    CommandFactory factory;
+    Model model(&factory);
+    Capture capture;
+    model.SetWriteOpener(&capture);
+    Netlist &netlist = *model.GetNetlist();
+    for (std::string const &line : lines) {
+        try {
+            model.Execute(line.c_str());
+        } catch (Exception const &) {
+        }
+    }
+    netlist.SortNetlist();
+    Dummies const planned(netlist, DummyPlan(netlist));
+    int const before = netlist.GetSignals().GetSize();
+    netlist.CreateVhdlDummySignals();
+    std::string const made = SignalsFrom(netlist, before);
+    FUZZ_EXPECT(planned.MeetOthers() || planned.GetNames() == made, "\n%s\nis not\n%s",
+                planned.GetNames().c_str(), made.c_str());
+}
+
 } // namespace
 
 int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
@@ -71,6 +94,7 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
     std::string const byTokens = Outcome(lines, [](Model &model, std::string const &line) {
         model.Execute(StringArray(line.c_str(), " ", true, "\"\"''"));
     });
+    ComparePlan(lines);
     bool const timed = byLine.find("Copyright") != std::string::npos; // a header holds the time
     FUZZ_EXPECT(timed || byLine == byTokens, "\n%s\nis not\n%s", byLine.c_str(), byTokens.c_str());
     std::string byFile = byLine;

@@ -33,6 +33,7 @@
 #include "vesk_hdl/netlist/Signal.h"
 #include "vesk_hdl/netlist/Values.h"
 #include "vesk_hdl/netlist/Vocabulary.h"
+#include "vesk_hdl/netlist/passes/DummyPlan.h"
 #include "vesk_hdl/text/Exception.h"
 #include "vesk_hdl/text/IStringPtrMap.h"
 #include "vesk_hdl/text/OutStream.h"

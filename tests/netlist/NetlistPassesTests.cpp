@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include "tests/support/Dummies.h"
 #include "tests/support/Lines.h"
 #include "tests/support/Owners.h"
 
@@ -51,9 +52,54 @@ TEST(NetlistPasses, VhdlDummies) {
               "out a_DUMMY(3:0) <- a_DUMMY\na_DUMMY: u1.B(3:0)\n"}}) {
         Design design(CellsAnd(row.lines));
         for (int round = 0; round < 2; ++round) { // the second finds nothing more to do
+            std::string const planned =
+                Dummies(design.netlist, DummyPlan(design.netlist)).GetNames();
+            int const before = design.netlist.GetSignals().GetSize();
             design.netlist.CreateVhdlDummySignals();
             EXPECT_EQ(row.wiring, Wiring(design.netlist)) << row.lines;
+            EXPECT_EQ(planned, SignalsFrom(design.netlist, before)) << row.lines;
         }
+    }
+}
+
+TEST(DummyPlan, SaysWhyEachNetGetsADummy) {
+    // 1: out port that is read, 2: in port that is driven, 3: several drivers.
+    struct Row {
+        char const *lines, *steps;
+    };
+    for (Row const &row :
+         std::vector<Row>{{"port q out; port d in; port w out; q u1.A; d u1.Y; w u2.Y; w u3.Y",
+                           "q 1 of q; d 2 of d; w 3 of w"},
+                          // The bus for its part, members for their compound, a compound last.
+                          {"port a(7:0) out; a(3:0) u2.B(3:0)", "a(7:0) 1 of a(3:0)"},
+                          {"port x out; sig n; x,n u1.A", "n 1 of x,n; x 1 of x,n; x,n 1 of x,n"},
+                          // A compound that begins with a dummy by then is none of an in port any
+                          // more; one that holds a dummy gives it a dummy of its own.
+                          {"port q out; port d in; q u1.A; q,d u2.Y; q,d u3.Y", "q 1 of q"},
+                          {"port q out; port d in; q u1.A; d,q u2.Y",
+                           "q 1 of q; q 2 of d,q after 0; d 2 of d,q; d,q 2 of d,q"},
+                          // A pin goes with the net that lists it, wherever it was connected later.
+                          {"port q out; port d in; q u1.IO; q u2.A; d u1.IO", "q 1 of q"},
+                          // A name with brackets that is no bit of a bus has no dummy.
+                          {"port c(3) out; c(3) u1.A", ""}}) {
+        Design design(CellsAnd(row.lines));
+        design.netlist.SortNetlist();
+        DummyPlan const plan(design.netlist);
+        std::string steps;
+        for (int i = 0; i < plan.GetSize(); ++i) {
+            DummyPlan::Step const &step = plan.GetAt(i);
+            bool const isFirst = step.former == DummyPlan::NONE;
+            steps += (i > 0 ? "; " : "") + std::string(step.net->GetName()) + " " +
+                     std::to_string(step.reason) + " of " + step.demand->GetName().GetText() +
+                     (isFirst ? "" : " after " + std::to_string(step.former));
+            EXPECT_EQ(isFirst, plan.Find(step.net) == &step) << steps;
+            EXPECT_TRUE(isFirst || plan.GetAt(step.former).later == i) << steps;
+        }
+        EXPECT_EQ(row.steps, steps);
+        std::string const planned = Dummies(design.netlist, plan).GetNames();
+        int const before = design.netlist.GetSignals().GetSize();
+        design.netlist.CreateVhdlDummySignals();
+        EXPECT_EQ(planned, SignalsFrom(design.netlist, before)) << row.lines;
     }
 }
 

@@ -1,12 +1,12 @@
-// Attributes: whether what they need is declared, and whether their values make whole strings.
+// Attributes: whether what they need is declared, and whether their types take their values.
 
 #include <cmath>
 #include <unordered_map>
 
 #include "tool/check/Attributes.h"
 #include "tool/check/Digits.h"
-#include "tool/check/Fold.h"
 #include "tool/check/SeededHash.h"
+#include "tool/check/ValueChecks.h"
 
 using namespace Vesk_Hdl;
 
@@ -38,7 +38,7 @@ class AttributeChecker {
 public:
     explicit AttributeChecker(Design const &checked)
         : design(checked), useAttrType(checked.options.vhdlOption.useAttrType),
-          usesPackages(UsesPackages(checked.options.vhdlOption.useLibraries)) {
+          usesPackages(UsesPackages(checked.options.vhdlOption.useLibraries)), values(checked) {
         ForEachAttribute(design, [this](AttributeUse const &use) {
             if (use.generic)
                 return;
@@ -60,9 +60,9 @@ public:
                 CheckGeneric(use);
             CheckType(use);
             CheckLiteral(use);
-            CheckValue(use);
+            values.Check(use);
         });
-        CheckInheritedFolds();
+        values.CheckInherited();
         FindUnwritten();
         CheckLibraries(design, typed);
     }
@@ -83,15 +83,9 @@ private:
         return use.kind == AttributeUse::SIGNAL && static_cast<Signal const *>(use.owner)->IsPort();
     }
 
-    void Add(Id id, AttributeUse const &use, Languages languages = BOTH, std::string detail = {}) {
-        Spot const spot = design.MadeAt(use.attribute);
-        design.findings.Add({id,
-                             spot.line > 0 ? spot : design.MadeAt(use.owner),
-                             "attribute " + Quoted(use.attribute->GetNameRef().View()) + " of " +
-                                 Quoted(use.owner->GetNameRef().View()),
-                             {},
-                             languages,
-                             std::move(detail)});
+    void Add(Id id, AttributeUse const &use, Languages languages = BOTH,
+             std::string detail = {}) const {
+        AddFinding(design, id, use, languages, std::move(detail));
     }
 
     /// The entity declares and assigns the attributes of one port after the other. The places of
@@ -150,7 +144,7 @@ private:
         if (type != declaredType && !type.empty() && !declaredType.empty())
             Add(Id::ATTRIBUTE_TYPE, use, VHDL, type + " for " + declaredType);
         bool const tooEarly = ComesTooEarly(use, name);
-        if ((!declaration || tooEarly) && !IsLeftOut(use) && !usesPackages)
+        if ((!declaration || tooEarly) && !IsLeftOut(design, use) && !usesPackages)
             Add(Id::UNDECLARED_ATTRIBUTE, use, VHDL,
                 tooEarly ? "the port that declares it comes later in the entity" : "");
     }
@@ -179,8 +173,9 @@ private:
     void CheckType(AttributeUse const &use) {
         if (use.attribute->GetValueType() != Attribute::VALUE_USER)
             return;
-        bool const isDeclared = use.generic ? use.kind != AttributeUse::INSTANCE && !IsLeftOut(use)
-                                            : useAttrType && use.attribute->IsSynDeclared();
+        bool const isDeclared = use.generic
+                                    ? use.kind != AttributeUse::INSTANCE && !IsLeftOut(design, use)
+                                    : useAttrType && use.attribute->IsSynDeclared();
         if (isDeclared && VhdlTypeOf(*use.attribute).empty())
             Add(Id::ATTRIBUTE_WITHOUT_TYPE, use, VHDL);
         else if (isDeclared)
@@ -201,7 +196,7 @@ private:
 
     /// A vector of bits may have any text for a value, and a number may have none.
     void CheckLiteral(AttributeUse const &use) {
-        bool const inVhdl = (use.generic || useAttrType) && !IsLeftOut(use);
+        bool const inVhdl = (use.generic || useAttrType) && !IsLeftOut(design, use);
         Languages const written =
             (inVhdl ? VHDL : NO_LANGUAGE) | (use.generic ? VERILOG : NO_LANGUAGE);
         Languages bad = NO_LANGUAGE;
@@ -212,194 +207,6 @@ private:
         if ((bad & written) != NO_LANGUAGE)
             Add(Id::ATTRIBUTE_VALUE, use, bad & written,
                 Quoted(use.attribute->GetValueString().View()));
-    }
-
-    bool IsLeftOut(AttributeUse const &use) const {
-        return use.kind == AttributeUse::COMPONENT && design.options.vhdlOption.suppressComponent;
-    }
-
-    // How a value is written: as a string in both languages, in one of them, or in none.
-
-    Languages QuotedIn(AttributeUse const &use) const {
-        Attribute::ValueType const type = use.attribute->GetValueType();
-        bool const asString = type == Attribute::VALUE_STRING;
-        Languages quoted = NO_LANGUAGE;
-        if ((asString || (!use.generic && !useAttrType)) && !IsLeftOut(use))
-            quoted |= VHDL;
-        // A component's generic is a parameter of each instance; other attributes are comments.
-        if (use.generic && (asString || type == Attribute::VALUE_USER))
-            quoted |= VERILOG;
-        return quoted;
-    }
-
-    /// Values of a user's type keep their quotes in Verilog.
-    static Text ValueInVerilog(Attribute const &attribute) {
-        Text const value = attribute.GetValueString();
-        return attribute.GetValueType() == Attribute::VALUE_USER
-                   ? value
-                   : HdlUtilities::RemoveQuotes(value);
-    }
-
-    void CheckValue(AttributeUse const &use) {
-        Languages const quoted = QuotedIn(use);
-        if (quoted == NO_LANGUAGE)
-            return;
-        Text const bare = HdlUtilities::RemoveQuotes(use.attribute->GetValueString());
-        Text const verilog = ValueInVerilog(*use.attribute);
-        Languages const bad = (BreaksVhdl(bare.View()) ? VHDL : NO_LANGUAGE) |
-                              (BreaksVerilog(verilog.View()) ? VERILOG : NO_LANGUAGE);
-        if ((bad & quoted) != NO_LANGUAGE)
-            Add(Id::QUOTED_VALUE, use, bad & quoted);
-        if (bare.View().find(' ') == std::string_view::npos)
-            return;
-        Languages const broken = (quoted & VHDL ? FoldsInVhdl(use, bare) : NO_LANGUAGE) |
-                                 (quoted & VERILOG ? FoldsInVerilog(use, verilog) : NO_LANGUAGE);
-        if (broken != NO_LANGUAGE)
-            Add(Id::FOLDED_VALUE, use, broken);
-    }
-
-    static bool BreaksVhdl(std::string_view value) {
-        for (std::size_t i = 0; i < value.size(); ++i)
-            if (value[i] == '"' && (i + 1 == value.size() || value[++i] != '"'))
-                return true;
-        return false;
-    }
-
-    /// Readers differ in what a backslash makes of other characters than these two.
-    static bool BreaksVerilog(std::string_view value) {
-        for (std::size_t i = 0; i < value.size(); ++i)
-            if (value[i] == '"' || (value[i] == '\\' &&
-                                    (++i == value.size() || (value[i] != '\\' && value[i] != '"'))))
-                return true;
-        return false;
-    }
-
-    Languages FoldsInVhdl(AttributeUse const &use, Text const &value) {
-        std::string_view const name = use.attribute->GetNameRef().View();
-        if (!use.generic)
-            return FoldsInAttribute(use, value.View());
-        bool const isMap = use.kind == AttributeUse::INSTANCE;
-        if (clause.owner != use.owner)
-            clause = Clause(*use.owner); // the attributes of an owner come one after the other
-        Position const position(clause, use.attribute);
-        Fold fold(use.kind == AttributeUse::COMPONENT ? 2 : 1);
-        // A clause begins with its word, later items with blanks in place of it.
-        if (position.isFirst)
-            fold.Put(isMap ? "generic map" : "generic").Put("( ");
-        else
-            fold.Put("         ");
-        fold.Put(name).Put(isMap ? " => " : " : ");
-        if (!isMap)
-            fold.Put("string").Put(" :=  ");
-        fold.Put("\"").Put(value.View(), true).Put("\"");
-        // What ends the clause or parts its items; translate marks have lines of their own.
-        if (!position.isLastOfKind)
-            fold.Put(",");
-        else if (!position.isMixed)
-            fold.Put(")").Put(isMap ? "" : ";");
-        return fold.IsBroken() ? VHDL : NO_LANGUAGE;
-    }
-
-    /// The first and the last generic of each option in the clause of an owner.
-    struct Clause {
-        Object const *owner = nullptr;
-        Attribute const *first[2] = {}; ///< of option SYN, of option NOSYN
-        Attribute const *last[2] = {};
-
-        Clause() = default;
-        explicit Clause(Object const &clauseOwner) : owner(&clauseOwner) {
-            ForEach(dynamic_cast<AttributeHolder const &>(clauseOwner).GetAttrIterator(),
-                    [this](Attribute const *generic) {
-                        if (!generic->IsGenericSyn() && !generic->IsGenericNoSyn())
-                            return;
-                        int const option = generic->IsGenericSyn() ? 0 : 1;
-                        last[option] = generic;
-                        if (!first[option])
-                            first[option] = generic;
-                    });
-        }
-    };
-
-    /// Where a generic stands in its clause, which lists those of option SYN first.
-    struct Position {
-        bool isFirst;
-        bool isLastOfKind;
-        bool isMixed;
-
-        Position(Clause const &clause, Attribute const *generic) {
-            int const option = generic->IsGenericSyn() ? 0 : 1;
-            isMixed = clause.first[0] && clause.first[1];
-            isFirst = generic == clause.first[option] && (option == 0 || !clause.first[0]);
-            isLastOfKind = generic == clause.last[option];
-        }
-    };
-
-    static Languages FoldsInAttribute(AttributeUse const &use, std::string_view value) {
-        std::string_view const objectClass = use.kind == AttributeUse::SIGNAL     ? "signal"
-                                             : use.kind == AttributeUse::INSTANCE ? "label"
-                                                                                  : "component";
-        Fold fold(1);
-        fold.Put("attribute").Put(" ").Put(use.attribute->GetNameRef().View()).Put(" ");
-        fold.Put("of").Put(" ").Put(BaseOf(*use.owner)).Put(" : ").Put(objectClass);
-        fold.Put(" ").Put("is").Put(" ").Put("\"").Put(value, true).Put("\"").Put(";");
-        return fold.IsBroken() ? VHDL : NO_LANGUAGE;
-    }
-
-    static bool FoldsAsParameter(Fold fold, AttributeUse const &use, Text const &value) {
-        fold.Put(use.attribute->GetNameRef().View()).Put(" = ");
-        fold.Put("\"").Put(value.View(), true).Put("\"").Put(";");
-        return fold.IsBroken();
-    }
-
-    static bool FoldsAsDefparam(Object const &instance, AttributeUse const &use,
-                                Text const &value) {
-        return FoldsAsParameter(
-            Fold(1).Put("defparam").Put(" ").Put(instance.GetNameRef().View()).Put("."), use,
-            value);
-    }
-
-    static Languages FoldsInVerilog(AttributeUse const &use, Text const &value) {
-        bool const broken =
-            use.kind == AttributeUse::MODULE
-                ? FoldsAsParameter(Fold(1).Put("parameter").Put(" "), use, value)
-                : use.kind == AttributeUse::INSTANCE && FoldsAsDefparam(*use.owner, use, value);
-        return broken ? VERILOG : NO_LANGUAGE;
-    }
-
-    /// The generics of a component that a Verilog line of an instance may break.
-    std::vector<AttributeUse> FindInheritable(Component const &component) {
-        std::vector<AttributeUse> found;
-        ForEach(component.GetAttrIterator(), [&](Attribute const *attribute) {
-            AttributeUse const use{attribute, AttributeUse::COMPONENT, &component, true};
-            if ((attribute->IsGenericSyn() || attribute->IsGenericNoSyn()) &&
-                (QuotedIn(use) & VERILOG) != NO_LANGUAGE &&
-                ValueInVerilog(*attribute).View().find(' ') != std::string_view::npos)
-                found.push_back(use);
-        });
-        return found;
-    }
-
-    /// A component's generic stands in a Verilog line of each instance that has none of its own.
-    /// One that breaks is told once.
-    void CheckInheritedFolds() {
-        std::unordered_map<Component const *, std::vector<AttributeUse>> inheritable;
-        design.ForEachInstance([&](Instance const *instance) {
-            Component const *const component = instance->GetComponent();
-            if (!component || !component->HasAttrs())
-                return;
-            auto const [known, isNew] = inheritable.try_emplace(component);
-            std::vector<AttributeUse> &uses = known->second;
-            if (isNew)
-                uses = FindInheritable(*component);
-            std::erase_if(uses, [&](AttributeUse const &use) {
-                if (instance->GetAttr(use.attribute->GetNameRef()) ||
-                    !FoldsAsDefparam(*instance, use, ValueInVerilog(*use.attribute)))
-                    return false;
-                Add(Id::FOLDED_VALUE, use, VERILOG,
-                    "at the instance " + Quoted(instance->GetNameRef().View()));
-                return true;
-            });
-        });
     }
 
     /// Attribute statements are written of whole nets, instances and components alone.
@@ -425,7 +232,7 @@ private:
     Design const &design;
     bool useAttrType;
     bool usesPackages;
-    Clause clause; ///< of the generic that was looked at last
+    ValueChecker values;
     std::unordered_map<std::string, Attribute const *, SeededHash> declared; ///< by name, the first
     std::unordered_map<std::string, Attribute const *, SeededHash> declaredByPorts;
     std::vector<AttributeUse> typed; ///< with types of the user's

@@ -22,6 +22,18 @@ Attribute const *ComingBoxTypeOf(Component const &component) {
     return IsVendorCell(component) && !component.GetAttr("BOX_TYPE") ? &boxType : nullptr;
 }
 
+void AddFinding(Design const &design, Id id, AttributeUse const &use, Languages languages,
+                std::string detail) {
+    Spot const spot = design.MadeAt(use.attribute);
+    design.findings.Add({id,
+                         spot.line > 0 ? spot : design.MadeAt(use.owner),
+                         "attribute " + Quoted(use.attribute->GetNameRef().View()) + " of " +
+                             Quoted(use.owner->GetNameRef().View()),
+                         {},
+                         languages,
+                         std::move(detail)});
+}
+
 bool IsConfigured(Design const &design, Component const &component) {
     return !design.options.vhdlOption.suppressConfiguration && !IsVendorCell(component);
 }

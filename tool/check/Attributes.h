@@ -27,6 +27,18 @@ Vesk_Hdl::Attribute const *ComingBoxTypeOf(Vesk_Hdl::Component const &component)
 /// Whether the VHDL configuration takes the component, which has instances, from the library work.
 bool IsConfigured(Design const &design, Vesk_Hdl::Component const &component);
 
+/// Whether no VHDL is written of the attribute: it is that of a component that is not declared.
+inline bool IsLeftOut(Design const &design, AttributeUse const &use) {
+    return use.kind == AttributeUse::COMPONENT && design.options.vhdlOption.suppressComponent;
+}
+
+/// Adds a finding about an attribute, at the place where it was made.
+void AddFinding(Design const &design, Id id, AttributeUse const &use, Languages languages = BOTH,
+                std::string detail = {});
+
+/// Whether the design is a macro that hands its generic INIT on to its instances in VHDL.
+bool HandsInitOn(Design const &design);
+
 /// Whether VHDL hands the generic INIT of the design on to each instance of the component, in place
 /// of the instance's own.
 bool TakesInitOfMacro(Design const &design, Vesk_Hdl::Component const &component);

@@ -42,9 +42,9 @@ public:
         if (&target == &source)
             Add(Id::SELF_ASSIGNMENT, target);
         Signal const *const declared = DeclaredOf(design, target);
-        Design::Dummy const *const dummy = design.DummyOf(declared);
+        DummyPlan::Step const *const dummy = design.dummies.Find(declared);
         // What was assigned to an in port that is driven as well goes to its dummy.
-        bool const moves = dummy && !dummy->portTakesDummy;
+        bool const moves = dummy && !dummy->IsNetAssigned();
         if (target.GetPortPolarity() == Polarity::INPUT && !moves)
             Add(Id::ASSIGNED_IN_PORT, target);
         if (source.GetPortPolarity() == Polarity::OUTPUT)
@@ -86,7 +86,8 @@ private:
 class CompoundChecker {
 public:
     CompoundChecker(Design const &checked, CompoundBus const &checkedCompound)
-        : design(checked), compound(checkedCompound), dummy(checked.DummyOf(&checkedCompound)) {
+        : design(checked), compound(checkedCompound),
+          dummy(checked.dummies.Find(&checkedCompound)) {
         Design::ForEachPinOn(compound, [this](Pin const *pin) {
             drives |= pin->GetPolarity() != Polarity::INPUT;
             reads |= pin->GetPolarity() != Polarity::OUTPUT;
@@ -103,12 +104,12 @@ private:
     void CheckMember(Signal const &member) {
         Polarity const polarity = member.GetPortPolarity();
         Signal const *const declared = DeclaredOf(design, member);
-        Design::Dummy const *const own = design.DummyOf(declared);
+        DummyPlan::Step const *const own = design.dummies.Find(declared);
         if (dummy) {
             if (polarity == Polarity::BIDIRECTIONAL)
                 Add(Id::INOUT_IN_COMPOUND, member, BOTH);
             // The members are treated like the first one, unless they had a dummy before.
-            if (own && polarity == (own->portTakesDummy ? Polarity::INPUT : Polarity::OUTPUT))
+            if (own && polarity == (own->IsNetAssigned() ? Polarity::INPUT : Polarity::OUTPUT))
                 Add(Id::IN_PORT_IN_COMPOUND, member, BOTH);
             return;
         }
@@ -120,7 +121,7 @@ private:
             Add(Id::IN_PORT_IN_COMPOUND, member, BOTH);
         if (polarity == Polarity::OUTPUT && reads)
             Add(Id::OUT_PORT_IN_COMPOUND, member, VHDL);
-        if (drives && own && own->stage == Design::READ_STAGE)
+        if (drives && own && own->reason == DummyPlan::READ_OUT_PORT)
             Add(Id::BYPASSED_DUMMY, member, BOTH);
     }
 
@@ -139,7 +140,7 @@ private:
 
     Design const &design;
     CompoundBus const &compound;
-    Design::Dummy const *dummy;
+    DummyPlan::Step const *dummy;
     std::set<Id> found;
     bool drives = false;
     bool reads = false;
@@ -183,10 +184,10 @@ void CheckConnections(Design const &design) {
             CompoundChecker(design, *compound).Run();
     });
     design.ForEachSignal([&design](Signal const *signal) {
-        Design::Dummy const *const dummy = design.DummyOf(signal);
+        DummyPlan::Step const *const dummy = design.dummies.Find(signal);
         if (!dummy)
             return;
-        bool const isLeft = dummy->stage == Design::READ_STAGE; // by its readers
+        bool const isLeft = dummy->reason == DummyPlan::READ_OUT_PORT; // by its readers
         auto const checkPart = [&design, isLeft](Signal const *part) {
             CheckReturns(design, *part);
             if (isLeft)

@@ -2,6 +2,7 @@
 
 #include "tool/check/Design.h"
 #include "tool/check/Digits.h"
+#include "tool/check/WrittenText.h"
 
 using namespace Vesk_Hdl;
 
@@ -43,16 +44,16 @@ private:
              std::move(detail)});
     }
 
-    /// Of a bit the last digit is written, as 0 if it is 0 and otherwise as 1.
+    /// One digit is written, in quotes, whatever the constant holds.
     void CheckBit() {
-        std::string const &text = digits.GetText();
-        std::size_t const at =
-            value.GetLength() > 0 ? static_cast<std::size_t>(value.GetLength()) - 1 : text.size();
-        char const digit = at < text.size() ? text[at] : '1';
-        if (value.GetLength() != 1 || text.size() != 1)
-            Add(Id::CONSTANT_WIDTH, BOTH, std::string("written as ") + (digit == '0' ? '0' : '1'));
-        else if (digit != '0' && digit != '1')
-            Add(Id::CONSTANT_DIGIT, BOTH, "written as 1");
+        std::string const statement = WrittenText::Plain([this](OutStream &stream) {
+            VhdlStatements(stream).WriteConstantSignalAssignment(net.GetNameRef(), true, value);
+        });
+        std::string const written(1, statement[statement.rfind('\'') - 1]);
+        if (value.GetLength() != 1 || digits.GetText().size() != 1)
+            Add(Id::CONSTANT_WIDTH, BOTH, "written as " + written);
+        else if (digits.GetText() != written)
+            Add(Id::CONSTANT_DIGIT, BOTH, "written as " + written);
     }
 
     void CheckBased() {

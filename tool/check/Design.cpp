@@ -11,7 +11,7 @@ namespace Checks {
 Design::Design(Model &model, Places const &madePlaces, Recorder const &history,
                Findings &foundThings)
     : netlist(*model.GetNetlist()), options(*model.GetOptions()), places(madePlaces),
-      recorder(history), findings(foundThings) {
+      recorder(history), findings(foundThings), dummies(netlist) {
     Component const *last = nullptr;
     ForEachInstance([&](Instance const *instance) {
         Component const *const component = instance->GetComponent();
@@ -19,9 +19,7 @@ Design::Design(Model &model, Places const &madePlaces, Recorder const &history,
             firstInstances.try_emplace(component, instance);
         last = component;
     });
-    PinUses const pins = WalkPins();
-    FindDummies(pins);
-    FindUses(pins);
+    FindUses();
 }
 
 Spot Design::ConnectedAt(Instance const &instance, Pin const &pin) const {
@@ -81,11 +79,6 @@ Instance const *Design::OwnerOf(Pin const *pin) const {
     return found == owners.end() || found->first != pin ? nullptr : found->second;
 }
 
-Design::Dummy const *Design::DummyOf(Signal const *signal) const {
-    auto const found = dummies.find(signal);
-    return found == dummies.end() ? nullptr : &found->second;
-}
-
 std::span<Use const> Design::FurtherUses(Signal const *signal) const {
     auto const [first, last] =
         std::equal_range(usedSignals.begin(), usedSignals.end(), signal, std::less<>());
@@ -101,44 +94,24 @@ Use Design::UseOf(Pin const *pin) {
             pin, nullptr};
 }
 
-/// Out ports that are read get their dummies here: the first stage of the rewriting.
-Design::PinUses Design::WalkPins() {
-    PinUses found;
+template <class Act> void Design::ForEachTie(Act act) const {
     std::unordered_set<Pin const *> listed;
-    ForEachSignal([&listed](Signal const *signal) {
-        if (signal->HasConstantValue())
-            ForEachPinOn(*signal, [&listed](Pin const *pin) { listed.insert(pin); });
-    });
-    ForEachPin([&](Instance const &, Pin const &pin) {
-        Signal const *const signal = pin.GetSignal();
-        if (!signal)
+    bool hasConstants = false;
+    ForEachSignal([&](Signal const *signal) {
+        if (!signal->HasConstantValue())
             return;
-        Polarity const port = signal->GetPortPolarity();
-        Polarity const polarity = pin.GetPolarity();
-        auto const is = [&polarity](Polarity::Value use) {
-            return polarity == use || polarity == Polarity::BIDIRECTIONAL;
-        };
-        if (port == Polarity::OUTPUT && is(Polarity::INPUT))
-            DemandDummy(signal, READ_STAGE);
-        else if (port == Polarity::INPUT && is(Polarity::OUTPUT))
-            found.driven.push_back(signal);
-        if (signal->HasConstantValue() && listed.count(&pin) == 0)
-            found.ties.emplace_back(signal, UseOf(&pin));
+        hasConstants = true;
+        ForEachPinOn(*signal, [&listed](Pin const *pin) { listed.insert(pin); });
     });
-    return found;
+    if (hasConstants)
+        ForEachPin([&](Instance const &, Pin const &pin) {
+            Signal const *const signal = pin.GetSignal();
+            if (signal && signal->HasConstantValue() && listed.count(&pin) == 0)
+                act(signal, UseOf(&pin));
+        });
 }
 
-/// A name that one stage took is out of the later ones.
-void Design::FindDummies(PinUses const &pins) {
-    for (Signal const *const signal : pins.driven)
-        DemandDummy(signal, DRIVEN_STAGE);
-    ForEachSignal([this](Signal const *signal) {
-        if (signal->GetPortPolarity() == Polarity::OUTPUT && signal->HasMultiDriver())
-            DemandDummy(signal, WIRED_STAGE);
-    });
-}
-
-void Design::FindUses(PinUses const &pins) {
+void Design::FindUses() {
     std::vector<std::pair<Signal const *, Use>> found;
     auto const addTo = [&found](Signal const *signal, Use const &use) {
         auto const *const compound = dynamic_cast<CompoundBus const *>(signal);
@@ -158,8 +131,7 @@ void Design::FindUses(PinUses const &pins) {
             addTo(signal, {Use::DRIVES, nullptr, source});
         });
     });
-    for (auto const &[signal, use] : pins.ties)
-        addTo(signal, use);
+    ForEachTie(addTo);
     std::stable_sort(found.begin(), found.end(), [](auto const &left, auto const &right) {
         return std::less<>()(left.first, right.first);
     });
@@ -169,27 +141,6 @@ void Design::FindUses(PinUses const &pins) {
         usedSignals.push_back(signal);
         furtherUses.push_back(use);
     }
-}
-
-void Design::DemandDummy(Signal const *signal, int stage) {
-    Dummy const dummy = {stage != DRIVEN_STAGE, signal, stage, nullptr};
-    NeedDummy(signal, dummy);
-    if (auto const *const compound = dynamic_cast<CompoundBus const *>(signal))
-        for (int i = 0; i < compound->GetSize(); ++i)
-            NeedDummy(compound->GetAt(i), dummy);
-}
-
-/// Scalars and compounds by themselves, bits and slices with their bus.
-void Design::NeedDummy(Signal const *signal, Dummy const &dummy) {
-    Signal::SignalType const type = signal->GetSignalType();
-    if (type == Signal::SIGNAL_BUS_SLICE || type == Signal::SIGNAL_BUS_INDEX)
-        signal = BusOf(*signal);
-    if (!signal)
-        return;
-    auto const [found, isNew] = dummies.try_emplace(signal, dummy);
-    bool const isMember = dummy.demand != signal;
-    if (!isNew && isMember && type == Signal::SIGNAL_SCALAR && found->second.stage < dummy.stage)
-        found->second.again = dummy.demand;
 }
 
 } // namespace Checks

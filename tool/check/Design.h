@@ -24,20 +24,6 @@ struct Use {
 /// for each write that is checked, in one walk over the design.
 class Design {
 public:
-    static constexpr int READ_STAGE = 1;   ///< of the rewriting: out ports that are read
-    static constexpr int DRIVEN_STAGE = 2; ///< in ports that are driven
-    static constexpr int WIRED_STAGE = 3;  ///< out ports with several drivers
-
-    /// A port that the rewriting before a write gives a dummy signal, or a member of the same
-    /// compound, which shares its lot.
-    struct Dummy {
-        bool portTakesDummy;            ///< the port is assigned from the dummy; else the reverse
-        Vesk_Hdl::Signal const *demand; ///< on whose pins that was found
-        int stage;                      ///< of the rewriting
-        /// A later stage meets the dummy, which stands in a compound by then, and gives it one.
-        Vesk_Hdl::Signal const *again;
-    };
-
     Design(Vesk_Hdl::Model &model, Places const &madePlaces, Recorder const &history,
            Findings &foundThings);
 
@@ -65,7 +51,6 @@ public:
     /// The bus of a bit or slice, null if there is none.
     Vesk_Hdl::Bus *BusOf(Vesk_Hdl::Signal const &part) const;
     Vesk_Hdl::Instance const *OwnerOf(Vesk_Hdl::Pin const *pin) const;
-    Dummy const *DummyOf(Vesk_Hdl::Signal const *signal) const;
     /// The uses of a signal that are not in its list of pins: through compounds, assignments and
     /// ties to constants.
     std::span<Use const> FurtherUses(Vesk_Hdl::Signal const *signal) const;
@@ -108,21 +93,13 @@ public:
     Recorder const &recorder;
     Findings &findings;
     std::unordered_map<Vesk_Hdl::Component const *, Vesk_Hdl::Instance const *> firstInstances;
-    std::unordered_map<Vesk_Hdl::Signal const *, Dummy> dummies;
+    Vesk_Hdl::DummyPlan const dummies; ///< that a write would make
 
 private:
-    /// What one walk over all pins finds.
-    struct PinUses {
-        std::vector<Vesk_Hdl::Signal const *> driven; ///< in ports that a pin drives
-        /// Pins that were tied to a constant: their signals do not list them.
-        std::vector<std::pair<Vesk_Hdl::Signal const *, Use>> ties;
-    };
-
-    PinUses WalkPins();
-    void FindDummies(PinUses const &pins);
-    void FindUses(PinUses const &pins);
-    void DemandDummy(Vesk_Hdl::Signal const *signal, int stage);
-    void NeedDummy(Vesk_Hdl::Signal const *signal, Dummy const &dummy);
+    void FindUses();
+    /// Calls `act` with the net and the use of each pin that was tied to a constant: such a net
+    /// does not list the pin.
+    template <class Act> void ForEachTie(Act act) const;
 
     std::vector<Vesk_Hdl::Signal const *> usedSignals; ///< sorted, and beside it the uses
     std::vector<Use> furtherUses;

@@ -162,14 +162,7 @@ private:
     }
 
     void Add(Id id, AttributeUse const &use, std::string const &type) {
-        Spot const spot = design.MadeAt(use.attribute);
-        design.findings.Add({id,
-                             spot.line > 0 ? spot : design.MadeAt(use.owner),
-                             "attribute " + Quoted(use.attribute->GetNameRef().View()) + " of " +
-                                 Quoted(use.owner->GetNameRef().View()),
-                             {},
-                             BOTH,
-                             Quoted(type)});
+        AddFinding(design, id, use, BOTH, Quoted(type));
     }
 
     Design const &design;

@@ -64,8 +64,10 @@ void CheckInstance(Design const &design, Instance const &instance) {
 
 } // namespace
 
+bool HandsInitOn(Design const &design) { return HandedInitOf(design) != nullptr; }
+
 bool TakesInitOfMacro(Design const &design, Component const &component) {
-    return HandedInitOf(design) && component.GetAttr("INIT");
+    return HandsInitOn(design) && component.GetAttr("INIT");
 }
 
 void CheckMacro(Design const &design) {

@@ -19,8 +19,8 @@ public:
     }
 
     void Run() {
-        for (auto const &[signal, dummy] : design.dummies)
-            CheckDummy(*signal, dummy);
+        for (int i = 0; i < design.dummies.GetSize(); ++i)
+            CheckDummy(design.dummies.GetAt(i));
         if (opens || design.places.HasOpen())
             design.ForEachPin([this](Instance const &instance, Pin const &pin) {
                 if (IsOpened(pin))
@@ -72,8 +72,10 @@ private:
                                       NameInVerilog(*taken.object, design.options);
     }
 
-    void CheckDummy(Signal const &signal, Design::Dummy const &dummy) {
-        if (signal.GetSignalType() == Signal::SIGNAL_COMPOUND_BUS)
+    /// A net gets one finding, whatever becomes of its dummy signal.
+    void CheckDummy(DummyPlan::Step const &step) {
+        Signal const &signal = *step.net;
+        if (signal.GetSignalType() == Signal::SIGNAL_COMPOUND_BUS || step.former != DummyPlan::NONE)
             return;
         Text const dummyName = signal.GetDummySignalName();
         auto const add = [&](Id id, Related related, Languages languages) {
@@ -84,11 +86,13 @@ private:
                                  languages,
                                  Quoted(dummyName.View())});
         };
-        if (dummy.again)
-            return add(Id::DUMMY_OF_DUMMY, {dummy.again, "it is a member of this compound"}, BOTH);
+        if (step.later != DummyPlan::NONE)
+            return add(Id::DUMMY_OF_DUMMY,
+                       {design.dummies.GetAt(step.later).demand, "it is a member of this compound"},
+                       BOTH);
         std::string const base(BaseOf(dummyName.View()));
         if (SameIgnoringCase(base, BaseOf(signal)))
-            return add(Id::DUMMY_OF_DUMMY, {dummy.demand, "the other one is here"}, BOTH);
+            return add(Id::DUMMY_OF_DUMMY, {step.demand, "the other one is here"}, BOTH);
         Taken const taken = FindTaken(base);
         if (taken.object)
             add(Id::DUMMY_NAME_TAKEN, {taken.object, "the other one is here"},

@@ -334,7 +334,7 @@ private:
         std::string const partBase =
             isInside ? Cased(BaseOf(part), nameCase) : std::string(BaseOf(part));
         // The dummy of a part is inside and takes its place.
-        bool const isReplaced = !isInside && design.DummyOf(&bus);
+        bool const isReplaced = !isInside && design.dummies.Find(&bus);
         if (base == partBase || isReplaced || !design.IsWritten(part))
             return;
         Id const id = isInside || nameCase == VerilogOption::CASE_DEFAULT ? Id::BIT_IN_OTHER_CASE

@@ -22,9 +22,10 @@ void Rewrite(Session &session, Design const &design, Places &places, std::string
     auto const note = [&](Signal const &signal) {
         dummyNames.emplace_back(signal.GetDummySignalName(), design.NetAt(signal));
     };
-    for (auto const &[signal, dummy] : design.dummies) {
-        note(*signal);
-        if (auto const *const bus = dynamic_cast<Bus const *>(signal))
+    for (int i = 0; i < design.dummies.GetSize(); ++i) {
+        Signal const *const net = design.dummies.GetAt(i).net;
+        note(*net);
+        if (auto const *const bus = dynamic_cast<Bus const *>(net))
             ForEach(bus->GetBusSliceIterator(), [&](Signal const *part) { note(*part); });
     }
     auto const &nets = *design.netlist.GetSignalIterator().GetArray();

@@ -2,7 +2,7 @@
 // include paths.
 
 #include "tool/check/Attributes.h"
-#include "tool/check/Fold.h"
+#include "tool/check/WrittenText.h"
 
 using namespace Vesk_Hdl;
 
@@ -128,18 +128,19 @@ private:
                            [](char c) { return c < ' ' || c > '~' || c == '*'; });
     }
 
-    /// Free texts of the header are wrapped: any word may come first on a line.
+    /// Free texts of the header are wrapped: any word may come first on a line. Of the lines of a
+    /// header only those of the text can be directives.
     void CheckSentences(Text const &text, char const *subject) {
-        constexpr std::size_t FIRST_COLUMN = 6;
-        constexpr std::size_t LAST_COLUMN = 79;
-        std::vector<std::string> const words = WordsOf(text.View());
-        std::size_t column = FIRST_COLUMN;
-        for (std::size_t i = 0; i < words.size(); ++i) {
-            if (words[i].size() + 1 + column > LAST_COLUMN)
-                column = FIRST_COLUMN;
-            if (column == FIRST_COLUMN && i + 1 < words.size())
-                AddDirective(words[i] + " " + words[i + 1], BOTH, design.TextAt(&text), subject);
-            column += words[i].size() + 1;
+        if (text.IsEmpty())
+            return;
+        std::string const header = WrittenText::Plain([&text](OutStream &stream) {
+            NetlistHeader("", "", "", "", "", text, "", true, stream).Write("");
+        });
+        constexpr std::size_t MARK = 2;
+        for (std::size_t begin = 0, end = 0; begin < header.size(); begin = end + 1) {
+            end = std::min(header.find('\n', begin), header.size());
+            AddDirective(std::string_view(header).substr(begin, end - begin).substr(MARK), BOTH,
+                         design.TextAt(&text), subject);
         }
     }
 
@@ -178,13 +179,17 @@ private:
     void CheckIncludes() {
         StringArray const &includes = options.verilogOption.includes;
         std::vector<Spot> const spots = design.TextsAt(&includes, includes.GetSize());
+        WrittenText line;
         for (int i = 0; i < includes.GetSize(); ++i) {
             Spot const spot = spots[static_cast<std::size_t>(i)];
             Text const path = HdlUtilities::RemoveQuotes(includes.At(i));
             std::string const subject = "include file " + Quoted(path.View());
-            Fold fold(0);
-            fold.Put("`include").Put(" \"").Put(path.View(), true).Put("\"");
-            if (fold.IsFolded() || path.View().find('"') != std::string_view::npos)
+            line.Take(0, [&](OutStream &stream) {
+                StringArray include;
+                include.Add(includes.At(i));
+                VerilogStatements(stream).WriteIncludePath(include);
+            });
+            if (line.IsFolded() || path.View().find('"') != std::string_view::npos)
                 design.findings.Add({Id::INCLUDE_PATH, spot, subject});
             AddRefused(path.View(), true, VERILOG, spot, subject);
         }

@@ -38,6 +38,15 @@ public:
     /// exception of the stream's guard passes through.
     void WriteNetlist(Netlist *netlist, HdlOptions const *options);
 
+    // Pieces of that file, each for one object alone; of an object without generics nothing. They
+    // change nothing, so that a client can look at a piece before it writes.
+
+    /// The generic clause of the entity, for a netlist, or of a component's declaration.
+    void WriteGenericDeclarations(AttributeHolder const &holder);
+    /// The generic map of an instance. With `handsInitOn` it gets the macro's INIT in place of its
+    /// own, if its component has one.
+    void WriteGenericAssociations(Instance const &instance, bool handsInitOn);
+
 private:
     void WriteEntity(Netlist const *netlist, HdlOptions const *options);
     void WriteArchitecture(Netlist const *netlist, HdlOptions const *options);

@@ -192,6 +192,14 @@ struct VhdlNetlister::GenericItems {
     bool IsEmpty() const { return !init && syn.IsEmpty() && nosyn.IsEmpty(); }
 };
 
+void VhdlNetlister::WriteGenericDeclarations(AttributeHolder const &holder) {
+    WriteGenericMap(&holder, true);
+}
+
+void VhdlNetlister::WriteGenericAssociations(Instance const &instance, bool handsInitOn) {
+    WriteInstanceGenericMap(&instance, false, handsInitOn);
+}
+
 void VhdlNetlister::WriteGenericMap(AttributeHolder const *holder, bool isDeclaration) {
     if (!holder || !holder->HasAttrs())
         return;

@@ -16,7 +16,7 @@ namespace Vesk_Hdl {
 /// If memory runs out (std::bad_alloc), a netlist is whole, but a pass may have rewritten a part of
 /// it. For one thread; several may read a netlist at the same time as long as none changes it.
 ///
-/// Sources: Netlist.cpp (contents), Netlist_passes.cpp (the rewriting before a write). See
+/// Sources: Netlist.cpp (contents), passes/Netlist_passes.cpp (the rewriting before a write). See
 /// docs/architecture.md, "Who owns what".
 class VESK_HDL_API Netlist : public Object, public AttributeHolder {
 public:
@@ -143,7 +143,6 @@ private:
 
     void GetWiredOrOutputSignals(StringSet &names);
     void GetFeedBackSignals(bool outPortToInPin, StringSet &names);
-    void FindFeedBack(StringSet &read, PtrArray<Signal *> &driven);
     void AddDummySignals(bool portTakesDummy, StringSet &names);
 
     std::unique_ptr<Record> record;

@@ -1,0 +1,77 @@
+#include "tool/check/WrittenText.h"
+
+#include <algorithm>
+#include <cassert>
+#include <cerrno>
+#include <sys/mman.h>
+#include <system_error>
+#include <unistd.h>
+
+using namespace Vesk_Hdl;
+
+namespace Checks {
+
+std::string WrittenText::Plain(Write const &write) {
+    TextMemOutStream memory;
+    write(memory);
+    return std::string(memory.GetValue().View());
+}
+
+void WrittenText::Take(int level, Write const &write) {
+    plain = Plain(write);
+    folds.clear();
+    if (!MayFold(level))
+        return;
+    // A file has further blanks and ends of lines, and nothing else, in addition to the plain text.
+    std::size_t at = 0;
+    for (char const c : TakeFile(level, write))
+        if (at < plain.size() && c == plain[at])
+            ++at;
+        else if (c == '\n')
+            folds.push_back(at);
+    assert(at == plain.size());
+}
+
+/// A short cut: most statements are shorter than any line that folds.
+bool WrittenText::MayFold(int level) const {
+    constexpr std::size_t MAX_COLUMNS = 80;
+    constexpr std::size_t LEVEL_COLUMNS = 3;
+    std::size_t const indentation = LEVEL_COLUMNS * static_cast<std::size_t>(level);
+    for (std::size_t begin = 0; begin < plain.size();) {
+        std::size_t const end = std::min(plain.find('\n', begin), plain.size());
+        if (indentation + (end - begin) > MAX_COLUMNS)
+            return true;
+        begin = end + 1;
+    }
+    return false;
+}
+
+std::string WrittenText::TakeFile(int level, Write const &write) {
+    if (!file.IsOpen()) {
+        file = Descriptor(::memfd_create("vesk-hdl", MFD_CLOEXEC));
+        if (!file.IsOpen() || !stream.Adopt(::dup(file.Get())))
+            throw std::system_error(errno, std::generic_category());
+    }
+    for (int i = 0; i < level; ++i)
+        stream.Indent();
+    write(stream);
+    for (int i = 0; i < level; ++i)
+        stream.Unindent();
+    stream << OutStream::FLUSH;
+    std::string text(static_cast<std::size_t>(::lseek(file.Get(), 0, SEEK_END)), '\0');
+    bool const isWhole =
+        stream.GetError() == 0 &&
+        ::pread(file.Get(), text.data(), text.size(), 0) == static_cast<ssize_t>(text.size()) &&
+        ::ftruncate(file.Get(), 0) == 0 && ::lseek(file.Get(), 0, SEEK_SET) == 0;
+    if (!isWhole)
+        throw std::system_error(stream.GetError() != 0 ? stream.GetError() : errno,
+                                std::generic_category());
+    return text;
+}
+
+bool WrittenText::IsFoldedWithin(std::size_t begin, std::size_t end) const {
+    return std::any_of(folds.begin(), folds.end(),
+                       [begin, end](std::size_t fold) { return begin < fold && fold <= end; });
+}
+
+} // namespace Checks

@@ -1,0 +1,141 @@
+#include <cassert>
+
+#include "vesk_hdl/netlist/As.h"
+#include "vesk_hdl/netlist/passes/DummySteps.h"
+#include "vesk_hdl/text/ForEachAhead.h"
+
+namespace Vesk_Hdl {
+
+using Basis::StringBase;
+
+namespace {
+
+/// The positions of scalar signals in compounds, by name in any case. It takes the place of a walk
+/// over all compounds of the netlist for each scalar that gets a dummy.
+class ScalarMembers {
+public:
+    explicit ScalarMembers(PtrArray<Signal *> const &signals) {
+        ForEachAhead(signals, [this](Signal *signal) {
+            auto *const compound = As<CompoundBus>(signal);
+            for (int i = 0; compound && i < compound->GetSize(); ++i)
+                if (As<ScalarSignal>(compound->GetAt(i)))
+                    places[compound->GetAt(i)->GetNameRef().GetText()].push_back({compound, i});
+        });
+    }
+
+    /// Puts `dummy` into every place of a scalar of that name.
+    void Replace(StringBase<char> const &name, Signal *dummy) {
+        auto const found = places.find(name.View());
+        if (found == places.end())
+            return;
+        std::vector<Place> const replaced = std::move(found->second);
+        places.erase(found);
+        // The places now bear the dummy's name, by which a later step may find them again.
+        std::vector<Place> &now = places[dummy->GetNameRef().GetText()];
+        for (Place const &place : replaced) {
+            place.compound->SetAt(place.position, dummy);
+            now.push_back(place);
+        }
+    }
+
+private:
+    struct Place {
+        CompoundBus *compound;
+        int position;
+    };
+
+    FoldedTextMap<std::vector<Place>> places;
+};
+
+/// The dummy of a slice or index of a bus, on the bus's own dummy; null for any other class.
+Signal *MakePartDummy(Signal const *part, Bus *parent) {
+    if (auto const *const slice = As<BusSlice>(part))
+        return slice->CreateDummySignal(parent);
+    if (auto const *const index = As<BusIndex>(part))
+        return index->CreateDummySignal(parent);
+    return nullptr;
+}
+
+class DummyMaker {
+public:
+    DummyMaker(Netlist &changed, bool portIsAssigned)
+        : netlist(changed), portTakesDummy(portIsAssigned), scalarMembers(changed.GetSignals()) {}
+
+    void Run(std::vector<DummySteps::Step> const &steps) {
+        made.reserve(steps.size());
+        for (DummySteps::Step const &step : steps)
+            made.push_back(Make(step));
+    }
+
+private:
+    Signal *Make(DummySteps::Step const &step) {
+        Signal *const net = step.former == DummySteps::NONE
+                                ? step.net
+                                : made[static_cast<std::size_t>(step.former)];
+        if (auto *const scalar = As<ScalarSignal>(net)) {
+            assert(netlist.GetSignal(step.name) == net && "the plan foresees what a name means");
+            return MakeOfScalar(*scalar, step.name);
+        }
+        if (auto *const bus = As<Bus>(net)) {
+            assert(netlist.GetParentBus(step.name) == net && "the plan foresees what a name means");
+            return MakeOfBus(*bus);
+        }
+        assert(netlist.GetSignal(step.name) == net && As<CompoundBus>(net));
+        return MakeOfCompound(static_cast<CompoundBus &>(*net));
+    }
+
+    Signal *MakeOfScalar(ScalarSignal &net, StringBase<char> const &name) {
+        ScalarSignal *const dummy = net.CreateDummySignal();
+        Add(dummy, net);
+        Link(net, *dummy);
+        scalarMembers.Replace(name, dummy);
+        return dummy;
+    }
+
+    /// The parts get no assignment of their own: that of the whole bus carries them.
+    Signal *MakeOfBus(Bus &net) {
+        Bus *const dummy = net.CreateDummySignal();
+        Add(dummy, net);
+        Link(net, *dummy);
+        ForEach(net.GetBusSliceIterator(), [&](Signal *part) {
+            if (Signal *const partDummy = MakePartDummy(part, dummy))
+                Add(partDummy, *part);
+        });
+        return dummy;
+    }
+
+    Signal *MakeOfCompound(CompoundBus &net) {
+        CompoundBus *const dummy = net.CreateDummySignal();
+        Add(dummy, net);
+        ForEach(net.GetBusMemberIterator(), [this, dummy](Signal const *member) {
+            if (Signal *const memberDummy = netlist.GetSignal(member->GetDummySignalName()))
+                dummy->AddBusMember(memberDummy);
+        });
+        return dummy;
+    }
+
+    void Add(Signal *dummy, Signal &net) {
+        netlist.Add(dummy);
+        dummy->CloneConnection(&net);
+    }
+
+    void Link(Signal &net, Signal &dummy) {
+        if (portTakesDummy)
+            net.Connect(&dummy);
+        else
+            dummy.Connect(&net);
+    }
+
+    Netlist &netlist;
+    bool portTakesDummy;
+    ScalarMembers scalarMembers;
+    std::vector<Signal *> made; ///< the dummy of each step so far
+};
+
+} // namespace
+
+void ApplyDummySteps(Netlist &netlist, DummySteps const &plan, bool portTakesDummy) {
+    DummyMaker(netlist, portTakesDummy).Run(plan.Get());
+}
+
+} // namespace Vesk_Hdl

@@ -9,12 +9,11 @@ namespace Vesk_Hdl {
 
 using Basis::StringBase;
 
-Bus::Bus(char const *name) : Signal(name), record(std::make_unique<Record>()) {}
+Bus::Bus(char const *name) : Signal(name), record(new Record(this)) {}
 
 Bus::~Bus() {
-    if (record->cell)
-        record->cell->bus = nullptr; // parts that live on have no parent then
-    ParentCell::Leave(record->cell);
+    record->bus = nullptr; // parts that live on have no parent then
+    Record::Leave(record);
 }
 
 Signal::SignalType Bus::GetSignalType() const { return SIGNAL_BUS; }
@@ -33,13 +32,6 @@ bool Bus::IsNeededToDeclared() const { return true; }
 StringBase<char> Bus::GetDummySignalName() const {
     StringBase<char> base = GetBaseName();
     return Names::EndsInDummyTag(base.View()) ? base : GetDummyBusName(*this);
-}
-
-/// The cell, with one owner more: a part that is about to be made.
-ParentCell *Bus::ShareCell() {
-    if (!record->cell)
-        record->cell = new ParentCell(this);
-    return ParentCell::Join(record->cell);
 }
 
 void Bus::AddBusSlice(Signal *slice) { record->busSlices.Add(slice); }

@@ -1,4 +1,4 @@
-// The classes for parts of a bus: slices and indices. Both find their bus through a cell that they
+// The classes for parts of a bus: slices and indices. Both find their bus through a record that they
 // share with it, see BusRecord.h.
 
 #include <utility>
@@ -12,7 +12,7 @@ namespace Vesk_Hdl {
 using Basis::StringBase;
 
 BusSlice::BusSlice(char const *name, Bus *parent)
-    : Signal(name), cell(parent ? parent->ShareCell() : nullptr) {
+    : Signal(name), parentRecord(parent ? Bus::Record::Join(parent->record) : nullptr) {
     if (parent)
         parent->AddBusSlice(this);
 }
@@ -20,11 +20,11 @@ BusSlice::BusSlice(char const *name, Bus *parent)
 /// For a slice that takes the address of a widened bus. The list of slices already has that
 /// address.
 BusSlice::BusSlice(BusSlice &&made) noexcept
-    : Signal(std::move(made)), cell(std::exchange(made.cell, nullptr)) {}
+    : Signal(std::move(made)), parentRecord(std::exchange(made.parentRecord, nullptr)) {}
 
-BusSlice::~BusSlice() { ParentCell::Leave(cell); }
+BusSlice::~BusSlice() { Bus::Record::Leave(parentRecord); }
 
-Bus *BusSlice::GetParent() const { return cell ? cell->bus : nullptr; }
+Bus *BusSlice::GetParent() const { return parentRecord ? parentRecord->bus : nullptr; }
 
 Signal::SignalType BusSlice::GetSignalType() const { return SIGNAL_BUS_SLICE; }
 
@@ -65,15 +65,16 @@ BusSlice *BusSlice::CreateDummySignal(Bus *parent) const {
 }
 
 BusIndex::BusIndex(char const *name, Bus *parent)
-    : Signal(name), cell(parent ? parent->ShareCell() : new ParentCell(nullptr)) {
-    // Without a parent the cell holds the polarity of the index itself.
+    : Signal(name),
+      parentRecord(parent ? Bus::Record::Join(parent->record) : new Bus::Record(nullptr)) {
+    // Without a parent the record holds the polarity of the index itself.
     if (parent)
         parent->AddBusSlice(this);
 }
 
-BusIndex::~BusIndex() { ParentCell::Leave(cell); }
+BusIndex::~BusIndex() { Bus::Record::Leave(parentRecord); }
 
-Bus *BusIndex::GetParent() const { return cell->bus; }
+Bus *BusIndex::GetParent() const { return parentRecord->bus; }
 
 Signal::SignalType BusIndex::GetSignalType() const { return SIGNAL_BUS_INDEX; }
 
@@ -81,7 +82,7 @@ void BusIndex::SetPortPolarity(Polarity const &polarity) {
     if (Bus *const parent = GetParent())
         parent->SetPortPolarity(polarity);
     else
-        cell->ownPolarity = polarity;
+        parentRecord->portPolarity = polarity;
 }
 
 void BusIndex::AcceptSignal(SignalVisitor &visitor) {
@@ -91,7 +92,7 @@ void BusIndex::AcceptSignal(SignalVisitor &visitor) {
 
 Polarity BusIndex::GetPortPolarity() const {
     Bus const *const parent = GetParent();
-    return parent ? parent->GetPortPolarity() : cell->ownPolarity;
+    return parent ? parent->GetPortPolarity() : parentRecord->portPolarity;
 }
 
 int BusIndex::GetWidth() const { return 1; }

@@ -4,6 +4,7 @@
 
 #include "vesk_hdl/netlist/CompoundWalk.h"
 #include "vesk_hdl/netlist/Names.h"
+#include "vesk_hdl/text/LentPtrArray.h"
 #include "vesk_hdl/text/basis/Tokens.h"
 
 namespace Vesk_Hdl {
@@ -84,8 +85,9 @@ int CompoundWidths::Get(CompoundBus const &compound) {
     }
 }
 
+/// Four members have room in the record, as many as most compounds have.
 struct CompoundBus::Record {
-    PtrArray<Signal *> members;
+    InlinePtrArray<Signal *, 4> members; ///< not owned
 };
 
 CompoundBus::CompoundBus(char const *name) : Signal(name), record(std::make_unique<Record>()) {}

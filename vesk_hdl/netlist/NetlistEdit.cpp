@@ -39,8 +39,7 @@ Bus *NetlistEdit::Widen(Bus *bus, char const *name) {
     // of the new bus.
     std::unique_ptr<Bus> wide = std::make_unique<Bus>(name);
     std::unique_ptr<BusSlice> made(new BusSlice(bus->GetNameRef(), nullptr));
-    ParentCell *const cell = bus->ShareCell();
-    made->cell = cell;
+    made->parentRecord = Bus::Record::Join(bus->record);
     bus->record->busSlices.Prepend(bus);
     Bus *const result = wide.get();
     try {
@@ -58,9 +57,9 @@ Bus *NetlistEdit::Widen(Bus *bus, char const *name) {
     record.busMap.Forget(bus);
     record.signals.Remove(bus);
     record.signalMap.Remove(bus->GetNameRef(), bus);
-    result->record->busSlices.ExchangeElements(bus->record->busSlices);
-    result->record->cell = std::exchange(bus->record->cell, nullptr);
-    cell->bus = result; // all parts, old and new, now find the new bus
+    std::swap(result->record, bus->record);
+    std::swap(result->record->portPolarity, bus->record->portPolarity);
+    result->record->bus = result; // all parts, old and new, now find the new bus
 
     bool const isPlain = typeid(*bus) == typeid(Bus); // a class that a client derived may be larger
     BusSlice *const slice =
@@ -112,7 +111,7 @@ BusSlice *NetlistEdit::RepointToSlice(Bus *bus, std::unique_ptr<BusSlice> made) 
                     compound->SetAt(i, slice);
     };
     replace(record.widenedSlices);
-    replace(slice->cell->bus->record->busSlices);
+    replace(slice->parentRecord->busSlices);
     ForEachAhead(record.signals.Get(), replaceIn);
     ForEach(record.widenedSlices, replaceIn);
     ForEachAhead(record.instances.Get(), [bus, slice](Instance const *instance) {

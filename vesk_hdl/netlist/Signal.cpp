@@ -11,7 +11,10 @@ namespace Vesk_Hdl {
 using Basis::StringBase;
 
 Signal::Signal() : record(nullptr) { SetObjectType(OBJECT_SIGNAL); }
-Signal::Signal(char const *name) : Signal() { SetNormalizedName(name); }
+Signal::Signal(char const *name) : record(nullptr) {
+    SetNormalizedName(name); // first: a kind without a name would have to be moved to it
+    SetObjectType(OBJECT_SIGNAL);
+}
 
 Signal::~Signal() { delete Find(); }
 

@@ -9,8 +9,6 @@
 
 namespace Vesk_Hdl {
 
-struct ParentCell;
-
 /// A net of the netlist, and a port of its module if it has a port polarity.
 ///
 /// A signal lists its pins and, one way, the signals that it is assigned from. It owns neither. Its
@@ -225,9 +223,7 @@ private:
     friend class NetlistEdit;
     struct Record;
 
-    ParentCell *ShareCell();
-
-    std::unique_ptr<Record> record;
+    Record *record; ///< shared with the parts of the bus
 };
 
 /// A part of a declared bus, D(3:0) of D(7:0). It is a name for bits of its parent: it is never
@@ -273,7 +269,7 @@ private:
     BusSlice(BusSlice &&made) noexcept;
     Bus *GetParent() const;
 
-    ParentCell *cell; ///< shared with the bus and its other parts; null without a parent
+    Bus::Record *parentRecord; ///< of the bus, shared with it; null without a bus
 };
 
 /// One bit of a declared bus, D(3) of D(7:0). Like a slice it is a name for a bit of its parent and
@@ -317,7 +313,7 @@ public:
 private:
     Bus *GetParent() const;
 
-    ParentCell *cell; ///< shared with the bus and its other parts; its own without a parent
+    Bus::Record *parentRecord; ///< of the bus, shared with it; its own without a bus
 };
 
 /// A bundle of signals in the order of its name, A,D(3:0),E(2). In a port map VHDL gets one

@@ -1,5 +1,5 @@
 // The designs that the benchmarks read and write. Each kind grows in one thing and keeps the rest
-// small, so that a curve that bends says what bends it.
+// small: if its curve bends, the cause is that thing.
 
 #include "bench/kinds.h"
 
@@ -40,8 +40,8 @@ void WriteNet(std::ostream &lines, long n) {
     }
 }
 
-/// Registers of 32 bits in a row. Behind each, a gate takes a bit of its bus and another instance
-/// a slice. There is no clock: one net for all is another kind.
+/// Registers of 32 bits in a row. After each, a gate takes a bit of its bus and another instance a
+/// slice. There is no clock: one net for all is another kind.
 void WriteBus(std::ostream &lines, long n) {
     lines << "ADD COMPONENT REG\n"
              "ADD PIN REG D(31:0) in\n"
@@ -154,8 +154,8 @@ void WriteAttributes(std::ostream &lines, long n) {
     }
 }
 
-/// A thousand components with attributes that the text declares, assigns and hands on, all of them
-/// in the configuration.
+/// A thousand components with attributes that are declared, assigned and passed on as generics, all
+/// of them in the configuration.
 void WriteConfiguration(std::ostream &lines, long n) {
     WriteComponents(lines, n);
     for (long i = 0; i < 1000; ++i) {

@@ -1,5 +1,5 @@
-// The memory of a replay without sanitizers: what is freed is overwritten and not handed out again
-// soon, so that an operation that looks into a removed object finds nothing that seems to live.
+// Replaces free() in a replay without sanitizers: freed memory is overwritten and reused late, so
+// that an operation that reads a removed object does not find its former content.
 
 #include <cstdlib>
 #include <cstring>

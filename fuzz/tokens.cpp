@@ -1,4 +1,4 @@
-// The tokenizer of command lines: without quotes against a plain split; with quotes, tokens written
+// The tokenizer of command lines. Without quotes it gives what a plain split gives; tokens written
 // down with quotes again read as the same tokens, and each has the place that the parser reports.
 
 #include <algorithm>

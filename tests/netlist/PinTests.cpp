@@ -28,7 +28,7 @@ TEST(Component, TheNameAsTypedDecidesTheClassOfAPin) {
     }
 }
 
-/// Few pins are walked through, many are looked up, and both ways find the same.
+/// A walk over few pins and the index of many find the same pin.
 TEST(Component, PinsKeepOrderAndTheFirstOfTwoIsFound) {
     for (int const more : {0, 40}) {
         Component component("C");
@@ -50,7 +50,8 @@ TEST(Component, PinsKeepOrderAndTheFirstOfTwoIsFound) {
     Component renamed("C");
     for (int i = 0; i < 40; ++i)
         renamed.AddPin(("p" + std::to_string(i)).c_str(), Polarity::OUTPUT, "");
-    renamed.GetPin("p1")->SetName("Z"); // last, for from then on nobody trusts an index
+    renamed.GetPin("p1")->SetName(
+        "Z"); // last, as from then on the index of this component is not used
     EXPECT_TRUE(renamed.GetPin("Z") && !renamed.GetPin("p1"));
 }
 
@@ -219,7 +220,8 @@ TEST(Instance, PinsThatReadOrDriveAPortAndOpenOnes) {
         EXPECT_EQ("in in out bi", NamesOf(open)); // gathered, never emptied
         for (char const *const name : {"in", "out", "bi"})
             signal.Connect(instance.GetPin(name));
-        EXPECT_TRUE(instance.GetOpenPin(open, true)); // of earlier calls
+        EXPECT_TRUE(
+            instance.GetOpenPin(open, true)); // the list still holds the pins of earlier calls
         open.Empty();
         EXPECT_FALSE(instance.GetOpenPin(open, false));
     }

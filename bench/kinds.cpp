@@ -120,6 +120,12 @@ void WriteCompound(std::ostream &lines, long n) {
     }
 }
 
+/// Connects an instance between its own net and that of the instance before it.
+void ConnectInRow(std::ostream &lines, long i) {
+    lines << "CONNECT SIGNAL n" << i - 1 << " u" << i << ".I\n";
+    lines << "CONNECT SIGNAL n" << i << " u" << i << ".O\n";
+}
+
 /// A thousand components that take turns.
 void WriteComponents(std::ostream &lines, long n) {
     constexpr long COMPONENTS = 1000;
@@ -131,8 +137,7 @@ void WriteComponents(std::ostream &lines, long n) {
     }
     for (long i = 1; i <= n; ++i) {
         lines << "ADD INSTANCE C" << i % COMPONENTS << " u" << i << '\n';
-        lines << "CONNECT SIGNAL n" << i - 1 << " u" << i << ".I\n";
-        lines << "CONNECT SIGNAL n" << i << " u" << i << ".O\n";
+        ConnectInRow(lines, i);
     }
 }
 
@@ -149,8 +154,7 @@ void WriteAttributes(std::ostream &lines, long n) {
         lines << "ADD INSTANCE ATTRIBUTE u" << i << " LOC X" << i << "Y1\n";
         lines << "ADD INSTANCE PIN ATTRIBUTE u" << i << ".I DELAY " << i % 7 << " Integer\n";
         lines << "ADD INSTANCE PIN ATTRIBUTE u" << i << ".O DELAY " << i % 5 << " Integer\n";
-        lines << "CONNECT SIGNAL n" << i - 1 << " u" << i << ".I\n";
-        lines << "CONNECT SIGNAL n" << i << " u" << i << ".O\n";
+        ConnectInRow(lines, i);
     }
 }
 

@@ -22,17 +22,6 @@ bool Matches(std::string const &text, std::regex const &form) {
     return std::regex_match(text, form);
 }
 
-std::vector<std::string> Members(std::string const &name) {
-    std::vector<std::string> members(1);
-    for (char const c : name)
-        if (c == ',' || c == '\\')
-            members.emplace_back();
-        else
-            members.back() += c;
-    std::erase(members, "");
-    return members;
-}
-
 std::string Normal(std::string name) {
     for (char &c : name)
         c = std::string_view("[{<").find(c) != std::string_view::npos   ? '('
@@ -83,7 +72,7 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
         if (Matches(text, INDEX))
             FUZZ_EXPECT(BusIndex::IsBusIndexName(name), "an index");
 
-        std::vector<std::string> const members = Members(text);
+        std::vector<std::string> const members = Split(text, ",\\");
         bool compound = members.size() > 1;
         for (std::string const &member : members)
             compound &= Matches(member, BASE) || Bus::IsBusName(Text(member.c_str())) ||

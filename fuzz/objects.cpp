@@ -467,26 +467,18 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
     MakeNetlist(first);
     for (int calls = 0; calls < MOST_CALLS && !choices.IsEmpty(); ++calls)
         Run(world, OPERATIONS[choices.Below(std::size(OPERATIONS))]);
-    for (unsigned int kind = choices.Below(6), left = 6; left > 0; ++kind, --left)
-        switch (kind % 6) {
-        case 0:
-            world.RemoveOwn(world.signals);
-            break;
-        case 1:
-            world.RemoveOwn(world.pins);
-            break;
-        case 2:
-            world.RemoveOwn(world.components);
-            break;
-        case 3:
-            world.RemoveOwn(world.instances);
-            break;
-        case 4:
-            world.RemoveOwn(world.attributes);
-            break;
-        default:
-            for (Netlist *const netlist : world.netlists.Living())
-                world.Remove(netlist);
-        }
+    // The kinds of objects end in their order, from any of them on.
+    constexpr void (*REMOVALS[])(World &) = {[](World &w) { w.RemoveOwn(w.signals); },
+                                             [](World &w) { w.RemoveOwn(w.pins); },
+                                             [](World &w) { w.RemoveOwn(w.components); },
+                                             [](World &w) { w.RemoveOwn(w.instances); },
+                                             [](World &w) { w.RemoveOwn(w.attributes); },
+                                             [](World &w) {
+                                                 for (Netlist *const netlist : w.netlists.Living())
+                                                     w.Remove(netlist);
+                                             }};
+    constexpr unsigned int KINDS = std::size(REMOVALS);
+    for (unsigned int kind = choices.Below(KINDS), left = KINDS; left > 0; ++kind, --left)
+        REMOVALS[kind % KINDS](world);
     return 0;
 }

@@ -11,17 +11,6 @@ using Vesk_Hdl::StringArray;
 
 namespace {
 
-std::vector<std::string> PlainSplit(std::string const &text) {
-    std::vector<std::string> tokens(1);
-    for (char const c : text)
-        if (c == ' ')
-            tokens.emplace_back();
-        else
-            tokens.back() += c;
-    std::erase(tokens, "");
-    return tokens;
-}
-
 /// A token in quotes; empty if there is no way to write it so.
 std::string InQuotes(std::string_view token) {
     if (!token.empty() && token.back() == '\\')
@@ -53,7 +42,7 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
     std::string const text = TextOf(data, size);
 
     StringArray const plain(text.c_str(), " ", true, nullptr);
-    std::vector<std::string> const split = PlainSplit(text);
+    std::vector<std::string> const split = Split(text, " ");
     FUZZ_EXPECT(static_cast<std::size_t>(plain.GetSize()) == split.size(), "%zu", split.size());
     for (int i = 0; i < plain.GetSize(); ++i)
         FUZZ_EXPECT(plain.At(i).View() == split[static_cast<std::size_t>(i)], "token %d", i);

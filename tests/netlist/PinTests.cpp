@@ -70,9 +70,13 @@ std::string SortedPins(bool aPinHasChanged) {
     std::string names;
     for (int i = 0; i < 200; ++i) {
         Component component("C");
-        for (unsigned int pins = random() % 8; pins > 0; --pins)
-            component.AddPin(RandomText(random, "aAb12", 3).c_str(),
+        // Names at random, some of them equal, or pairs that differ in case alone. With many pins a
+        // second sort may exchange equal ones.
+        for (unsigned long pin = random() % 40; pin > 0; --pin) {
+            std::string const pair = (pin % 2 ? "p" : "P") + std::to_string(pin / 2 * 7 % 20);
+            component.AddPin((i % 2 ? pair : RandomText(random, "aAb12", 3)).c_str(),
                              static_cast<Polarity::Value>(random() % 3), "");
+        }
         Instance first("u", &component);
         component.AddPin("late", Polarity::INPUT, "");
         if (aPinHasChanged)

@@ -9,11 +9,11 @@
 extern "C" void __libc_free(void *block); // glibc's own
 
 extern "C" void free(void *block) {
-    constexpr std::size_t MOST_BLOCKS = 1 << 16;
-    static void *kept[MOST_BLOCKS];
+    constexpr std::size_t MAX_BLOCKS = 1 << 16;
+    static void *kept[MAX_BLOCKS];
     static std::size_t next = 0;
     if (!block)
         return;
     std::memset(block, 0xDD, ::malloc_usable_size(block));
-    __libc_free(std::exchange(kept[next++ % MOST_BLOCKS], block));
+    __libc_free(std::exchange(kept[next++ % MAX_BLOCKS], block));
 }

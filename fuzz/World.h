@@ -75,18 +75,18 @@ struct World {
         std::set<Signal *> inside;
         for (Signal *const signal : seen)
             CountSteps(signal, inside, steps);
-        return steps < MOST_STEPS;
+        return steps < MAX_STEPS;
     }
     /// Counts the visits of a walk that enters a compound as often as it is listed.
     static void CountSteps(Signal *signal, std::set<Signal *> &inside, unsigned int &steps) {
         auto const *const compound = dynamic_cast<CompoundBus *>(signal);
-        if (++steps >= MOST_STEPS || !compound || !inside.insert(signal).second)
+        if (++steps >= MAX_STEPS || !compound || !inside.insert(signal).second)
             return;
         ForEach(compound->GetBusMemberIterator(),
                 [&](Signal *member) { CountSteps(member, inside, steps); });
         inside.erase(signal);
     }
-    static constexpr unsigned int MOST_STEPS = 3000;
+    static constexpr unsigned int MAX_STEPS = 3000;
 
     /// CanWalk from all signals and pins of a netlist.
     bool CanWalk(Netlist const *netlist, unsigned int follow) const {

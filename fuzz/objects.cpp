@@ -459,13 +459,13 @@ void Run(World &world, Operation const &operation) {
 } // namespace
 
 int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
-    constexpr int MOST_CALLS = 200;
+    constexpr int MAX_CALLS = 200;
     Choices choices(data, size);
     World world(choices);
     Call first(world);
     first.number = choices.Below(3);
     MakeNetlist(first);
-    for (int calls = 0; calls < MOST_CALLS && !choices.IsEmpty(); ++calls)
+    for (int calls = 0; calls < MAX_CALLS && !choices.IsEmpty(); ++calls)
         Run(world, OPERATIONS[choices.Below(std::size(OPERATIONS))]);
     // The kinds of objects end in their order, from any of them on.
     constexpr void (*REMOVALS[])(World &) = {[](World &w) { w.RemoveOwn(w.signals); },

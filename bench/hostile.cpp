@@ -18,7 +18,7 @@ namespace {
 namespace fs = std::filesystem;
 
 constexpr int STEPS = 4;      ///< n, 2n, 4n and 8n
-constexpr int MORE_STEPS = 2; ///< for kinds that are over before they can be measured
+constexpr int MORE_STEPS = 2; ///< for kinds that are too fast to be measured
 constexpr double ENOUGH_CPU = 0.15;
 /// What is less than this above the cost of an empty file is noise.
 constexpr double LEAST_CPU = 0.02;
@@ -178,8 +178,8 @@ private:
         }
     }
 
-    /// What seems to grow too fast is measured again before that is believed: other work on the
-    /// machine only ever adds.
+    /// What seems to grow too fast is measured again: other work on the machine can only make a run
+    /// slower.
     void Confirm(HostileKind const &kind, Curve &curve, std::string const &mode,
                  fs::path const &file) {
         constexpr int MORE = 3;

@@ -103,34 +103,30 @@ void AddKindsOf(Vesk_Hdl::CommandHelp const &command, std::vector<HostileKind> &
     std::vector<std::string> const words = LineOf(command);
     std::string const objects = ObjectsFor(command);
 
-    std::string one = Joined(words);
-    Replace(one, "{o}", "");
-    std::string oneObject = objects;
-    Replace(oneObject, "{o}", "");
+    auto const numbered = [](std::string text, char const *number) {
+        Replace(text, "{o}", number);
+        return text;
+    };
+    std::string const line = Joined(words);
     kinds.push_back({name + ".one",
                      what + " for one object",
-                     {Once(oneObject), Each(one)},
+                     {Once(numbered(objects, "")), Each(numbered(line, ""))},
                      writes ? 4000L : 64000L});
-
-    std::string many = Joined(words);
-    Replace(many, "{o}", "{i}");
-    std::string manyObjects = objects;
-    Replace(manyObjects, "{o}", "{i}");
     kinds.push_back({name + ".many",
                      what + " for n objects",
-                     {Each(manyObjects), Each(many)},
+                     {Each(numbered(objects, "{i}")), Each(numbered(line, "{i}"))},
                      writes ? 1000L : 16000L,
                      writes ? WRITTEN_OFTEN : nullptr});
 
-    std::string longest = oneObject;
+    std::string longest = objects;
     for (std::size_t at = 1; at < words.size(); ++at) {
         std::vector<std::string> longWords = words;
         longWords[at] = (longWords[at][0] == '-' ? longWords[at] : "L") + "{long}";
         longest += Joined(longWords);
     }
-    Replace(longest, "{o}", "");
     if (words.size() > 1)
-        kinds.push_back({name + ".long", what + " with a long word, times 16", {Once(longest)}});
+        kinds.push_back(
+            {name + ".long", what + " with a long word, times 16", {Once(numbered(longest, ""))}});
 }
 
 } // namespace

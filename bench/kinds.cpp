@@ -1,5 +1,5 @@
 // The designs that the benchmarks read and write. Each kind grows in one thing and keeps the rest
-// small, so that a curve that bends says what bends it.
+// small: if its curve bends, the cause is that thing.
 
 #include "bench/kinds.h"
 
@@ -40,8 +40,8 @@ void WriteNet(std::ostream &lines, long n) {
     }
 }
 
-/// Registers of 32 bits in a row. Behind each, a gate takes a bit of its bus and another instance
-/// a slice. There is no clock: one net for all is another kind.
+/// Registers of 32 bits in a row. After each, a gate takes a bit of its bus and another instance a
+/// slice. There is no clock: one net for all is another kind.
 void WriteBus(std::ostream &lines, long n) {
     lines << "ADD COMPONENT REG\n"
              "ADD PIN REG D(31:0) in\n"
@@ -120,6 +120,12 @@ void WriteCompound(std::ostream &lines, long n) {
     }
 }
 
+/// Connects an instance between its own net and that of the instance before it.
+void ConnectInRow(std::ostream &lines, long i) {
+    lines << "CONNECT SIGNAL n" << i - 1 << " u" << i << ".I\n";
+    lines << "CONNECT SIGNAL n" << i << " u" << i << ".O\n";
+}
+
 /// A thousand components that take turns.
 void WriteComponents(std::ostream &lines, long n) {
     constexpr long COMPONENTS = 1000;
@@ -131,8 +137,7 @@ void WriteComponents(std::ostream &lines, long n) {
     }
     for (long i = 1; i <= n; ++i) {
         lines << "ADD INSTANCE C" << i % COMPONENTS << " u" << i << '\n';
-        lines << "CONNECT SIGNAL n" << i - 1 << " u" << i << ".I\n";
-        lines << "CONNECT SIGNAL n" << i << " u" << i << ".O\n";
+        ConnectInRow(lines, i);
     }
 }
 
@@ -149,13 +154,12 @@ void WriteAttributes(std::ostream &lines, long n) {
         lines << "ADD INSTANCE ATTRIBUTE u" << i << " LOC X" << i << "Y1\n";
         lines << "ADD INSTANCE PIN ATTRIBUTE u" << i << ".I DELAY " << i % 7 << " Integer\n";
         lines << "ADD INSTANCE PIN ATTRIBUTE u" << i << ".O DELAY " << i % 5 << " Integer\n";
-        lines << "CONNECT SIGNAL n" << i - 1 << " u" << i << ".I\n";
-        lines << "CONNECT SIGNAL n" << i << " u" << i << ".O\n";
+        ConnectInRow(lines, i);
     }
 }
 
-/// A thousand components with attributes that the text declares, assigns and hands on, all of them
-/// in the configuration.
+/// A thousand components with attributes that are declared, assigned and passed on as generics, all
+/// of them in the configuration.
 void WriteConfiguration(std::ostream &lines, long n) {
     WriteComponents(lines, n);
     for (long i = 0; i < 1000; ++i) {

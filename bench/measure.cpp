@@ -25,7 +25,7 @@ void Limit(decltype(RLIMIT_CPU) resource, double most) {
         ::_exit(127);
 }
 
-/// In the child, which has nothing but to become the program.
+/// In the child process, before it becomes the program.
 [[noreturn]] void Become(char *const *arguments, char const *folder, bool quiet,
                          Limits const *limits) {
     if (limits) {
@@ -91,8 +91,8 @@ std::optional<Cost> TryProgram(std::vector<std::string> words, fs::path const &f
                                Limits const &limits) {
     std::string const name = words[0];
     Run const run = Start(std::move(words), folder, true, &limits);
-    // Out of memory, the tool ends with 1 as well; a buffer that grows fails at a third of the
-    // limit at the earliest.
+    // The tool also ends with 1 when it is out of memory. It may do so well below the limit: a
+    // buffer that doubles needs the old memory and the new.
     if (!WIFEXITED(run.status) || run.cost.peak > limits.memory / 4)
         return std::nullopt;
     if (WEXITSTATUS(run.status) > 1)

@@ -1,6 +1,6 @@
 // The least that could do the tool's work on a plain design: it reads the same commands and writes
-// about the same text, but checks nothing, sorts nothing and knows no bus from a scalar. What the
-// tool needs above it is the price of its rules.
+// about the same text, but checks nothing, sorts nothing and does not tell a bus from a scalar. The
+// difference to the tool is the cost of the tool's rules.
 
 #include <cstdio>
 #include <cstdlib>
@@ -146,5 +146,5 @@ int main(int argc, char **argv) {
         std::ofstream out(argv[isVhdl ? 2 : 3]);
         model.Write(out, isVhdl);
     }
-    std::_Exit(0); // all is written; nobody needs the memory back
+    std::_Exit(0); // all is written; freeing the memory would only take time
 }

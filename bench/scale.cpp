@@ -16,7 +16,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
-/// From this size on a point is measured once unless somebody asks for more.
+/// From this size on a point is measured once, unless --runs asks for more.
 constexpr long LARGE = 1000000;
 constexpr int RUNS = 3;
 /// Time that grows by more than this, against the growth of N, gets a mark.
@@ -26,13 +26,14 @@ struct Options {
     std::vector<long> sizes = {10000, 100000, LARGE};
     std::vector<std::string> kinds;
     std::string output = "vhdl";
-    int runs = 0; ///< 0 leaves it to the size
+    int runs = 0; ///< 0 if it depends on the size
     std::string tool;
     std::string otherTool;
     std::string lastFile;
 };
 
-/// The figures of the last run, in a file of the user's: they are those of one machine.
+/// The figures of the last run, in a file that is not part of the repository: they are valid on one
+/// machine only.
 class LastRun {
 public:
     struct Figures {
@@ -40,7 +41,7 @@ public:
         double bytes;
     };
 
-    /// No file, or none that this program wrote, is no last run.
+    /// Without the file, or with one that this program did not write, there was no last run.
     explicit LastRun(std::string fileName) : name(std::move(fileName)) {
         std::ifstream file(name);
         for (std::string line; std::getline(file, line);) {
@@ -59,7 +60,7 @@ public:
     }
     void Note(std::string const &point, Figures const &figures) { now[point] = figures; }
 
-    /// What was not measured now stays.
+    /// Figures that were not measured now are kept.
     void Save() {
         if (name.empty())
             return;
@@ -139,7 +140,8 @@ private:
         last.Note(point, figures);
     }
 
-    /// What a design costs each tool. The tools take turns, so that both meet the same weather.
+    /// What a design costs each tool. The tools take turns, so that other load on the machine
+    /// affects both.
     std::vector<Cost> Point(Kind const &kind, long size, int runs) const {
         fs::path const design = scratch.GetPath() / "design.cmd";
         {

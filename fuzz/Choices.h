@@ -6,7 +6,7 @@
 #include <string>
 #include <vector>
 
-/// The input as a row of choices; at its end all of them are 0.
+/// The bytes of an input as a sequence of choices. After its end every choice is 0.
 class Choices {
 public:
     Choices(std::uint8_t const *data, std::size_t size) : at(data), end(data + size) {}
@@ -18,7 +18,7 @@ public:
             text += "aAbBz1290_ ,()[:]-.*+?\"\\\n\t\xe9"[Below(27)];
         return text;
     }
-    /// A name that others choose, too.
+    /// A name, mostly out of a small set, so that several objects get the same one.
     std::string Name() {
         static char const *const NAMES[] = {"a",      "A1",     "D(3:0)", "D[2]",   "D(1:0)",
                                             "s",      "c<0:7>", "",       "open",   "u_1",
@@ -26,7 +26,7 @@ public:
         unsigned int const which = Below(20);
         return which < std::size(NAMES) ? NAMES[which] : Text();
     }
-    /// One of these, which the caller goes on owning, or null if there is none.
+    /// One of these objects, which are not owned; null if there is none.
     template <class T> T *Of(std::vector<T *> const &all) {
         return all.empty() ? nullptr : all[Below(static_cast<unsigned int>(all.size()))];
     }

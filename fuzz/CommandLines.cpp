@@ -20,10 +20,10 @@ std::vector<std::string> LinesOf(std::string const &text) {
 } // namespace
 
 std::vector<std::string> CommandLines(std::uint8_t const *data, std::size_t size) {
-    constexpr std::size_t MOST_LINES = 400;
+    constexpr std::size_t MAX_LINES = 400;
     std::vector<std::string> lines = LinesOf(RandomLines::Preface());
     for (std::string const &line : LinesOf(std::string(reinterpret_cast<char const *>(data), size)))
-        if (lines.size() < MOST_LINES)
+        if (lines.size() < MAX_LINES)
             lines.push_back(line.substr(0, line.find('\0')));
     return lines;
 }

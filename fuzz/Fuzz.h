@@ -6,6 +6,7 @@
 #include <cstdlib>
 #include <string>
 #include <string_view>
+#include <vector>
 
 // What the targets share. A target is one LLVMFuzzerTestOneInput: libFuzzer feeds it, and so does
 // the replay program with the stored inputs.
@@ -21,6 +22,18 @@ extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size
             std::abort();                                                                          \
         }                                                                                          \
     } while (false)
+
+/// The parts of a text between separators, without empty ones.
+inline std::vector<std::string> Split(std::string const &text, std::string_view separators) {
+    std::vector<std::string> parts(1);
+    for (char const c : text)
+        if (separators.find(c) != separators.npos)
+            parts.emplace_back();
+        else
+            parts.back() += c;
+    std::erase(parts, "");
+    return parts;
+}
 
 /// An input as text up to its first NUL byte.
 inline std::string TextOf(std::uint8_t const *data, std::size_t size) {

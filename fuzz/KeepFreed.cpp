@@ -1,5 +1,5 @@
-// The memory of a replay without sanitizers: what is freed is overwritten and not handed out again
-// soon, so that an operation that looks into a removed object finds nothing that seems to live.
+// Replaces free() in a replay without sanitizers: freed memory is overwritten and reused late, so
+// that an operation that reads a removed object does not find its former content.
 
 #include <cstdlib>
 #include <cstring>
@@ -9,11 +9,11 @@
 extern "C" void __libc_free(void *block); // glibc's own
 
 extern "C" void free(void *block) {
-    constexpr std::size_t MOST_BLOCKS = 1 << 16;
-    static void *kept[MOST_BLOCKS];
+    constexpr std::size_t MAX_BLOCKS = 1 << 16;
+    static void *kept[MAX_BLOCKS];
     static std::size_t next = 0;
     if (!block)
         return;
     std::memset(block, 0xDD, ::malloc_usable_size(block));
-    __libc_free(std::exchange(kept[next++ % MOST_BLOCKS], block));
+    __libc_free(std::exchange(kept[next++ % MAX_BLOCKS], block));
 }

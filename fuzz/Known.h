@@ -3,15 +3,15 @@
 #include <unordered_map>
 #include <vector>
 
-/// The objects of one class that a client has met, and whether they live. Addresses are compared
-/// and never followed.
+/// The objects of one class that a client knows, and whether they still exist. Pointers are
+/// compared and never dereferenced.
 template <class T> class Known {
 public:
     struct Entry {
         T *object;
-        void const *owner; ///< null: the client
+        void const *owner; ///< null if the client owns it
         bool lives = true;
-        bool isHidden = false; ///< of no array of its netlist: it took the place of a widened bus
+        bool isHidden = false; ///< not listed by its netlist: it replaced a bus that was widened
     };
 
     void Add(T *object, void const *owner, bool isHidden = false) {
@@ -48,5 +48,6 @@ public:
 
 private:
     std::vector<Entry> entries;
-    std::unordered_map<T const *, std::size_t> places; ///< the newest of an address
+    std::unordered_map<T const *, std::size_t>
+        places; ///< of an address that was used again, the newest
 };

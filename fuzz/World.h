@@ -21,7 +21,7 @@ inline std::vector<Signal *> SignalsOn(Instance const *instance) {
     return found;
 }
 
-/// All that the client holds, and what it knows of it.
+/// All objects that the client knows.
 struct World {
     explicit World(Choices &bytes) : choices(bytes) {}
 
@@ -35,7 +35,7 @@ struct World {
     Known<Pin> pins;
     Known<Component> components;
     Known<Instance> instances;
-    Known<Attribute> attributes; ///< those that no object holds
+    Known<Attribute> attributes; ///< those that belong to no object yet
 
     // Which calls are allowed.
 
@@ -53,7 +53,7 @@ struct World {
                 [&](Instance *instance) { live = live && ComponentLives(instance); });
         return live;
     }
-    /// Whether nothing is gone on all ways from these signals, and the ways are short.
+    /// Whether all that can be reached from these signals exists, within a bounded number of steps.
     bool CanWalk(std::vector<Signal *> left, unsigned int follow) const {
         std::set<Signal *> seen;
         while (!left.empty()) {
@@ -75,18 +75,18 @@ struct World {
         std::set<Signal *> inside;
         for (Signal *const signal : seen)
             CountSteps(signal, inside, steps);
-        return steps < MOST_STEPS;
+        return steps < MAX_STEPS;
     }
-    /// The visits of a walk that goes into a compound each time that it is listed.
+    /// Counts the visits of a walk that enters a compound as often as it is listed.
     static void CountSteps(Signal *signal, std::set<Signal *> &inside, unsigned int &steps) {
         auto const *const compound = dynamic_cast<CompoundBus *>(signal);
-        if (++steps >= MOST_STEPS || !compound || !inside.insert(signal).second)
+        if (++steps >= MAX_STEPS || !compound || !inside.insert(signal).second)
             return;
         ForEach(compound->GetBusMemberIterator(),
                 [&](Signal *member) { CountSteps(member, inside, steps); });
         inside.erase(signal);
     }
-    static constexpr unsigned int MOST_STEPS = 3000;
+    static constexpr unsigned int MAX_STEPS = 3000;
 
     /// CanWalk from all signals and pins of a netlist.
     bool CanWalk(Netlist const *netlist, unsigned int follow) const {
@@ -101,7 +101,7 @@ struct World {
     bool CanWrite(Netlist const *netlist) const {
         return ComponentsLive(netlist) && CanWalk(netlist, PINS | SLICES | LINKS);
     }
-    /// A bus that gives way to a wider one hands its pins on.
+    /// Widening touches the pins of each bus, which therefore must exist.
     bool CanWiden(Netlist const *netlist) const {
         bool can = true;
         ForEach(netlist->GetSignalIterator(), [&](Signal *signal) {
@@ -117,7 +117,7 @@ struct World {
             Meet(netlist);
         for (Netlist *const netlist : netlists.Living())
             Expect(netlist);
-        replaced.clear(); // what else points there is the client's
+        replaced.clear(); // other pointers to them are the client's own
         auto const meetPins = [this](auto const &holders) {
             for (auto *const holder : holders.Living())
                 ForEach(holder->GetPinIterator(), [&](Pin *pin) { pins.Add(pin, holder); });
@@ -167,7 +167,7 @@ struct World {
     }
     std::set<Signal const *> replaced; ///< in the last call
 
-    // Deaths. What points at the object keeps its pointer.
+    // The end of objects. Pointers to them stay as they are.
 
     template <class T> void Remove(Known<T> &known, T *object) {
         auto const owner = static_cast<Netlist const *>(known.Get(object).owner);

@@ -13,7 +13,7 @@ using namespace Vesk_Hdl;
 
 namespace {
 
-/// The texts that the design comes to.
+/// What the design writes in both languages.
 std::string TextsOf(Model &model) {
     Capture capture;
     model.SetWriteOpener(&capture);

@@ -1,4 +1,4 @@
-// The forms of names: all parsers against each other and against readings by regular expression.
+// The forms of names: all parsers are compared with each other and with regular expressions.
 
 #include <regex>
 #include <vector>
@@ -11,7 +11,7 @@ using Text = Basis::StringBase<char>;
 
 namespace {
 
-constexpr std::size_t LONGEST = 300; // std::regex recurses for each character
+constexpr std::size_t MAX_NAME = 300; // std::regex recurses for each character
 
 std::regex const BASE("[A-Za-z'_][A-Za-z0-9_]*");
 std::regex const INTEGER("[+-]?[0-9]+");
@@ -20,17 +20,6 @@ std::regex const INDEX("([A-Za-z'_][A-Za-z0-9_]*)\\(([+-]?[0-9]+)\\)");
 
 bool Matches(std::string const &text, std::regex const &form) {
     return std::regex_match(text, form);
-}
-
-std::vector<std::string> Members(std::string const &name) {
-    std::vector<std::string> members(1);
-    for (char const c : name)
-        if (c == ',' || c == '\\')
-            members.emplace_back();
-        else
-            members.back() += c;
-    std::erase(members, "");
-    return members;
 }
 
 std::string Normal(std::string name) {
@@ -52,8 +41,8 @@ void CheckBus(std::string const &text, Text const &name) {
     FUZZ_EXPECT(isBus == Bus::ParseBusName(name, base, leftBound, rightBound), "overloads");
     std::smatch parts;
     bool const matches = std::regex_match(text, parts, BUS);
-    // The first marks decide in one test, the walk over tokens in the other: they may differ, but
-    // never on a text of the plain form.
+    // IsBusName looks at the first bracket and colon, ParseBusName walks over tokens. They may
+    // differ on odd texts, but not on names of the plain form.
     if (matches) {
         FUZZ_EXPECT(Bus::IsBusName(name) && isBus, "a bus");
         FUZZ_EXPECT(base.View() == parts[1].str() && left.View() == parts[2].str() &&
@@ -70,7 +59,7 @@ void CheckBus(std::string const &text, Text const &name) {
 } // namespace
 
 int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
-    std::string const raw = TextOf(data, std::min(size, LONGEST));
+    std::string const raw = TextOf(data, std::min(size, MAX_NAME));
     Text normalized(raw.c_str());
     Object::NormalizeName(normalized);
     FUZZ_EXPECT(normalized.View() == Normal(raw), "rewriting");
@@ -83,7 +72,7 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
         if (Matches(text, INDEX))
             FUZZ_EXPECT(BusIndex::IsBusIndexName(name), "an index");
 
-        std::vector<std::string> const members = Members(text);
+        std::vector<std::string> const members = Split(text, ",\\");
         bool compound = members.size() > 1;
         for (std::string const &member : members)
             compound &= Matches(member, BASE) || Bus::IsBusName(Text(member.c_str())) ||

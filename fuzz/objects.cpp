@@ -1,7 +1,7 @@
-// Client calls in any order: objects are made, wired, copied, renamed, taken apart and written, and
-// their owners die in any order. Some calls leave pointers to objects that are gone. On the objects
-// that hold such pointers the client then makes only calls that work on an object's own data: its
-// name, lists that are compared and not followed, the pins of an instance.
+// Client calls in any order: objects are made, connected, copied, renamed, removed and written, and
+// their owners end in any order. Some calls leave pointers to objects that no longer exist. On
+// objects with such pointers only those calls are then made that use the object's own data: its
+// name, lists whose pointers are compared but not dereferenced, the pins of an instance.
 
 #include <random>
 
@@ -29,11 +29,11 @@ struct Call {
     Object *object = nullptr, *otherObject = nullptr;
     std::string name, text;
     unsigned int number = 0;
-    std::string picked; ///< for somebody who reads along
+    std::string picked; ///< what was chosen, to be printed with SHOW_CALLS
 
     Bus &AsBus() const { return *static_cast<Bus *>(signal); }
     CompoundBus &AsCompound() const { return *static_cast<CompoundBus *>(signal); }
-    Polarity::Value Direction() const { // sometimes one of many bits
+    Polarity::Value Direction() const { // sometimes a value outside of the enumeration
         int const value = static_cast<int>(number) - 1;
         return static_cast<Polarity::Value>(value > 4 ? value << 16 : value);
     }
@@ -102,7 +102,7 @@ constexpr Letter LETTERS[] = {
      }},
 };
 
-/// Every third object stays the client's.
+/// The netlist owns two thirds of the objects, the client the others.
 template <class T> void Give(Call &c, Known<T> &known, T *made) {
     bool const isOwn = c.world.choices.Below(3) == 2;
     if (!isOwn)
@@ -140,7 +140,7 @@ void MakeAttribute(Call &c) {
     c.world.attributes.Add(made, nullptr);
 }
 
-/// Of its own, of a model, or of a model of the engine.
+/// A netlist of the client, of a model of the client, or of a model of the engine.
 void MakeNetlist(Call &c) {
     World &world = c.world;
     if (world.netlists.Living().size() > 3)
@@ -187,7 +187,7 @@ void AssignAttribute(Call &c) {
     c.world.attributes.Add(to.CloneAttribute(), nullptr);
 }
 
-/// Takes over name and comment alone.
+/// Assignment through the base class copies name and comment only.
 void AssignObject(Call &c) {
     auto const *const pin = dynamic_cast<Pin *>(c.object);
     Polarity const polarity = pin ? pin->GetPolarity() : Polarity();
@@ -308,7 +308,7 @@ void RunLines(Call &c) {
     c.world.capture.Take();
 }
 
-/// First takes away what points at the signal, but for members of compounds.
+/// First clears all pointers to the signal, except those of compounds.
 void RemoveSignalNeatly(Call &c) {
     for (Signal *const other : c.world.signals.Living()) {
         other->Disconnect(c.signal);
@@ -350,7 +350,7 @@ struct Operation {
 };
 
 constexpr Operation OPERATIONS[] = {
-    // Objects come into being.
+    // Objects are made.
     {"make a signal", "nN#", MakeSignal},
     {"make an attribute", "NV#", MakeAttribute},
     {"make a netlist", "N#", MakeNetlist},
@@ -427,7 +427,7 @@ constexpr Operation OPERATIONS[] = {
      }},
     {"declare by name", "mN", [](Call &c) { c.model->AddSignal(c.name.c_str()); }},
     {"run lines", "m#", RunLines, CanRunLines},
-    // They go.
+    // They are removed.
     {"remove a signal", "s", [](Call &c) { c.world.Remove(c.world.signals, c.signal); }, PinsLive},
     {"remove a signal neatly", "s", RemoveSignalNeatly, PinsLive},
     {"remove a component", "c", [](Call &c) { c.world.Remove(c.world.components, c.component); }},
@@ -459,34 +459,26 @@ void Run(World &world, Operation const &operation) {
 } // namespace
 
 int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
-    constexpr int MOST_CALLS = 200;
+    constexpr int MAX_CALLS = 200;
     Choices choices(data, size);
     World world(choices);
     Call first(world);
     first.number = choices.Below(3);
     MakeNetlist(first);
-    for (int calls = 0; calls < MOST_CALLS && !choices.IsEmpty(); ++calls)
+    for (int calls = 0; calls < MAX_CALLS && !choices.IsEmpty(); ++calls)
         Run(world, OPERATIONS[choices.Below(std::size(OPERATIONS))]);
-    for (unsigned int kind = choices.Below(6), left = 6; left > 0; ++kind, --left)
-        switch (kind % 6) {
-        case 0:
-            world.RemoveOwn(world.signals);
-            break;
-        case 1:
-            world.RemoveOwn(world.pins);
-            break;
-        case 2:
-            world.RemoveOwn(world.components);
-            break;
-        case 3:
-            world.RemoveOwn(world.instances);
-            break;
-        case 4:
-            world.RemoveOwn(world.attributes);
-            break;
-        default:
-            for (Netlist *const netlist : world.netlists.Living())
-                world.Remove(netlist);
-        }
+    // The kinds of objects end in their order, from any of them on.
+    constexpr void (*REMOVALS[])(World &) = {[](World &w) { w.RemoveOwn(w.signals); },
+                                             [](World &w) { w.RemoveOwn(w.pins); },
+                                             [](World &w) { w.RemoveOwn(w.components); },
+                                             [](World &w) { w.RemoveOwn(w.instances); },
+                                             [](World &w) { w.RemoveOwn(w.attributes); },
+                                             [](World &w) {
+                                                 for (Netlist *const netlist : w.netlists.Living())
+                                                     w.Remove(netlist);
+                                             }};
+    constexpr unsigned int KINDS = std::size(REMOVALS);
+    for (unsigned int kind = choices.Below(KINDS), left = KINDS; left > 0; ++kind, --left)
+        REMOVALS[kind % KINDS](world);
     return 0;
 }

@@ -1,4 +1,4 @@
-// The tokenizer of command lines: without quotes against a plain split; with quotes, tokens written
+// The tokenizer of command lines. Without quotes it gives what a plain split gives; tokens written
 // down with quotes again read as the same tokens, and each has the place that the parser reports.
 
 #include <algorithm>
@@ -10,17 +10,6 @@
 using Vesk_Hdl::StringArray;
 
 namespace {
-
-std::vector<std::string> PlainSplit(std::string const &text) {
-    std::vector<std::string> tokens(1);
-    for (char const c : text)
-        if (c == ' ')
-            tokens.emplace_back();
-        else
-            tokens.back() += c;
-    std::erase(tokens, "");
-    return tokens;
-}
 
 /// A token in quotes; empty if there is no way to write it so.
 std::string InQuotes(std::string_view token) {
@@ -53,7 +42,7 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
     std::string const text = TextOf(data, size);
 
     StringArray const plain(text.c_str(), " ", true, nullptr);
-    std::vector<std::string> const split = PlainSplit(text);
+    std::vector<std::string> const split = Split(text, " ");
     FUZZ_EXPECT(static_cast<std::size_t>(plain.GetSize()) == split.size(), "%zu", split.size());
     for (int i = 0; i < plain.GetSize(); ++i)
         FUZZ_EXPECT(plain.At(i).View() == split[static_cast<std::size_t>(i)], "token %d", i);

@@ -35,7 +35,7 @@ struct Owned : Design {
     }
 };
 
-/// The whole language: keywords, each with arguments that are just enough.
+/// All keywords, each with the fewest arguments that it accepts.
 std::vector<std::pair<std::string, std::string>> Language() {
     std::string language =
         "NOOP=; SET NETLIST NAME=n; SET SOURCE FILE=f; ADD COMPONENT=C; ADD PIN=CELL p in;"
@@ -146,7 +146,7 @@ TEST(CommandLanguage, SetAttribute) {
 
 TEST(CommandLanguage, Comments) {
     std::vector<Owner> owners = Owners();
-    owners.push_back(owners[0]); // for ADD NOTES, which is another word for the module's
+    owners.push_back(owners[0]); // again for ADD NOTES, which does what ADD MODULE COMMENT does
     using Row = std::pair<char const *, char const *>;
     for (std::size_t i = 0; i < owners.size(); ++i)
         for (auto const &[words, comment] :

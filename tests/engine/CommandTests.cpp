@@ -45,7 +45,7 @@ TEST(CommandFactory, TheLongestKeywordWins) {
     factory.AddCommandCreator("late", RefusedCommand<1>::Make);
     EXPECT_EQ(1, CreatorOf(copy, "LATE"));
     EXPECT_EQ(nullptr, factory.CreateCommand(nullptr, "unknown"));
-    for (int i = 0; i < 40; ++i) // more than a place of the library's keywords has
+    for (int i = 0; i < 40; ++i) // more words than follow any word of the library's keywords
         factory.AddCommandCreator(("many k" + std::to_string(i)).c_str(), RefusedCommand<1>::Make);
     factory.AddCommandCreator("MANY K39", RefusedCommand<2>::Make);
     for (auto const &[line, creator] : {Row{"Many K0", 1}, Row{"many k38 x", 1}, Row{"MANY k39", 2},

@@ -69,8 +69,7 @@ TEST(Properties, AWriteIsTheSameFromTheSecondTimeOn) {
     }
 }
 
-/// What the order of lines may not decide: declarations of one kind among each other, and the
-/// connections of different pins.
+/// The order of declarations of one kind, and of connections of different pins, has no effect.
 TEST(Properties, TheOrderOfDeclarationsSaysNothing) {
     for (unsigned seed = 0; seed < SEEDS; ++seed) {
         std::mt19937 random(seed);

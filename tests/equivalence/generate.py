@@ -112,7 +112,7 @@ class Circuit:
                 count += 1
             rest = rest[count:]
             parts.append(signal.part(place, count))
-            # As a slice one bit counts as rising; only in a falling bus it fits all the same.
+            # A slice of one bit counts as ascending. In a descending bus that makes no difference.
             falls = len(bits) > 1 and signal.indices[:1] > signal.indices[-1:]
             if signal.indices and count == 1 and not (
                     self.chance(.2) and (falls or len(signal.bits) == 1)):
@@ -176,12 +176,12 @@ class Circuit:
         return text.translate(str.maketrans("():", ends))
 
     def mention(self, parts):
-        """Names that exist have any spelling. A new one is written as it is mentioned first, and
-        only round brackets make it a part of a bus."""
+        """A name that exists may be spelled in any case and with any brackets. A new name is stored
+        as it is first spelled, and only round brackets make it a part of a bus."""
         key = tuple(signal.name + part for signal, part in parts)
         if key in self.mentioned and not (len(parts) == 1 and parts[0][0].grows):
             return self.word(self.brackets(self.mentioned[key]))
-        # Preparation finds a compound that needs a dummy by its name only if that has a comma.
+        # The pass before a write finds a compound that needs a dummy only if its name has a comma.
         between = "," if parts[0][0].way == "output" else ",\\"
         text = "".join(name + self.rng.choice(between) for name in key)[:-1]
         return self.mentioned.setdefault(key, text)
@@ -237,7 +237,7 @@ def shifter(c, rng):
             ([0] * step + data[:-step], f"{value} >> {by}"),
             ([data[0]] * step + data[:-step], f"$signed({value}) >>> {by}"),
             (data[step:] + data[:step], f"{{2{{{value}}}}} << {by} % {width} >> {width}"))[which]
-        # A compound that begins with a port that is read has no constant: only rotation has taps.
+        # A compound that begins with a read port cannot hold constants, so only rotation reads stages.
         way = "output" if stage == stages - 1 or which == 3 and c.chance(.5) else None
         result = c.signal(width, way) if way or c.chance(.5) else c.nets(width)
         c.model.append(f"assign {cat(result)} = {meant};")
@@ -376,7 +376,7 @@ class RandomLogic:
         if self.c.chance(.05):
             return self.rng.choices((0, 1), k=count)
         for _ in range(4):
-            # Inputs keep the circuit alive; what is far from them hardly moves.
+            # Half of the inputs are ports: bits that are far from a port hardly change.
             found = self.run(self.inputs if self.c.chance(.5) else self.ready, fits, count)
             if len(found) == count:
                 break

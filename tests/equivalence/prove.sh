@@ -52,8 +52,8 @@ side() {
         check -assert; flatten; opt_clean; check -assert; rename $name $1; write_rtlil $1.il"
 }
 
-# Equivalence by nets of the same name: the registers of both sides, once equal, stay equal for ever
-# and so do the outputs. Simulation shows the rest: that they become equal out of reset, and which
+# Equivalence by nets of the same name: if the registers of both sides are equal once, they and the
+# outputs stay equal for ever. Simulation shows the rest: that they become equal out of reset, and which
 # side of an assign drives the other, as Yosys takes both for one net.
 prove() {
     yosys -QT -p "read_rtlil gold.il; read_rtlil gate.il; equiv_make gold gate equiv
@@ -72,7 +72,7 @@ simulate_verilog() {
 "$tool" run --output-dir . "$folder/$name.cmd" > log 2>&1 || die 'the tool fails'
 [[ ${3-} != --swap ]] || swap "${@:4}"
 
-# Every net is declared: no file may lean on implicit ones.
+# No file may use an implicit net.
 { echo '`default_nettype none'; cat "$name.v"; } > strict.v
 quiet iverilog iverilog -t null -g2001 -Wall -Wno-portbind -s "$name" "$here/cells.v" strict.v
 quiet verilator verilator --lint-only -Wall -Wno-DECLFILENAME -Wno-LITENDIAN \
@@ -88,7 +88,7 @@ verdict 'equivalence of the Verilog' "$answer"
 
 python3 "$here/bench.py" "$folder/$name.cmd"
 simulate_verilog expected.txt "$folder/${name}_ref.v"
-# A simulation that ends early, knows no value or leaves most of the outputs alone proves nothing.
+# A simulation that ends early, gives X or Z, or changes less than half of the outputs proves nothing.
 awk '/[^01]/ { exit bad = 1 }
     { for (k = 1; k <= length($0); ++k) seen[k, substr($0, k, 1)]; width = length($0) }
     END { for (k = 1; k <= width; ++k) moved += (k, 0) in seen && (k, 1) in seen

@@ -1,5 +1,5 @@
-// Memory that runs out at any single place of a design's life: the failure passes to the client,
-// nothing leaks (the address sanitizer looks), nothing dangles, and the engine goes on.
+// Each allocation of a design's life fails once: the client gets std::bad_alloc, nothing leaks (as
+// the address sanitizer finds), no pointer dangles, and the engine can still be used.
 
 #include <cerrno>
 #include <new>
@@ -33,7 +33,7 @@ Lines AllFamilies() {
     return lines;
 }
 
-/// Counts what each opening comes to.
+/// Counts files that are open, and writes that were canceled.
 struct Counting : Capture {
     int Open(char const *name, bool append) override {
         ++open;
@@ -47,8 +47,8 @@ struct Counting : Capture {
     int canceled = 0;
 };
 
-/// Runs the design; the allocation of that number fails, and those until the failure has passed to
-/// us. False if it was never reached.
+/// Runs the design. The allocation of that number fails; with allLaterFail so do all until the
+/// exception arrives here. False if there were fewer allocations.
 bool RunWithFailure(Lines const &lines, long number, int &canceledWrites) {
     allocationsLeft = number;
     bool failed = false;
@@ -75,12 +75,12 @@ bool RunWithFailure(Lines const &lines, long number, int &canceledWrites) {
             allocationsLeft = -1;
             EXPECT_EQ(capture.open, 0) << number << ": " << line;
             EXPECT_EQ(Inconsistency(*model->GetNetlist()), "") << number << ": " << line;
-            --i; // once more: what is there already is refused, everything else is done
+            --i; // run the line again: it is refused if the object was made, else it runs
         } catch (Exception const &refusal) {
             EXPECT_TRUE(failed) << line << ": " << refusal.getDescription();
         }
     }
-    bool const reached = allocationsLeft < 0; // a sort that gets no memory makes do without
+    bool const reached = allocationsLeft < 0; // a sort that gets no memory works without it
     allocationsLeft = -1;
     EXPECT_EQ(Inconsistency(*model->GetNetlist()), "") << number;
     delete model;

@@ -1,10 +1,11 @@
-// The operator new of the fault tests. A source of its own: the compiler may not look through it.
+// The operator new of the fault tests, in a source of its own so that the compiler cannot inline
+// it.
 
 #include <cstdlib>
 #include <new>
 
-long allocationsLeft = -1; ///< until the one that fails; negative: none does
-bool allLaterFail = false; ///< and not that one alone
+long allocationsLeft = -1; ///< allocations until the one that fails; negative if none is to fail
+bool allLaterFail = false; ///< whether those after it fail too
 
 void *operator new(std::size_t size) {
     if (allocationsLeft >= 0 && allocationsLeft-- == 0) {

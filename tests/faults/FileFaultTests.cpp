@@ -140,7 +140,7 @@ struct Rationing : WriteOpener {
     std::string asked;
 };
 
-/// A port map of 2^31 bits would take hours: it ends where the text fails to get anywhere.
+/// A port map of 2^31 bits would take hours. The write ends at the first text that is not written.
 TEST(Faults, AFailedBlockEndsTheGeneration) {
     struct Row {
         char const *name;
@@ -167,14 +167,13 @@ TEST(Faults, AFailedBlockEndsTheGeneration) {
         EXPECT_EQ(OpenDescriptors(), open);
         EXPECT_EQ(design.model.GetLastWrite().error, row.error);
         EXPECT_STREQ(design.model.GetLastWrite().reason, "enough");
-        // The rewriting is done and the netlist is whole.
+        // The netlist was rewritten before the first text, and is consistent.
         EXPECT_TRUE(design.netlist.GetSignal("q_DUMMY"));
         EXPECT_EQ(Inconsistency(design.netlist), "");
     }
 }
 
-/// Without a write command a stream drops what cannot be written, as before, unless its guard
-/// throws.
+/// A stream without a write command drops text that cannot be written, unless its guard throws.
 TEST(Faults, AStreamAsksItsGuard) {
     struct Guard : Basis::Stream::Guard {
         int Allow(std::size_t bytes) override { return (allowed += bytes) > 5 ? EDQUOT : 0; }

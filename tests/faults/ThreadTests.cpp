@@ -16,7 +16,7 @@ namespace {
 constexpr unsigned THREADS = 8;
 constexpr int LINES = 300;
 
-/// What a design of its own writes, with all that is refused on the way.
+/// What a design writes, with the messages of refused lines.
 std::string Outcome(unsigned seed) {
     std::mt19937 random(seed);
     RandomLines source(random);

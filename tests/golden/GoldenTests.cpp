@@ -1,5 +1,5 @@
-// Runs each design.cmd under golden/ and compares what it writes, byte for byte, with the files
-// that lie beside it. golden/README.md tells how to add a design and how to accept new output.
+// Runs each design.cmd under golden/ and compares what it writes, byte for byte, with the files in
+// the same folder. golden/README.md says how to add a design and how to accept new output.
 
 #include <algorithm>
 #include <cstdlib>
@@ -31,8 +31,8 @@ std::vector<std::string> Designs() {
     return names;
 }
 
-/// Masks the time of writing: it stands in the eighth line of a header, behind mark, drawing and
-/// label. What has not the form of a time stays there for the comparison to find.
+/// Masks the time of writing, which is in the eighth line of a header, after comment mark, logo and
+/// label. Text that has not the form of a time is left, so that the comparison fails.
 std::string WithoutTime(std::string const &text) {
     static std::regex const TIME(R"(((--|//)\2{39}\n(?:.*\n){6}\2.{16}Timestamp : ))"
                                  R"(\d\d/\d\d/\d{4} \d\d:\d\d:\d\d\n)");

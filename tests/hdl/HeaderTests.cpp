@@ -1,4 +1,4 @@
-// What the header of golden/header-fields does not show, and the small texts.
+// Headers that golden/header-fields does not cover, and small functions on texts.
 
 #include <string>
 
@@ -28,7 +28,7 @@ TEST(NetlistHeader, WrapsTextsThatHoldLineEnds) {
              {"a\n\nb\nc d", "//    a\n//    b \n//    c d \n"},
              {"a b\n", "//    a b\n//    \n"},
              {"\n", "//    \n//    \n"},
-             // The word is measured whole.
+             // A word is measured with the line end in it.
              {x(40) + "\n" + x(32), "//    \n//    " + x(40) + "\n//    " + x(32) + " \n"},
              {"a\n" + x(70) + " b c", "//    a\n//    " + x(70) + " b \n//    c \n"}}) {
         std::string const header = Header(text.c_str(), "");

@@ -1,4 +1,4 @@
-// What the designs under golden/ do not reach.
+// Cases that the designs under golden/ do not cover.
 
 #include <array>
 #include <string>
@@ -110,7 +110,8 @@ TEST(Netlisters, NoPortsAndNoPins) {
               written.verilog);
 }
 
-/// An attribute of the instance hides the component's of that name, whether it is written or not.
+/// An attribute of the instance hides the component's attribute of that name, even if the former is
+/// not written.
 TEST(VerilogNetlister, WritesAttributesOfTheComponentUnlessTheInstanceHasThem) {
     Design design(Short("ADD COMPONENT C; ADD COMPONENT ATTRIBUTE C KEEP v;"
                         "SET COMPONENT ATTRIBUTE OPTION C KEEP -SYNATTR=ASSIGN;"

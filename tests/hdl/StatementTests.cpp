@@ -1,4 +1,4 @@
-// Operations of the two vocabularies with arguments that the designs under golden/ do not bring.
+// Statements of both languages with arguments that do not occur in the designs under golden/.
 
 #include <string>
 #include <tuple>

@@ -1,6 +1,6 @@
-// What a compiled client has built in besides the names of operations, which check-exports
-// compares: virtual slots, sizes, fields, bases, numbers, types of results. What does not compile
-// here breaks clients.
+// What a compiled client relies on besides the names of operations, which check-exports compares:
+// virtual slots, sizes, fields, bases, numbers, types of results. If a line here no longer
+// compiles, clients break.
 
 #include <algorithm>
 #include <array>
@@ -28,8 +28,9 @@ using AV = AttributeVisitor;
 using OV = ObjectVisitor;
 using SV = SignalVisitor;
 
-/// The slot of a virtual operation in the table of its class, as a pointer to member holds it (the
-/// C++ ABI of Itanium: the offset in the table, perhaps with a mark added); far off for any other.
+/// The slot of a virtual operation in the table of its class. In the Itanium C++ ABI a pointer to a
+/// virtual member holds the offset in the table, perhaps with a mark added; a pointer to any other
+/// member gives a number that is no slot.
 template <class Operation> int SlotOf(Operation operation) {
     auto const words = std::bit_cast<std::array<std::intptr_t, 2>>(operation);
     return static_cast<int>(words[0] / static_cast<std::intptr_t>(sizeof(void *)));
@@ -126,7 +127,7 @@ template <class Word> Word WordAt(void const *base, std::size_t bytes) {
     return word;
 }
 
-// What inline functions of the headers read: a compiled client holds these places.
+// Memory that inline functions of the headers read: these offsets are compiled into clients.
 
 TEST(Interface, MemoryOfArraysAndStrings) {
     int item = 0;

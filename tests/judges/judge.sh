@@ -17,7 +17,7 @@ work=$(mktemp -d)
 trap 'rm -rf "$work"' EXIT
 cd "$work"
 
-# The default binding of a cell that is not configured is the simulator's own affair.
+# Cells without a configuration get the default binding of the simulator.
 judge_vhdl() {
     local -a options=(--std=93 -P"$work" -Wno-binding)
     local top
@@ -55,7 +55,7 @@ fi
 
 files() { if [[ $written == "$folder" ]]; then cat judge; else ls; fi; }
 
-# Whatever a reader says is a complaint.
+# Any message of a reader counts as a complaint.
 failures=0
 while read -r file; do
     if ! said=$(judge "$written/$file" 2>&1) || [[ -n $said ]]; then

@@ -1,5 +1,5 @@
-// What attributes do in the model. The values that each command makes of its words are in the tests
-// of the command language.
+// The attribute operations of Model. What each command makes of its words is tested with the
+// command language.
 
 #include <gtest/gtest.h>
 
@@ -47,7 +47,7 @@ TEST(ModelAttributes, NullArguments) {
     };
 #define CALL(call, message) {#call, [](Model &m) { m.call; }, message}
     std::vector<Row> const rows = {
-        // Before anybody looks for the owner.
+        // The name is checked before the owner.
         CALL(AddModuleAttr(nullptr, "v", "?"), "Invalid Name.\n"),
         CALL(AddComponentAttr("none", nullptr, "v", "?"), "Invalid Name.\n"),
         CALL(AddInstanceAttr("none", nullptr, "v", "?"), "Invalid Name.\n"),
@@ -88,7 +88,8 @@ TEST(ModelAttributes, NullArguments) {
 }
 
 TEST(ModelAttributes, AnInstanceChangesItsOwnCopy) {
-    // The last: of the instance afterwards. Where the word is refused, the copy stays as well.
+    // Line, message, and the attributes of the instance afterwards. A refused word leaves the copy,
+    // too.
     using Row = std::tuple<char const *, char const *, char const *>;
     for (auto const &[line, message, own] :
          {Row{"VALUE u1 w 9", "", "W=9 SYN ASSIGN"},

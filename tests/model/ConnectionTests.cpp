@@ -34,14 +34,16 @@ TEST(Model, RefusedConnectionsKeepTheSignalsTheyMade) {
 }
 
 TEST(Model, DemandedNamesMakeSignals) {
-    // Scalar, bus, slice, index, compound. A typed bracket makes a scalar by its form, which is
-    // declared as what it reads; the range of a slice is not tested.
+    // s scalar, b bus, l slice, i bit, c compound. The form is decided with the brackets as typed:
+    // "b[3]" is no bit and becomes a scalar called b(3). The range of a slice may lie outside of
+    // its bus.
     for (auto const &[name, kinds] :
          Pairs("x=s; =s; x y=s; d(3:0)=b; d[3-0]=b; b(3:0)=l; B(20:19)=l; b(3)=i; b[3]=s; x,b[3]=s;"
                "x,b(3:0)\\b(3)=slic; x,c(3),d(1:0)=ssbc; b(3:0),x,B(3:0),X=lsc")) {
         Design design(Short("sig b(7:0)"));
         EXPECT_TRUE(design.model.AssignConstantToSignal(name.c_str(), "1"));
-        EXPECT_TRUE(design.model.AssignConstantToSignal(name.c_str(), "2:b:01")); // makes none anew
+        EXPECT_TRUE(
+            design.model.AssignConstantToSignal(name.c_str(), "2:b:01")); // makes no second signal
         std::string made;
         ForEach(design.netlist.GetSignalIterator(), [&made](Signal *signal) {
             made += "sblic"[signal->GetSignalType() - Signal::SIGNAL_SCALAR];

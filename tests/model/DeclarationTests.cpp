@@ -45,7 +45,8 @@ TEST(Model, RefusedDeclarationsChangeNothing) {
 
 TEST(Model, DeclarationsModify) {
     Design design(Cells());
-    // Pins are no names of the design, and a pin may come late; a scalar goes beside a bus.
+    // A pin may have the name of a component and be added late; a scalar may have the base name of
+    // a bus.
     for (std::string const &line : Short("ADD COMPONENT C; ADD PIN cell C out; ADD INSTANCE c i;"
                                          "sig S[3-0]; sig S; sig S(2); sig A,B")) {
         design.model.SetModifiedFlag(false);

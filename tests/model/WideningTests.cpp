@@ -14,7 +14,8 @@ TEST(Widening, KeepsEverythingThatLedToTheFormerBus) {
              {"D(3:0) u1.B(3:0); D(7:0) u1.W(7:0)", "D(7:0): u1.W(7:0)\n[D(3:0)]: u1.B(3:0)\n"},
              {"n D(3:0); D(7:0) m", "n <- D(3:0)\nD(7:0) <- m\nm\n[D(3:0)]\n"},
              {"D(3:0) D(3:0); D(7:0) m", "D(7:0) <- m\nm\n[D(3:0)] <- D(3:0)\n"},
-             // The left side in hand, and members of the compound in hand.
+             // The left side of the line itself is widened, then members of the compound that is
+             // being made.
              {"D(3:0) D(7:0)", "D(7:0)\n[D(3:0)] <- D(7:0)\n"},
              {"D(3:0) n,D(7:0)", "n\nD(7:0)\nn,D(7:0) {n D(7:0)}\n[D(3:0)] <- n,D(7:0)\n"},
              {"X(0:0),X(3:0),X(7:0) X(9:0)",
@@ -65,7 +66,7 @@ TEST(Widening, GivesPartsTheNewParent) {
     }
 }
 
-/// The client made each pointer, and the library was not asked.
+/// Pointers that a client made through the objects and not through Model.
 TEST(Widening, LeavesNoPointerThatAClientMade) {
     struct Row {
         char const *name;

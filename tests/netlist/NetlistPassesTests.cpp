@@ -27,14 +27,15 @@ TEST(NetlistPasses, VhdlDummies) {
              {"port z bi; z u1.IO; z u2.Y; z u3.Y; port q out; q u1.Y; port d in; d u1.A;"
               "n u2.A; n u3.IO",
               "inout z: u1.IO u2.Y u3.Y\nout q: u1.Y\nin d: u1.A\nn: u2.A u3.IO\n"},
-             // Earlier assignments move along.
+             // Earlier assignments move to the dummy too.
              {"port q out; port d in; q n; q u1.A; d n; d u1.Y",
               "out q <- q_DUMMY\nin d\nn\nq_DUMMY: u1.A <- n\nd_DUMMY: u1.Y <- n d\n"},
              {"port a(7:0) out; a(3:0) u1.Q(3:0); a(3:0) u2.B(3:0); a(7) u3.A",
               "out a(7:0) <- a_DUMMY(7:0)\nout a(3:0)\nout a(7)\na_DUMMY(7:0)\n"
               "a_DUMMY(3:0): u1.Q(3:0) u2.B(3:0)\na_DUMMY(7): u3.A\n"},
-             // Compounds: with their members; without one that has no dummy, as a bit of no bus;
-             // with a slice of no port; one that is not read itself.
+             // Compounds: the dummy lists the dummies of the members; a member without a dummy,
+             // here a bit of no bus, is left out; a slice of a bus that is no port; a compound that
+             // is not read.
              {"port x out; port y out; x,y u1.A",
               "out x <- x_DUMMY\nout y <- y_DUMMY\nx,y {x_DUMMY y_DUMMY}\nx_DUMMY\ny_DUMMY\n"
               "x_DUMMY,y_DUMMY {x_DUMMY y_DUMMY}: u1.A\n"},

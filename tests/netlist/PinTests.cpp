@@ -28,7 +28,7 @@ TEST(Component, TheNameAsTypedDecidesTheClassOfAPin) {
     }
 }
 
-/// Few pins are walked through, many are looked up, and both ways find the same.
+/// A walk over few pins and the index of many find the same pin.
 TEST(Component, PinsKeepOrderAndTheFirstOfTwoIsFound) {
     for (int const more : {0, 40}) {
         Component component("C");
@@ -50,7 +50,8 @@ TEST(Component, PinsKeepOrderAndTheFirstOfTwoIsFound) {
     Component renamed("C");
     for (int i = 0; i < 40; ++i)
         renamed.AddPin(("p" + std::to_string(i)).c_str(), Polarity::OUTPUT, "");
-    renamed.GetPin("p1")->SetName("Z"); // last, for from then on nobody trusts an index
+    renamed.GetPin("p1")->SetName(
+        "Z"); // last, as from then on the index of this component is not used
     EXPECT_TRUE(renamed.GetPin("Z") && !renamed.GetPin("p1"));
 }
 
@@ -69,9 +70,13 @@ std::string SortedPins(bool aPinHasChanged) {
     std::string names;
     for (int i = 0; i < 200; ++i) {
         Component component("C");
-        for (unsigned int pins = random() % 8; pins > 0; --pins)
-            component.AddPin(RandomText(random, "aAb12", 3).c_str(),
+        // Names at random, some of them equal, or pairs that differ in case alone. With many pins a
+        // second sort may exchange equal ones.
+        for (unsigned long pin = random() % 40; pin > 0; --pin) {
+            std::string const pair = (pin % 2 ? "p" : "P") + std::to_string(pin / 2 * 7 % 20);
+            component.AddPin((i % 2 ? pair : RandomText(random, "aAb12", 3)).c_str(),
                              static_cast<Polarity::Value>(random() % 3), "");
+        }
         Instance first("u", &component);
         component.AddPin("late", Polarity::INPUT, "");
         if (aPinHasChanged)
@@ -219,7 +224,8 @@ TEST(Instance, PinsThatReadOrDriveAPortAndOpenOnes) {
         EXPECT_EQ("in in out bi", NamesOf(open)); // gathered, never emptied
         for (char const *const name : {"in", "out", "bi"})
             signal.Connect(instance.GetPin(name));
-        EXPECT_TRUE(instance.GetOpenPin(open, true)); // of earlier calls
+        EXPECT_TRUE(
+            instance.GetOpenPin(open, true)); // the list still holds the pins of earlier calls
         open.Empty();
         EXPECT_FALSE(instance.GetOpenPin(open, false));
     }

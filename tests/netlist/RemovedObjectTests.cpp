@@ -122,7 +122,7 @@ TEST(RemovedSignal, MayBeTheSliceOfAWidenedBus) {
     EXPECT_EQ("D(7:0) <- n\nn\nz\n", Wiring(netlist));
 }
 
-/// Each level lists the one below it twice: what looks below a member never ends.
+/// Each level lists the one below it twice: a walk into the members would take 2^60 steps.
 TEST(CompoundBus, TakesMembersHoweverDeepTheyNest) {
     ScalarSignal scalar("s");
     Signal *below = &scalar;

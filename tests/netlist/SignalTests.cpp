@@ -52,7 +52,7 @@ TEST(Signal, FiveClasses) {
         EXPECT_EQ(width, signal->GetWidth());
         EXPECT_EQ(isDeclared, signal->IsNeededToDeclared());
         EXPECT_FALSE(signal->IsPort());
-        Visitor visitor; // sees the class first
+        Visitor visitor; // the operation of the class is called before that of Signal
         signal->AcceptSignal(visitor);
         EXPECT_EQ(signal == &bits.slice ? "slice signal" : "signal", visitor.seen);
     }

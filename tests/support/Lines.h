@@ -57,7 +57,8 @@ template <class T> std::string NamesOf(Vesk_Hdl::PtrArray<T> const &objects) {
     return NamesOf(Vesk_Hdl::Iterator<T>(&objects));
 }
 
-/// All signals and what hangs together with them, a line for each signal in the netlist's order:
+/// All signals with their pins, members and assignments, a line for each signal in the netlist's
+/// order:
 ///
 ///     out q {member member}: u1.Y (u2.A) <- assigned assigned
 ///

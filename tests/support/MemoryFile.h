@@ -6,7 +6,7 @@
 
 #include "vesk_hdl/Vesk_Hdl.h"
 
-/// A file that has no place on a disk.
+/// A file in memory.
 class MemoryFile {
 public:
     MemoryFile() : descriptor(::memfd_create("vesk", MFD_CLOEXEC)) {}
@@ -14,7 +14,7 @@ public:
     MemoryFile &operator=(MemoryFile const &) = delete;
     ~MemoryFile() { ::close(descriptor); }
 
-    /// A descriptor for somebody who will close it.
+    /// A new descriptor of the file, which the caller closes.
     int Open() const { return ::dup(descriptor); }
     /// All that was written; from then on the file is empty.
     std::string Take() {

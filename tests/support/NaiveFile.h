@@ -2,8 +2,8 @@
 
 #include <string>
 
-/// A text file in memory that treats each line as a plain string, read anew for every piece: what a
-/// folding file stream means, slowly.
+/// A slow model of the folding file stream: each line is a plain string that is searched again for
+/// every piece.
 struct NaiveFile {
     std::string file, line;
     std::size_t level = 0;

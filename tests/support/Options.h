@@ -32,7 +32,7 @@ inline std::vector<std::pair<std::string, std::string>> Fields(Vesk_Hdl::HdlOpti
     return fields;
 }
 
-/// The fields that are not as they are at first: "flat=1 lib=a|b".
+/// The fields that differ from the defaults: "flat=1 lib=a|b".
 inline std::string Changed(Vesk_Hdl::HdlOptions const &options) {
     auto const initial = Fields(Vesk_Hdl::HdlOptions());
     auto const now = Fields(options);

@@ -5,8 +5,8 @@
 
 #include "vesk_hdl/Vesk_Hdl.h"
 
-/// A thing that carries attributes and comments: its words in keywords, the names that find it in
-/// the design of Cells() with a signal s, and itself.
+/// An object that has attributes and comments: its words in keywords, and its names in the design
+/// of Cells() with a signal s.
 struct Owner {
     std::string words;
     char const *holder;

@@ -5,8 +5,8 @@
 
 #include "vesk_hdl/Vesk_Hdl.h"
 
-/// Command lines made from the grammar of the commands and a small stock of names, so that most of
-/// them are accepted, meet each other's objects and reach deep states.
+/// Command lines made from the grammar of the commands and a small set of names, so that most of
+/// them are accepted and refer to the same objects.
 class RandomLines {
 public:
     explicit RandomLines(std::mt19937 &source) : random(source) {}

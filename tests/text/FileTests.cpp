@@ -55,7 +55,7 @@ TEST(File, AForgottenReadingStreamHoldsNoDescriptor) {
     EXPECT_EQ(openDescriptors(), before);
 }
 
-/// A signal in the very first read must not pass for the end of the file.
+/// A signal during the first read must not be taken for the end of the file.
 TEST(File, ReadsWholeInSpiteOfSignals) {
     TempDir const folder;
     std::string const path = folder.Path("fifo");

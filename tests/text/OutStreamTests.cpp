@@ -54,7 +54,7 @@ TEST(TextFileOutStream, FoldsLikeTheNaiveFile) {
             : piece == "<" ? naive.Unindent()
             : piece == "!" ? naive.Flush()
                            : naive.Write(piece);
-            if (step % 100 == 50) { // what closing leaves on the line shows on the next one
+            if (step % 100 == 50) { // what closing leaves of the line would be seen in the next one
                 file.stream.Close();
                 naive.Flush();
                 file.stream << "dropped\n" << 1 << OutStream::NEW_LINE;

@@ -133,8 +133,8 @@ bool CountingLess(void *a, void *b, void *calls) {
     return Less(static_cast<Item *>(a), static_cast<Item *>(b));
 }
 
-/// Introspective sort from the book: cut by the median of three down to 16 elements, then a pass of
-/// insertion, which leaves equal elements in the order it finds them in.
+/// Introspective sort as in textbooks: cut by the median of three down to 16 elements, then a pass
+/// of insertion, which leaves equal elements in the order it finds them in.
 struct NaiveSort {
     Items items;
     bool atDepthLimit = false;
@@ -164,8 +164,7 @@ struct NaiveSort {
     }
 };
 
-/// Sorts both ways and compares. At the depth limit the order of equal elements is nobody's
-/// promise.
+/// Sorts both ways and compares. Beyond the depth limit the order of equal elements is not fixed.
 bool SortBothWays(std::vector<int> const &keys) {
     std::vector<Item> storage(keys.size());
     NaiveSort naive;

@@ -120,7 +120,7 @@ TEST(StringSet, WalksLikeTheNaiveTable) {
     }
 }
 
-/// All in one bucket: a table that walks along it would have this test run for a minute.
+/// All in one bucket: a table that searches it in order would need a minute.
 TEST(StringSet, FindsNamesThatWereMadeToCollide) {
     constexpr unsigned int PAIRS = 16;
     StringSet set;

@@ -46,8 +46,8 @@ TEST(IStringPtrMap, AnswersLikeANaiveMap) {
         ASSERT_TRUE(assigned.Get(name.c_str()) == pointer && copy.Get(name.c_str()) == pointer);
 }
 
-/// Every character at every place, in texts of all lengths that are read in another way. Of so many
-/// random numbers hardly ever two are equal by chance.
+/// Every character at every place, in texts of all lengths that the hash reads in a different way.
+/// Two of so many random numbers are hardly ever equal by chance.
 TEST(SeededHash, IgnoresTheCaseOfLettersAlone) {
     int equal = 0;
     for (std::size_t size = 1; size < 20; ++size)

@@ -1,3 +1,6 @@
+// The statements of the Verilog writer. Each piece of a Put is one piece of the required text, see
+// Pieces.h.
+
 #include "vesk_hdl/hdl/VerilogStatements.h"
 
 #include "vesk_hdl/hdl/HdlUtilities.h"
@@ -9,17 +12,18 @@ using Text = Basis::StringBase<char>;
 
 namespace {
 
-/// Under the first name of a Synopsys comment; the Synplicity comment keeps to the same column,
-/// although its opening is shorter.
+/// Blanks up to the column of the first name in a Synopsys comment. Required: the Synplicity
+/// comment has the same, although its beginning is shorter.
 constexpr char const *ATTR_COLUMN = "                      ";
 
-/// The size and base of a literal, if the value was given with them.
+/// The size and base of a number, if the value was given with them.
 void WriteSize(OutStream &stream, BitVectorValue const &value) {
     if (value.HasBaseAndLength())
         Put(stream, value.GetLength(), "'", HdlUtilities::ConvertVerilogBase(value.GetBase()));
 }
 
-/// An attribute's value as a Verilog literal. Booleans and user values are strings.
+/// Writes an attribute's value as a Verilog literal. Verilog has no booleans and no types of the
+/// user, so that both are strings.
 class WriteVerilogAttrValueVisitor : public AttributeVisitor {
 public:
     explicit WriteVerilogAttrValueVisitor(OutStream &out) : stream(out) {}
@@ -51,10 +55,11 @@ private:
 
 void WriteValue(OutStream &stream, Attribute const *attr) {
     WriteVerilogAttrValueVisitor visitor(stream);
-    const_cast<Attribute *>(attr)->AcceptAttribute(visitor); // a visitor that only reads
+    const_cast<Attribute *>(attr)->AcceptAttribute(visitor); // the visitor does not change it
 }
 
-/// Calls `write` with name and bare value of each attribute that is to be written.
+/// Calls `write` with the name of each attribute that is to be written, and its value without
+/// quotes.
 template <class Write> void ForEachSynAttr(Iterator<Attribute *> const &attrs, Write write) {
     ForEach(attrs, [&write](Attribute const *attr) {
         if (attr->IsSynAssigned())
@@ -102,13 +107,10 @@ void VerilogStatements::WritePortDeclaration(Text const &name, Polarity const &p
          : polarity == Polarity::BIDIRECTIONAL ? " inout"
                                                : "output"),
         " ");
-    Text base;
-    int left = 0;
-    int right = 0;
-    if (Bus::IsBusName(name) && Bus::ParseBusName(name, base, left, right))
-        Put(stream, "[", left, ":", right, "]", " ", base);
-    else
-        stream << name;
+    NameParts const parts(name);
+    if (parts.isBus)
+        Put(stream, "[", parts.left, ":", parts.right, "]", " ");
+    stream << parts.base;
 }
 
 void VerilogStatements::WriteSignalDeclaration(Text const &name) {
@@ -121,22 +123,15 @@ void VerilogStatements::WriteSignalDeclaration(Text const &name) {
 void VerilogStatements::WriteWire(Text const &name) { Put(stream, "wire", " ", name); }
 
 void VerilogStatements::WriteWireBus(Text const &name) {
-    Text base;
-    int left = 0;
-    int right = 0;
-    Bus::ParseBusName(name, base, left, right);
-    Put(stream, "wire", " ", "[", left, ":", right, "]", " ", base);
+    NameParts const parts(name);
+    Put(stream, "wire", " ", "[", parts.left, ":", parts.right, "]", " ", parts.base);
 }
 
 void VerilogStatements::WriteSignalName(char const *name) {
-    Text const text(name);
-    Text base;
-    int left = 0;
-    int right = 0;
-    if (Bus::IsBusName(text) && Bus::ParseBusName(text, base, left, right))
-        Put(stream, base, "[", left, ":", right, "]");
-    else
-        stream << text;
+    NameParts const parts{Text(name)};
+    stream << parts.base;
+    if (parts.isBus)
+        Put(stream, "[", parts.left, ":", parts.right, "]");
 }
 
 void VerilogStatements::NormalizeBusName(Text &name) const {

@@ -1,3 +1,6 @@
+// The statements of the VHDL writer. Each piece of a Put is one piece of the required text, see
+// Pieces.h.
+
 #include "vesk_hdl/hdl/VhdlStatements.h"
 
 #include <string>
@@ -12,7 +15,7 @@ using Text = Basis::StringBase<char>;
 
 namespace {
 
-/// An attribute's type in VHDL.
+/// Writes the VHDL type of an attribute.
 class WriteVhdlAttrTypeVisitor : public AttributeVisitor {
 public:
     explicit WriteVhdlAttrTypeVisitor(OutStream &out) : stream(out) {}
@@ -29,7 +32,8 @@ private:
     OutStream &stream;
 };
 
-/// An attribute's value as a VHDL literal.
+/// Writes the value of an attribute as a VHDL literal of that type. The text of a user's type is an
+/// expression and not quoted; an empty one would be no expression, so that it is an empty string.
 class WriteVhdlAttrValueVisitor : public AttributeVisitor {
 public:
     explicit WriteVhdlAttrValueVisitor(OutStream &out) : stream(out) {}
@@ -62,7 +66,7 @@ private:
     OutStream &stream;
 };
 
-/// A visitor's view of an attribute that is only read.
+/// Visits an attribute with a visitor that does not change it.
 void Accept(Attribute const *attr, AttributeVisitor &&visitor) {
     const_cast<Attribute *>(attr)->AcceptAttribute(visitor);
 }
@@ -129,11 +133,8 @@ void VhdlStatements::WriteGenericMapInitAttr(Attribute const *attr) {
 }
 
 void VhdlStatements::WritePortStatement(Text const &name, Polarity const &polarity, int width) {
-    Text base = name;
-    int left = 0;
-    int right = 0;
-    bool const isBus = Bus::IsBusName(name) && Bus::ParseBusName(name, base, left, right);
-    WritePadded(base, width);
+    NameParts const parts(name);
+    WritePadded(parts.base, width);
     Put(stream, ":", " ");
     switch (polarity.GetValue()) {
     case Polarity::INPUT:
@@ -142,12 +143,12 @@ void VhdlStatements::WritePortStatement(Text const &name, Polarity const &polari
     case Polarity::BIDIRECTIONAL:
         stream << "inout";
         break;
-    default:
+    default: // required: also of a polarity that is no direction
         stream << "out  ";
     }
     stream << " ";
-    if (isBus)
-        WriteStdLogicVector(left, right);
+    if (parts.isBus)
+        WriteStdLogicVector(parts.left, parts.right);
     else
         WriteStdLogic();
 }
@@ -159,6 +160,7 @@ void VhdlStatements::WriteStdLogicVector(int left, int right) {
     WriteBusIndex(left, right);
 }
 
+/// Equal bounds are written as "downto".
 void VhdlStatements::WriteBusIndex(int left, int right) {
     Put(stream, "(", left, " ", (left < right ? "to" : "downto"), " ", right, ")");
 }
@@ -258,7 +260,7 @@ void VhdlStatements::WriteSignalAssignment(Text const &target, Text const &sourc
     Put(stream, ";", EOL);
 }
 
-/// The name, a blank and the padding, which is a piece of its own.
+/// Writes the name, a blank and the padding. Each is a piece of its own: required.
 void VhdlStatements::WritePadded(Text const &name, int width) {
     Put(stream, name, " ");
     int const length = static_cast<int>(name.GetLength());
@@ -266,6 +268,8 @@ void VhdlStatements::WritePadded(Text const &name, int width) {
         stream << std::string(static_cast<std::size_t>(width - length), ' ').c_str();
 }
 
+/// Writes one side of an assignment. Required: IsBusName decides, and WriteBus reads the name
+/// again, token by token.
 void VhdlStatements::WriteSide(Text const &name) {
     if (Bus::IsBusName(name))
         WriteBus(name);

@@ -58,9 +58,8 @@ public:
     /// hyphen becomes a colon, also one outside brackets.
     static void NormalizeName(Basis::StringBase<char> &name);
     /// The name of the whole bus: "D" for "D(7:0)" and "D[3]". It is the rewritten text before the
-    /// first
-    /// "(" if there are both brackets and no comma, otherwise the whole rewritten text. Null gives
-    /// the empty string.
+    /// first "(" if there are both brackets and no comma, otherwise the whole rewritten text. Null
+    /// gives the empty string.
     static Basis::StringBase<char> GetBaseName(char const *name);
     /// Whether the text is a base name: a letter, underscore or apostrophe, then letters, digits
     /// and underscores. Null is none.

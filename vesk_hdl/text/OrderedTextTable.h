@@ -22,8 +22,8 @@ namespace Vesk_Hdl {
 /// primes, and a table never holds more texts than it has buckets. A table that holds nothing yet
 /// costs no allocation.
 ///
-/// This hash is known, so that somebody can write names that all belong into one bucket. As soon as
-/// a bucket is longer than chance makes it, a TextIndex of all texts finds them in place of the
+/// This hash is known, so that names can be made that all belong into one bucket. As soon as a
+/// bucket is longer than chance makes it, a TextIndex of all texts finds them in place of the
 /// chains; the order does not change.
 class OrderedTextTable {
 public:

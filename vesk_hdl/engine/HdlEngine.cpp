@@ -1,3 +1,5 @@
+// The class Engine: its models, and how a line reaches one of them.
+
 #include "vesk_hdl/engine/HdlEngine.h"
 
 #include "vesk_hdl/engine/Keywords.h"
@@ -11,9 +13,9 @@ namespace Vesk_Hdl {
 using Basis::StringBase;
 
 struct Engine::Record {
-    CommandFactory factory; ///< outlives the models, which point at it
-    ModelIndex index;       ///< outlives them, too: they count their renames there
-    OwnPtrArray<Model *> models;
+    CommandFactory factory;      ///< declared before the models, which point at it
+    ModelIndex index;            ///< likewise: the models count their renames in it
+    OwnPtrArray<Model *> models; ///< in order of addition
     Model *currentModel = nullptr;
 };
 
@@ -28,10 +30,10 @@ bool Engine::CreateAndAddModel(char const *name, char const *sourceFileName) {
     if (GetModel(name))
         return false;
     std::unique_ptr<Model> model(record->factory.CreateModel());
-    model->SetName(name ? name : "");
+    model->SetName(name ? name : ""); // null would mean the default name
     model->SetSourceFileName(sourceFileName);
     record->models.Add(model.get());
-    record->index.Add(*model.release());
+    record->index.Add(*model.release()); // owned by the array now, whatever the index does
     return true;
 }
 
@@ -57,6 +59,7 @@ bool Engine::RemoveModel(char const *name) {
 
 namespace {
 
+/// Runs a line. Required: without a model even an empty line is refused.
 void ExecuteOn(Model *model, char const *line) {
     if (!model)
         VESK_HDL_RAISE("HdlEngine", Messages::MISSING_MODEL);
@@ -72,7 +75,7 @@ void Engine::Execute(char const *modelName, char const *line) {
 }
 
 bool Engine::ReadCommandFile(char const *modelName, char const *fileName) {
-    if (!GetModel(modelName))
+    if (!GetModel(modelName)) // required: also if the file turns out to be unreadable
         CreateAndAddModel(modelName, fileName);
     return GetModel(modelName)->Read(fileName);
 }

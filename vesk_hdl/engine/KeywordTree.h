@@ -11,22 +11,23 @@
 
 namespace Vesk_Hdl {
 
-/// Keywords as ways through a tree of words, which match in any case.
+/// Keywords as paths through a tree of words, which match in any case. A line is compared with a
+/// dozen words; a map of keywords would hash each beginning of the line.
 class KeywordTree {
 public:
-    /// What is reached by the words of the beginning of a line.
+    /// A node of the tree, which the words at the beginning of a line lead to.
     class Place {
     public:
-        /// Of the keyword that ends here; null if none does.
+        /// The creator of the keyword that ends here; null if none does.
         CommandCreator GetCreator() const { return creator; }
 
     private:
         friend class KeywordTree;
         struct Step {
             std::string word;
-            Place *place; ///< after the word
+            Place *place; ///< where the word leads
         };
-        /// The length first: most words differ in it.
+        /// Compares the lengths first, in which most words differ.
         struct Less {
             using is_transparent = void;
             bool operator()(std::string_view a, std::string_view b) const {
@@ -36,18 +37,19 @@ public:
         };
 
         CommandCreator creator = nullptr;
-        std::vector<Step> next; ///< at most MAX_SCANNED
-        std::map<std::string, Place *, Less> more;
+        std::vector<Step> next;                    ///< the first MAX_SCANNED words that may follow
+        std::map<std::string, Place *, Less> more; ///< those of clients who register thousands
     };
 
-    /// In front of all words.
+    /// The place before the first word.
     Place const &GetRoot() const { return root; }
 
-    /// The place after all words of a token; a quoted token may hold several. Null if no keyword
-    /// continues like this.
+    /// The place that the words of a token lead to, null if no keyword continues with them. A
+    /// quoted token may hold several words. Required: words are compared and not tokens.
     Place const *Follow(Place const &place, std::string_view token) const {
         Place const *at = &place;
         while (at) {
+            // The whole token is tried first: few tokens have a blank.
             Place const *const found = Find(*at, token);
             std::size_t const blank = found ? token.npos : token.find(' ');
             if (blank == token.npos)
@@ -94,7 +96,7 @@ private:
     }
 
     Place root;
-    std::deque<Place> places; ///< all others; a deque never moves them
+    std::deque<Place> places; ///< all other places; a deque never moves them
 };
 
 } // namespace Vesk_Hdl

@@ -216,6 +216,8 @@ constexpr CommandSpec COMMANDS[] = {
          .refused = "a missing word",
          .example = "SET SYNTHESIS SYNPLICITY",
          .wrong = "SET SYNTHESIS"}),
+    // The words of these two commands differ, see Vocabulary::UPPERCASE_NAMES. The help says so,
+    // since it looks like a mistake of the user.
     Row<UppercaseCommand>(
         {{UPPERCASE_NAMES}},
         {.summary = "Writes names of one kind in upper case, in Verilog.",
@@ -273,6 +275,8 @@ constexpr CommandSpec COMMANDS[] = {
         {}, {.summary = "Writes a port a line.",
              .notes = "It is so from the beginning, and no command turns it off.",
              .example = "SET PORT ONEPERLINE"}),
+
+    // The families, each with its members in one order of owners.
 
     Member<AddModuleCommentCommand>(DESIGN, COMMENT),
     Member<AddComponentCommentCommand>(COMPONENT_OWNER, COMMENT),

@@ -47,6 +47,7 @@ CommandFactory::CommandFactory(CommandFactory const &other) : record(other.recor
     ++record->owners;
 }
 
+/// Required: both factories share one table afterwards. It is counted, so that it is freed once.
 CommandFactory &CommandFactory::operator=(CommandFactory const &other) {
     CommandFactory shared(other);
     std::swap(record, shared.record);
@@ -57,6 +58,7 @@ void CommandFactory::AddCommandCreator(char const *keyword, CommandCreator creat
     AddCommandCreator(StringArray(keyword, " ", true, nullptr), creator);
 }
 
+/// Required: of two creators of one keyword the newer one wins.
 void CommandFactory::AddCommandCreator(StringArray const &words, CommandCreator creator) {
     record->keywords.Add(words.Concatenate(" ").View(), creator);
 }
@@ -64,12 +66,12 @@ void CommandFactory::AddCommandCreator(StringArray const &words, CommandCreator 
 /// Looks up each beginning of the line, and the last one that is a keyword wins. The walk ends at
 /// the first word that continues no keyword, since nothing longer can match.
 CommandCreator CommandFactory::GetCommandCreator(StringArray const &tokens) const {
-    KeywordTree::Place const *place = &record->keywords.GetRoot();
+    KeywordTree::Node const *node = &record->keywords.GetRoot();
     CommandCreator found = nullptr;
-    for (int i = 0; place && i < tokens.GetSize(); ++i) {
-        place = record->keywords.Follow(*place, tokens.At(i).View());
-        if (place && place->GetCreator())
-            found = place->GetCreator();
+    for (int i = 0; node && i < tokens.GetSize(); ++i) {
+        node = record->keywords.Follow(*node, tokens.At(i).View());
+        if (node && node->GetCreator())
+            found = node->GetCreator();
     }
     return found;
 }

@@ -45,6 +45,7 @@ bool Engine::UseModel(char const *name) {
     return true;
 }
 
+/// The index is asked while the model still has its name.
 bool Engine::RemoveModel(char const *name) {
     Model *const model = GetModel(name);
     if (!model)
@@ -85,9 +86,12 @@ bool Engine::WriteCommandFile(char const *modelName, char const *fileName) {
     return model && model->Write(fileName);
 }
 
+// The two languages treat case differently, so that the two tests do.
+
 bool Engine::IsVhdlKeyword(char const *word) { return VhdlKeywords().IContains(word); }
 bool Engine::IsVerilogKeyword(char const *word) { return VerilogKeywords().Contains(word); }
 
+/// Required: a file that cannot be opened is no failure; its text is dropped.
 void Engine::WriteOrvaneHeader(char const *application, char const *command, char const *designName,
                                char const *device, char const *purpose, char const *reference,
                                bool isVhdl, char const *fileName) {

@@ -78,6 +78,7 @@ void VerilogStatements::WriteTimeScale(char const *unit, char const *precision) 
     Put(stream, "`timescale", " ", unit, " / ", precision, EOL);
 }
 
+/// For clients, as in VHDL. Required: without a file two blanks remain before the hyphen.
 void VerilogStatements::WriteTimeStamp(char const *fileName) {
     stream << "// Verilog model ";
     if (fileName && *fileName)
@@ -127,6 +128,8 @@ void VerilogStatements::WriteWireBus(Text const &name) {
     Put(stream, "wire", " ", "[", parts.left, ":", parts.right, "]", " ", parts.base);
 }
 
+/// Required: only a range gets square brackets. The name of a bit keeps its parentheses here,
+/// unlike at the pin of an instance.
 void VerilogStatements::WriteSignalName(char const *name) {
     NameParts const parts{Text(name)};
     stream << parts.base;
@@ -139,6 +142,7 @@ void VerilogStatements::NormalizeBusName(Text &name) const {
     name.ReplaceChars(')', ']');
 }
 
+/// Required: the target is the base name, also for one bit of a bus.
 void VerilogStatements::WriteConstantSignalAssignment(Text const &name, bool isScalar,
                                                       BitVectorValue const &value) {
     Put(stream, "assign", " ", Object::GetBaseName(name), " = ");
@@ -168,6 +172,9 @@ void VerilogStatements::WriteDefParamInitStatement(Attribute const *attr, char c
     if (attr)
         Put(stream, "defparam", " ", instance, ".", attr->GetNameRef(), " = ", attr->GetNameRef());
 }
+
+// Three tools read one comment line for each attribute, which names its target. The other two read
+// one comment for all attributes, which is inside or directly after the statement of the target.
 
 void VerilogStatements::WriteQRTAttr(Iterator<Attribute *> const &attrs, char const *target) {
     ForEachSynAttr(attrs, [this, target](Text const &name, Text const &value) {
@@ -203,6 +210,7 @@ void VerilogStatements::WritePrecisionAttrStatement(char const *name, char const
     Put(stream, "//pragma attribute ", target, " ", name, " ", value, EOL);
 }
 
+/// Required: a line of this comment ends in a comma and a backslash.
 void VerilogStatements::WriteSynplicityAttr(Iterator<Attribute *> const &attrs) {
     bool first = true;
     ForEachSynAttr(attrs, [this, &first](Text const &name, Text const &value) {

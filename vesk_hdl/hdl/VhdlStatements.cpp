@@ -77,6 +77,7 @@ namespace Vesk_Hdl {
 
 VhdlStatements::VhdlStatements(OutStream &out) : stream(out) {}
 
+/// For clients: the files of the writers have the time in their header.
 void VhdlStatements::WriteTimeStamp(char const *fileName) {
     stream << "-- VHDL model";
     if (fileName && *fileName)
@@ -92,6 +93,7 @@ void VhdlStatements::WriteIEEELibrary() {
     Put(stream, "use", " ieee.numeric_std.ALL;", EOL);
 }
 
+/// Neither writer asks for the marks; they are for clients whose synthesis tool lacks the library.
 void VhdlStatements::WriteKorbalLibrary(bool translate) {
     if (translate)
         Put(stream, Translate::VHDL_OFF, EOL);
@@ -111,6 +113,7 @@ void VhdlStatements::WriteUseUserLibrary(StringArray const &names) {
         Put(stream, "use", " ", names.At(i), ";", EOL);
 }
 
+/// Required: two blanks after the sign.
 void VhdlStatements::WriteGenericMapAttrType(Attribute const *attr) {
     if (!attr)
         return;
@@ -183,6 +186,8 @@ void VhdlStatements::WriteSignalStatement(Text const &name, int width) {
     Put(stream, ":", " ", "std_logic", ";", EOL);
 }
 
+/// Required: the result of the parse is not tested. A bus without a range, such as the dummy of a
+/// base that ends in the mark, is declared with the bounds 0 and 0.
 void VhdlStatements::WriteSignalVectorStatement(Text const &name, int width) {
     Text base = name;
     int left = 0;
@@ -195,6 +200,7 @@ void VhdlStatements::WriteSignalVectorStatement(Text const &name, int width) {
     Put(stream, ";", EOL);
 }
 
+/// Required: this is the only statement with a blank before its semicolon.
 void VhdlStatements::WriteAttrDeclaration(Attribute const *attr, bool useAttrType, int width) {
     if (!attr)
         return;
@@ -221,8 +227,10 @@ void VhdlStatements::WriteAttrAssignment(Attribute const *attr, char const *targ
     Put(stream, ";", EOL);
 }
 
+/// A second declaration of a name would be illegal. Names are compared as VHDL does, without case.
 void VhdlStatements::WriteAttrDeclaration(AttributeHolder const *holder, StringSet &declared,
                                           bool useAttrType, int width) {
+    // Asking an empty holder for an iterator would make a list in it: see AttributeHolder.
     if (!holder || !holder->HasAttrs())
         return;
     ForEach(holder->GetAttrIterator(), [&](Attribute const *attr) {
@@ -243,6 +251,7 @@ void VhdlStatements::WriteAttrAssignment(AttributeHolder const *holder, char con
     });
 }
 
+/// Without base and length the digits are taken as bits, one for each character.
 void VhdlStatements::WriteConstantSignalAssignment(Text const &name, bool isScalar,
                                                    BitVectorValue const &value) {
     char const *const quote = isScalar ? "'" : "\"";

@@ -11,7 +11,7 @@ namespace Vesk_Hdl {
 /// A name that enters an object is rewritten to the one form that the library works with,
 /// NAME(LEFT:RIGHT), whatever brackets the client wrote. Names keep their case; lookups ignore it.
 /// Copies share name and comment until one of them changes, so that the pins of a million instances
-/// cost no name. If memory runs out (std::bad_alloc), an object is as it was.
+/// cost no name. A setter that runs out of memory (std::bad_alloc) leaves the object as it was.
 class VESK_HDL_API Object {
 public:
     /// The kinds of objects. A client class that derives from one of the library's has the kind of

@@ -57,7 +57,7 @@ public:
     Node const *GetNext(Node const *node) const;
 
 private:
-    static constexpr std::uint32_t LONGEST_BUCKET = 50; ///< chance makes none of that length
+    static constexpr std::uint32_t MAX_BUCKET = 50; ///< chance makes no bucket longer than this
 
     static std::uint32_t Hash(std::string_view key);
     std::uint32_t BucketOf(std::uint32_t hash) const { return hash % bucketCount; }

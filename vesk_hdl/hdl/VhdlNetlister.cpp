@@ -99,9 +99,11 @@ void VhdlNetlister::WriteNetlist(Netlist *netlist, HdlOptions const *options) {
         statements->WriteKorbalLibrary(false);
         *stream << EOL;
     }
-    SignalLists const signals(*netlist);
-    WriteEntity(netlist, signals, options);
-    WriteArchitecture(netlist, signals, options);
+    {
+        SignalLists const signals(*netlist); // freed before the configuration needs as much memory
+        WriteEntity(netlist, signals, options);
+        WriteArchitecture(netlist, signals, options);
+    }
     *stream << EOL;
     if (!vhdl.suppressConfiguration)
         WriteConfiguration(netlist);

@@ -9,17 +9,17 @@
 #include "vesk_hdl/netlist/Attribute.h"
 #include "vesk_hdl/netlist/Vocabulary.h"
 
-// The commands that attach attributes and comments: five families with a member for each kind of
-// owner. A family says what is read after the owner, its members which operation of Model they
-// call.
+// The commands that attach attributes and comments: five families, each with a member for each kind
+// of owner. The template of a family reads what follows the owner; a member is an instance of it
+// with the operation of Model that it calls. So the grammar of a family is in one place.
 
 namespace Vesk_Hdl::Commands {
 
 using Text = Basis::StringBase<char>;
 
-// The owners. Each reads its tokens and calls an operation of Model that takes its names first.
+// The owners. Each reads TOKENS tokens and calls an operation of Model that takes its names first.
 
-/// The module is not named.
+/// The module, which a line does not name.
 struct ModuleOwner {
     static constexpr int TOKENS = 0;
     bool Parse(Text const &) { return true; }
@@ -42,7 +42,7 @@ struct NamedOwner {
     Text name;
 };
 
-/// A pin of a component or an instance, HOLDER.PIN.
+/// A pin of a component or an instance, HOLDER.PIN in one token.
 struct PinOwner {
     static constexpr int TOKENS = 1;
     bool Parse(Text const &token) { return SplitPinReference(token.View(), holder, pin); }
@@ -54,7 +54,7 @@ struct PinOwner {
     std::string pin;
 };
 
-/// If the token begins with the prefix, in any case, the rest of it goes into `rest`.
+/// Whether a token begins with a prefix, in any case. The rest of it is then in `rest`.
 inline bool TakePrefixed(Text const &token, char const *prefix, Text &rest) {
     Text pattern(prefix);
     unsigned int const length = pattern.GetLength();
@@ -65,7 +65,8 @@ inline bool TakePrefixed(Text const &token, char const *prefix, Text &rest) {
     return true;
 }
 
-/// owner [-TYPE=type] attribute [value]
+/// owner [-TYPE=type] attribute [value]. The type is not checked here: Model refuses an unknown
+/// one.
 template <class Owner, auto OPERATION> struct AddAttr {
     Owner owner;
     Text attrType;
@@ -80,10 +81,10 @@ template <class Owner, auto OPERATION> struct AddAttr {
         if (!owner.Parse(tokens.At(first)))
             return false;
         if (TakePrefixed(tokens.At(next), Vocabulary::TYPE.prefix, attrType))
-            ++next; // what follows is one token further on
+            ++next; // the option moves all tokens after it by one
         attrName = tokens.At(next);
         value = tokens.At(next + 1);
-        return tokens.GetSize() >= next + 1;
+        return tokens.GetSize() >= next + 1; // with the option a name must still follow it
     }
     void Run(Model &model) const { owner.Call(model, OPERATION, attrName, value, attrType); }
 };
@@ -145,8 +146,9 @@ using SetInstancePinAttrUserTypeCommand =
     CommandOf<"SET INSTANCE PIN ATTRIBUTE USERTYPE",
               SetAttr<PinOwner, &Model::SetInstancePinUserType>>;
 
-/// owner attribute setting [setting], a setting being -GENERIC=word or -SYNATTR=word. Required: the
-/// generic option is set first, whatever the order on the line.
+/// owner attribute setting [setting], where a setting is -GENERIC=word or -SYNATTR=word. Required:
+/// the generic option is set first, whatever the order on the line, and stays if the other one is
+/// then refused.
 template <class Owner, auto SET_GENERIC, auto SET_SYNATTR> struct SetAttrOption {
     Owner owner;
     Text attrName;
@@ -201,7 +203,8 @@ using SetInstancePinAttrOptionCommand =
               SetAttrOption<PinOwner, &Model::SetInstancePinGenericAttrValue,
                             &Model::SetInstancePinSynAttrValue>>;
 
-/// owner text...
+/// owner text... Required: the words are joined by single blanks, so that a comment loses its
+/// quotes.
 template <class Owner, auto OPERATION> struct AddComment {
     Owner owner;
     Text text;

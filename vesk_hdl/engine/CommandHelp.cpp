@@ -1,3 +1,6 @@
+// The help of the commands. It is made from the same table that registers them, so that it cannot
+// miss one.
+
 #include "vesk_hdl/engine/CommandHelp.h"
 
 #include <deque>
@@ -24,8 +27,8 @@ constexpr Vocabulary::Choice UPPERCASE_CHOICES[] = {{"", Vocabulary::UPPERCASE_N
 constexpr Vocabulary::Choice LOWERCASE_CHOICES[] = {{"", Vocabulary::LOWERCASE_NAMES}};
 constexpr Vocabulary::Choice WRITE_CHOICES[] = {{"", Vocabulary::WRITE_OPTIONS}};
 
-/// By ArgumentKind. A word of "" means that the choices themselves are shown, and "{words}" in a
-/// meaning is their list.
+/// The description of each kind, by ArgumentKind. With a word of "" the grammar shows the choices
+/// themselves; "{words}" in a meaning is replaced by their list.
 constexpr ArgumentHelp ARGUMENTS[] = {
     {},
     {"attribute", "the name of an attribute"},
@@ -51,7 +54,9 @@ constexpr ArgumentHelp ARGUMENTS[] = {
     {"option", "{words}", WRITE_CHOICES}};
 static_assert(std::size(ARGUMENTS) == ARGUMENT_KINDS);
 
-/// The help of all commands, built from the table at the first use.
+/// The help of all commands. It is built from the table at the first use, since only the tool and
+/// clients with a user interface need it. The texts that are put together are kept here as long as
+/// the library is loaded.
 class Reference {
 public:
     Reference() {
@@ -82,9 +87,10 @@ public:
 private:
     using Insertions = std::initializer_list<std::pair<std::string_view, std::string_view>>;
 
+    /// Keeps a text for good. A deque never moves what it holds.
     char const *Keep(std::string text) { return texts.emplace_back(std::move(text)).c_str(); }
 
-    /// The text with each name in braces replaced by what goes there.
+    /// The text in which each name in braces is replaced; the text itself if it has none.
     char const *Fill(char const *text, Insertions insertions) {
         std::string filled(text);
         for (auto const &[name, insertion] : insertions)
@@ -93,6 +99,7 @@ private:
         return filled == text ? text : Keep(std::move(filled));
     }
 
+    /// The words of choices as a list, each with the prefix of its choice before the first word.
     static std::string List(std::span<Vocabulary::Choice const> choices, char const *comma,
                             char const *last, char const *between) {
         std::string list;
@@ -135,7 +142,8 @@ private:
         return help;
     }
 
-    /// Optional arguments in a row are nested: the later one needs the earlier one.
+    /// Brackets of optional arguments in a row are nested, since the later one needs the earlier
+    /// one.
     std::string GrammarOf(std::span<Argument const> list) const {
         std::string grammar;
         int open = 0;
@@ -162,6 +170,7 @@ private:
     std::vector<CommandHelp> commands;
 };
 
+/// The one reference of the process.
 Reference const &TheReference() {
     static Reference const reference;
     return reference;

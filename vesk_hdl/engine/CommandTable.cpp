@@ -1,3 +1,6 @@
+// The table of commands: one row for each, with its class, its arguments and its help. What a
+// command reads and does is in the header of its family.
+
 #include "vesk_hdl/engine/CommandTable.h"
 
 #include <algorithm>
@@ -16,15 +19,18 @@ namespace {
 using namespace Commands;
 using enum ArgumentKind;
 
+// Short forms for the rows.
+
 constexpr Argument Optional(ArgumentKind kind) { return {.kind = kind, .optional = true}; }
 constexpr Argument New(ArgumentKind kind) { return {.kind = kind, .declares = true}; }
 constexpr Argument Either(ArgumentKind kind, ArgumentKind other) {
     return {.kind = kind, .alternative = other};
 }
 
+/// The creator of a command class. The tokens are read by ParseArguments.
 template <class C> Command *Create(Model *model, StringArray const &) { return new C(model); }
 
-/// A row of the table. The class brings its keyword.
+/// A row of the table. The keyword is that of the class.
 template <class C>
 constexpr CommandSpec Row(std::initializer_list<Argument> arguments, CommandTexts texts,
                           CommandOwner const *owner = nullptr) {
@@ -33,7 +39,8 @@ constexpr CommandSpec Row(std::initializer_list<Argument> arguments, CommandText
     return spec;
 }
 
-// Comments and attributes are five families of commands for six owners.
+// Comments and attributes are five families of commands for six kinds of owners. The texts of a
+// family are written once, and those of an owner are filled in.
 
 constexpr CommandOwner DESIGN = {NONE, "MODULE", "the design", "", "", ""};
 constexpr CommandOwner COMPONENT_OWNER = {
@@ -53,7 +60,7 @@ constexpr CommandOwner INSTANCE_PIN_OWNER = {
     INSTANCE_PIN, "INSTANCE PIN",      "a pin of an instance", "an unknown instance or pin; ",
     "U1.I0 ",     INSTANCE_OWNER.lines};
 
-/// What the members of a family share; their arguments follow the owner's.
+/// What the members of a family have in common. Their arguments follow that of the owner.
 struct Family {
     std::initializer_list<Argument> arguments;
     CommandTexts texts;
@@ -116,6 +123,7 @@ constexpr Family SET_OPTION = {
      .wrong = "{keyword} {name}WIDTH -GENERIC=YES",
      .message = "Invalid generic value."}};
 
+/// Required: the order of the rows is that of registration.
 constexpr CommandSpec COMMANDS[] = {
     Row<NoOperationCommand>(
         {}, {.summary = "Does nothing.", .notes = "It takes any arguments.", .example = "NOOP"}),
@@ -208,6 +216,8 @@ constexpr CommandSpec COMMANDS[] = {
          .refused = "a missing word",
          .example = "SET SYNTHESIS SYNPLICITY",
          .wrong = "SET SYNTHESIS"}),
+    // The words of these two commands differ, see Vocabulary::UPPERCASE_NAMES. The help says so,
+    // since it looks like a mistake of the user.
     Row<UppercaseCommand>(
         {{UPPERCASE_NAMES}},
         {.summary = "Writes names of one kind in upper case, in Verilog.",
@@ -265,6 +275,8 @@ constexpr CommandSpec COMMANDS[] = {
         {}, {.summary = "Writes a port a line.",
              .notes = "It is so from the beginning, and no command turns it off.",
              .example = "SET PORT ONEPERLINE"}),
+
+    // The families, each with its members in one order of owners.
 
     Member<AddModuleCommentCommand>(DESIGN, COMMENT),
     Member<AddComponentCommentCommand>(COMPONENT_OWNER, COMMENT),

@@ -7,8 +7,9 @@
 #include "vesk_hdl/model/HdlModel.h"
 #include "vesk_hdl/netlist/Signal.h"
 
-// The commands that declare and connect a design. Each reads its tokens by index and calls one
-// operation of Model. Tokens after the last one that it reads are ignored.
+// The commands that declare and connect a design. Each reads its tokens by index, where a missing
+// one reads as empty, and calls one operation of Model, which refuses what is wrong with the
+// design. Required: tokens after the last one that it reads are ignored.
 
 namespace Vesk_Hdl::Commands {
 
@@ -25,7 +26,7 @@ public:
     char const *GetKeyword() const override { return KEYWORD; }
 };
 
-/// name
+/// name, which must not be empty.
 template <auto OPERATION> struct SetName {
     Text name;
 
@@ -39,7 +40,8 @@ using SetNetlistNameCommand = CommandOf<"SET NETLIST NAME", SetName<&Model::SetN
 using SetSourceFileCommand = CommandOf<"SET SOURCE FILE", SetName<&Model::SetSourceFileName>>;
 using AddComponentCommand = CommandOf<"ADD COMPONENT", SetName<&Model::AddComponent>>;
 
-/// component pin polarity [value]
+/// component pin polarity [value]. Required: the component comes first on the line, and last in
+/// Model.
 struct AddPin {
     Text componentName;
     Text pinName;
@@ -73,7 +75,7 @@ struct AddInstance {
 };
 using AddInstanceCommand = CommandOf<"ADD INSTANCE", AddInstance>;
 
-/// signal polarity
+/// signal polarity. The one command that makes a port.
 struct AddPort {
     Text name;
     Polarity polarity;
@@ -92,7 +94,8 @@ struct AddPort {
 };
 using AddPortCommand = CommandOf<"ADD PORT", AddPort>;
 
-/// signal [polarity]. Required: the polarity is checked and dropped, and the signal is no port.
+/// signal [polarity]. Required: the polarity is checked and has no effect, and the signal is no
+/// port.
 struct AddSignal {
     Text name;
 
@@ -106,7 +109,8 @@ struct AddSignal {
 };
 using AddSignalCommand = CommandOf<"ADD SIGNAL", AddSignal>;
 
-/// A signal, or a pin of an instance.
+/// What a line connects or ties: a signal, or a pin of an instance. A name without a point is
+/// always a signal.
 struct Target {
     Text signal;
     std::string instance;

@@ -1,3 +1,5 @@
+// How a line becomes a command: the factory finds it by keyword, the manager runs and keeps it.
+
 #include "vesk_hdl/engine/HdlCmd.h"
 
 #include <atomic>
@@ -23,13 +25,14 @@ Model &Command::RequireModel() const {
     return *commandModel;
 }
 
+/// The table of keywords and the number of factories that share it.
 struct CommandFactory::Record {
     KeywordTree keywords;
     std::atomic<unsigned int> owners{1};
 };
 
 CommandFactory::CommandFactory() : record(nullptr) {
-    auto made = std::make_unique<Record>(); // owned here until all commands are known
+    auto made = std::make_unique<Record>(); // freed if a registration runs out of memory
     for (CommandSpec const &spec : CommandTable())
         made->keywords.Add(spec.keyword, spec.create);
     record = made.release();
@@ -44,6 +47,7 @@ CommandFactory::CommandFactory(CommandFactory const &other) : record(other.recor
     ++record->owners;
 }
 
+/// Required: both factories share one table afterwards. It is counted, so that it is freed once.
 CommandFactory &CommandFactory::operator=(CommandFactory const &other) {
     CommandFactory shared(other);
     std::swap(record, shared.record);
@@ -54,19 +58,20 @@ void CommandFactory::AddCommandCreator(char const *keyword, CommandCreator creat
     AddCommandCreator(StringArray(keyword, " ", true, nullptr), creator);
 }
 
+/// Required: of two creators of one keyword the newer one wins.
 void CommandFactory::AddCommandCreator(StringArray const &words, CommandCreator creator) {
     record->keywords.Add(words.Concatenate(" ").View(), creator);
 }
 
-/// Every beginning of the line is looked up and the last hit wins. The walk ends where no keyword
-/// goes on as the line does, for nothing longer can match.
+/// Looks up each beginning of the line, and the last one that is a keyword wins. The walk ends at
+/// the first word that continues no keyword, since nothing longer can match.
 CommandCreator CommandFactory::GetCommandCreator(StringArray const &tokens) const {
-    KeywordTree::Place const *place = &record->keywords.GetRoot();
+    KeywordTree::Node const *node = &record->keywords.GetRoot();
     CommandCreator found = nullptr;
-    for (int i = 0; place && i < tokens.GetSize(); ++i) {
-        place = record->keywords.Follow(*place, tokens.At(i).View());
-        if (place && place->GetCreator())
-            found = place->GetCreator();
+    for (int i = 0; node && i < tokens.GetSize(); ++i) {
+        node = record->keywords.Follow(*node, tokens.At(i).View());
+        if (node && node->GetCreator())
+            found = node->GetCreator();
     }
     return found;
 }
@@ -103,13 +108,15 @@ bool CommandManager::CreateAndExecute(StringArray const &tokens, Model *model,
             RAISE(Messages::INVALID_ARGUMENTS, command->GetKeyword());
         command->Execute();
         record->done.emplace_back(command);
-    } catch (Exception const &refusal) {
+    } catch (Exception const &refusal) { // a refusal: the command ends here
         std::unique_ptr<Command> const failed(command);
-        throw Exception(refusal); // required: a new Exception, also of a class derived from it
-    } catch (std::bad_alloc const &) {
+        throw Exception(refusal);      // required: a new Exception, also of a class derived from it
+    } catch (std::bad_alloc const &) { // no client threw this, and none holds the command
         delete command;
         throw;
     }
+    // Anything else that a client's command throws passes through and leaves the command alone:
+    // required, since the client may still hold it.
     return true;
 }
 

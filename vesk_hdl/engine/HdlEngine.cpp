@@ -1,3 +1,5 @@
+// The class Engine: its models, and how a line reaches one of them.
+
 #include "vesk_hdl/engine/HdlEngine.h"
 
 #include "vesk_hdl/engine/Keywords.h"
@@ -11,9 +13,9 @@ namespace Vesk_Hdl {
 using Basis::StringBase;
 
 struct Engine::Record {
-    CommandFactory factory; ///< outlives the models, which point at it
-    ModelIndex index;       ///< outlives them, too: they count their renames there
-    OwnPtrArray<Model *> models;
+    CommandFactory factory;      ///< declared before the models, which point at it
+    ModelIndex index;            ///< likewise: the models count their renames in it
+    OwnPtrArray<Model *> models; ///< in order of addition
     Model *currentModel = nullptr;
 };
 
@@ -28,10 +30,10 @@ bool Engine::CreateAndAddModel(char const *name, char const *sourceFileName) {
     if (GetModel(name))
         return false;
     std::unique_ptr<Model> model(record->factory.CreateModel());
-    model->SetName(name ? name : "");
+    model->SetName(name ? name : ""); // null would mean the default name
     model->SetSourceFileName(sourceFileName);
     record->models.Add(model.get());
-    record->index.Add(*model.release());
+    record->index.Add(*model.release()); // owned by the array now, whatever the index does
     return true;
 }
 
@@ -43,6 +45,7 @@ bool Engine::UseModel(char const *name) {
     return true;
 }
 
+/// The index is asked while the model still has its name.
 bool Engine::RemoveModel(char const *name) {
     Model *const model = GetModel(name);
     if (!model)
@@ -57,6 +60,7 @@ bool Engine::RemoveModel(char const *name) {
 
 namespace {
 
+/// Runs a line. Required: without a model even an empty line is refused.
 void ExecuteOn(Model *model, char const *line) {
     if (!model)
         VESK_HDL_RAISE("HdlEngine", Messages::MISSING_MODEL);
@@ -72,7 +76,7 @@ void Engine::Execute(char const *modelName, char const *line) {
 }
 
 bool Engine::ReadCommandFile(char const *modelName, char const *fileName) {
-    if (!GetModel(modelName))
+    if (!GetModel(modelName)) // required: also if the file turns out to be unreadable
         CreateAndAddModel(modelName, fileName);
     return GetModel(modelName)->Read(fileName);
 }
@@ -82,9 +86,12 @@ bool Engine::WriteCommandFile(char const *modelName, char const *fileName) {
     return model && model->Write(fileName);
 }
 
+// The two languages treat case differently, so that the two tests do.
+
 bool Engine::IsVhdlKeyword(char const *word) { return VhdlKeywords().IContains(word); }
 bool Engine::IsVerilogKeyword(char const *word) { return VerilogKeywords().Contains(word); }
 
+/// Required: a file that cannot be opened is no failure; its text is dropped.
 void Engine::WriteOrvaneHeader(char const *application, char const *command, char const *designName,
                                char const *device, char const *purpose, char const *reference,
                                bool isVhdl, char const *fileName) {

@@ -4,8 +4,8 @@
 
 namespace Vesk_Hdl {
 
-/// The tokens from an index to the last, with single blanks between them. What the tokenizer took
-/// away, quotes and runs of blanks, does not come back.
+/// The tokens from an index to the last one, with single blanks between them. Quotes and runs of
+/// blanks, which the tokenizer removed, do not come back: required.
 inline Basis::StringBase<char> JoinTokens(StringArray const &tokens, int first) {
     Basis::StringBase<char> joined;
     for (int i = first; i < tokens.GetSize(); ++i) {

@@ -11,22 +11,23 @@
 
 namespace Vesk_Hdl {
 
-/// Keywords as ways through a tree of words, which match in any case.
+/// Keywords as paths through a tree of words, which match in any case. A line is compared with a
+/// dozen words; a map of keywords would hash each beginning of the line.
 class KeywordTree {
 public:
-    /// What is reached by the words of the beginning of a line.
-    class Place {
+    /// A node of the tree, which the words at the beginning of a line lead to.
+    class Node {
     public:
-        /// Of the keyword that ends here; null if none does.
+        /// The creator of the keyword that ends here; null if none does.
         CommandCreator GetCreator() const { return creator; }
 
     private:
         friend class KeywordTree;
         struct Step {
             std::string word;
-            Place *place; ///< after the word
+            Node *node; ///< where the word leads
         };
-        /// The length first: most words differ in it.
+        /// Compares the lengths first, in which most words differ.
         struct Less {
             using is_transparent = void;
             bool operator()(std::string_view a, std::string_view b) const {
@@ -36,19 +37,20 @@ public:
         };
 
         CommandCreator creator = nullptr;
-        std::vector<Step> next; ///< at most MAX_SCANNED
-        std::map<std::string, Place *, Less> more;
+        std::vector<Step> next;                   ///< the first MAX_SCANNED words that may follow
+        std::map<std::string, Node *, Less> more; ///< those of clients who register thousands
     };
 
-    /// In front of all words.
-    Place const &GetRoot() const { return root; }
+    /// The node before the first word.
+    Node const &GetRoot() const { return root; }
 
-    /// The place after all words of a token; a quoted token may hold several. Null if no keyword
-    /// continues like this.
-    Place const *Follow(Place const &place, std::string_view token) const {
-        Place const *at = &place;
+    /// The node that the words of a token lead to, null if no keyword continues with them. A
+    /// quoted token may hold several words. Required: words are compared and not tokens.
+    Node const *Follow(Node const &node, std::string_view token) const {
+        Node const *at = &node;
         while (at) {
-            Place const *const found = Find(*at, token);
+            // The whole token is tried first: few tokens have a blank.
+            Node const *const found = Find(*at, token);
             std::size_t const blank = found ? token.npos : token.find(' ');
             if (blank == token.npos)
                 return found;
@@ -60,41 +62,41 @@ public:
 
     /// Adds a keyword, or replaces the creator of one that is known. Single blanks separate words.
     void Add(std::string_view keyword, CommandCreator creator) {
-        Place *place = &root;
+        Node *node = &root;
         for (std::size_t blank = keyword.find(' '); blank != keyword.npos;
              blank = keyword.find(' ')) {
-            place = &Enter(*place, keyword.substr(0, blank));
+            node = &Enter(*node, keyword.substr(0, blank));
             keyword.remove_prefix(blank + 1);
         }
-        Enter(*place, keyword).creator = creator;
+        Enter(*node, keyword).creator = creator;
     }
 
 private:
     /// Scanning this many words is faster than a search; the library's keywords need no more.
     static constexpr std::size_t MAX_SCANNED = 16;
 
-    static Place *Find(Place const &place, std::string_view word) {
-        for (Place::Step const &step : place.next)
+    static Node *Find(Node const &node, std::string_view word) {
+        for (Node::Step const &step : node.next)
             if (Basis::Ascii::EqualIgnoringCase(step.word, word))
-                return step.place;
-        if (place.more.empty())
+                return step.node;
+        if (node.more.empty())
             return nullptr;
-        auto const found = place.more.find(word);
-        return found == place.more.end() ? nullptr : found->second;
+        auto const found = node.more.find(word);
+        return found == node.more.end() ? nullptr : found->second;
     }
-    Place &Enter(Place &place, std::string_view word) {
-        if (Place *const found = Find(place, word))
+    Node &Enter(Node &node, std::string_view word) {
+        if (Node *const found = Find(node, word))
             return *found;
-        Place &made = places.emplace_back();
-        if (place.next.size() < MAX_SCANNED)
-            place.next.push_back({std::string(word), &made});
+        Node &made = nodes.emplace_back();
+        if (node.next.size() < MAX_SCANNED)
+            node.next.push_back({std::string(word), &made});
         else
-            place.more.emplace(word, &made);
+            node.more.emplace(word, &made);
         return made;
     }
 
-    Place root;
-    std::deque<Place> places; ///< all others; a deque never moves them
+    Node root;
+    std::deque<Node> nodes; ///< all other nodes; a deque never moves them
 };
 
 } // namespace Vesk_Hdl

@@ -1,3 +1,6 @@
+// The reserved words of both languages. Model does not ask for them: a name may be legal in one
+// language only.
+
 #include "vesk_hdl/engine/Keywords.h"
 
 namespace Vesk_Hdl {
@@ -44,6 +47,8 @@ char const *const VERILOG_WORDS[] = {
     "while",   "wire",      "wor",         "xnor",         "xor",
 };
 
+/// A set with these words. It is filled when it is made, so that it can be const and threads can
+/// share it.
 template <std::size_t Count> class KeywordSet : public StringSet {
 public:
     explicit KeywordSet(char const *const (&words)[Count]) {

@@ -7,9 +7,9 @@
 
 namespace Vesk_Hdl {
 
-/// Finds the first model of a name, in any case, among those of an engine, as a walk over them
-/// does. Clients may rename models without a word to the engine: each model counts its renames
-/// here, and the index is then made anew at the next question.
+/// Finds the first model of a name, in any case, among those of an engine: the result is that of a
+/// walk over them. Clients may rename a model without the engine knowing. So each model counts its
+/// renames here, and after one the index is made anew at the next question.
 class ModelIndex {
 public:
     Model *Find(PtrArray<Model *> const &models, char const *name) {
@@ -25,18 +25,18 @@ public:
         TextIndex::Node const *const found = index.Find(wanted.View());
         return found ? static_cast<Model *>(found->value) : nullptr;
     }
-    /// A model of a name that no other has.
+    /// Adds a model whose name no other has.
     void Add(Model &model) {
         NetlistEdit(*model.GetNetlist()).CountRenames(renames);
         index.Put(NameOf(model), &model);
     }
-    /// A model that is going to be deleted. Another one of its name may be found instead.
+    /// Removes a model that is about to be deleted. Another one of its name may then be the first.
     void Remove(Model const &model) {
         TextIndex::Node const *const found = index.Find(NameOf(model).View());
         if (found && found->value == &model && !hasEqualNames)
             index.Remove(NameOf(model).View());
         else
-            ++renames;
+            ++renames; // have the index made anew
     }
 
 private:
@@ -59,8 +59,8 @@ private:
     }
 
     TextIndex index{TextIndex::CASE_IGNORED};
-    unsigned long renames = 0;        ///< of all models so far
-    unsigned long indexedRenames = 0; ///< when the index was made
+    unsigned long renames = 0;        ///< how often models were renamed so far
+    unsigned long indexedRenames = 0; ///< that number when the index was made
     bool hasEqualNames = false;       ///< only clients give two models one name
 };
 

@@ -1,3 +1,6 @@
+// The life of a Model, its identity, and how it runs lines. The operations that commands call are
+// in model/. This part is here because it uses commands, which model/ does not know.
+
 #include <memory>
 #include <utility>
 
@@ -11,9 +14,8 @@ namespace Vesk_Hdl {
 
 using Basis::StringBase;
 
-// The life of a Model and how it runs lines. The operations that lines call are in model/.
-
-/// Members die in reverse order: the done commands, the options, the netlist.
+/// Members end in reverse order: the done commands, the options, the netlist. Commands of a client
+/// may use the model in their destructors.
 struct Model::Record {
     explicit Record(CommandFactory *factory) : netlist(nullptr), commandFactory(factory) {}
 
@@ -24,7 +26,7 @@ struct Model::Record {
     HdlOptions options;
     CommandManager commandManager;
     CommandFactory *commandFactory;
-    std::unique_ptr<StringArray> spareTokens;
+    std::unique_ptr<StringArray> spareTokens; ///< of the last line; null while a line runs
 };
 
 Model::Model(CommandFactory *factory) : record(std::make_unique<Record>(factory)) {}
@@ -49,7 +51,8 @@ bool Model::Execute(StringArray const &tokens) {
            record->commandManager.CreateAndExecute(tokens, this, record->commandFactory);
 }
 
-/// The tokens of a line serve for the next one; a line that a command runs meanwhile makes its own.
+/// The array of tokens is kept for the next line, which uses its memory again. A command of a
+/// client may run another line on this model: that one finds none and makes its own.
 bool Model::Execute(char const *line) {
     std::unique_ptr<StringArray> tokens = std::move(record->spareTokens);
     if (!tokens)
@@ -60,8 +63,8 @@ bool Model::Execute(char const *line) {
     return result;
 }
 
-/// The stream is never closed here, and need not be: a stream opened for reading holds the text and
-/// no descriptor, so that none piles up, whether the lines run to the end or one of them fails.
+/// Required: the file is not closed here. It need not be: a stream for reading holds the text and
+/// no descriptor, so that none leaks, whether the lines run to the end or one of them is refused.
 bool Model::Read(char const *fileName) {
     std::unique_ptr<Basis::Stream> const file(
         Basis::File::open(fileName, Basis::Stream::ACCESS_READ, true));
@@ -75,6 +78,7 @@ bool Model::Read(char const *fileName) {
     return result;
 }
 
+/// Required: there is no writer of command files, and the design counts as saved.
 bool Model::Write(char const *) {
     record->modified = false;
     return true;

@@ -6,8 +6,9 @@
 #include "vesk_hdl/model/HdlOptions.h"
 #include "vesk_hdl/netlist/Vocabulary.h"
 
-// The commands that fill the model's HdlOptions and do nothing else. A family says what is read,
-// its members which field they fill. Tokens after the last one that is read are ignored.
+// The commands that set a field of the model's HdlOptions and do nothing else: IsModified does not
+// change. The template of a family reads the tokens; a member is an instance of it with the field
+// that it sets. Required: tokens after the last one that is read are ignored.
 
 namespace Vesk_Hdl::Commands {
 
@@ -16,7 +17,7 @@ using Options = HdlOptions;
 using Vhdl = HdlOptions::VhdlOption;
 using Verilog = HdlOptions::VerilogOption;
 
-// A field, whichever part of the model's options it is in.
+// A field of the model's options, whichever part of them it is in.
 template <class T> T &FieldOf(Model &model, T Options::*field) {
     return model.GetOptions()->*field;
 }
@@ -27,7 +28,7 @@ template <class T> T &FieldOf(Model &model, T Verilog::*field) {
     return model.GetOptions()->verilogOption.*field;
 }
 
-/// Nothing is read, and the flag becomes true.
+/// Reads nothing and sets the flag to true. Required: no command sets it to false.
 template <auto FIELD> struct TurnOn {
     bool Parse(StringArray const &, int) { return true; }
     void Run(Model &model) const { FieldOf(model, FIELD) = true; }
@@ -35,7 +36,7 @@ template <auto FIELD> struct TurnOn {
 using SetPortOnePerLineCommand = CommandOf<"SET PORT ONEPERLINE", TurnOn<&Options::portOnePerLine>>;
 using UseAttrTypeCommand = CommandOf<"Use AttrType", TurnOn<&Vhdl::useAttrType>>;
 
-/// [flag]. Required: "false" in any case is false, and anything else is true, also no word at all.
+/// [flag]. Required: "false" in any case is false, and anything else is true, also a missing word.
 template <auto FIELD> struct SetFlag {
     bool flag = true;
 
@@ -53,7 +54,7 @@ using SuppressComponentCommand = CommandOf<"SUPPRESS COMPONENT", SetFlag<&Vhdl::
 using UseDefaultLibraryCommand =
     CommandOf<"USE DEFAULT LIBRARY", SetFlag<&Vhdl::useDefaultLibrary>>;
 
-/// One word that may not be empty.
+/// One word, which must not be empty.
 struct OneWord {
     Text word;
 
@@ -63,14 +64,14 @@ struct OneWord {
     }
 };
 
-/// name
+/// name, which replaces the field.
 template <auto FIELD> struct SetWord : OneWord {
     void Run(Model &model) const { FieldOf(model, FIELD) = word; }
 };
 using SetApplicationCommand = CommandOf<"Set Application", SetWord<&Options::application>>;
 using SetDeviceCommand = CommandOf<"Set Device", SetWord<&Options::device>>;
 
-/// library, or file
+/// library, or file, which is appended to a list. Required: duplicates are not looked for.
 template <auto FIELD> struct AddWord : OneWord {
     void Run(Model &model) const { FieldOf(model, FIELD).Add(word); }
 };
@@ -78,13 +79,13 @@ using AddLibraryCommand = CommandOf<"ADD LIBRARY", AddWord<&Vhdl::libraries>>;
 using AddUseLibraryCommand = CommandOf<"ADD USE LIBRARY", AddWord<&Vhdl::useLibraries>>;
 using AddIncludeCommand = CommandOf<"ADD INCLUDE", AddWord<&Verilog::includes>>;
 
-/// tool
+/// tool. Required: any word is accepted, and an unknown one means the first tool.
 struct SetSynthesis : OneWord {
     void Run(Model &model) const { model.GetOptions()->verilogOption.SetSynthesisType(word); }
 };
 using SetSynthesisCommand = CommandOf<"SET SYNTHESIS", SetSynthesis>;
 
-/// text...
+/// text... Required: all words to the end of the line, joined by single blanks.
 template <auto FIELD> struct SetText {
     Text text;
 
@@ -98,7 +99,8 @@ using SetCommandStrCommand = CommandOf<"Set Command", SetText<&Options::commandS
 using SetPurposeCommand = CommandOf<"Set Purpose", SetText<&Options::purpose>>;
 using SetReferenceCommand = CommandOf<"Set Reference", SetText<&Options::reference>>;
 
-/// The word for whose names are written in that case.
+/// The word for the kind of names that are written in that case. Required: the two commands have
+/// different words for signals, see Vocabulary::UPPERCASE_NAMES.
 template <Verilog::CaseType CASE, auto const &WORDS> struct SetCase {
     int which = 0;
 

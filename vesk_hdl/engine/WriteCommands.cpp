@@ -1,3 +1,6 @@
+// The write commands. Their arguments are read in an odd way that is required, see
+// WriteArguments::Parse.
+
 #include "vesk_hdl/engine/WriteCommands.h"
 
 #include <cerrno>
@@ -17,17 +20,18 @@ namespace Vesk_Hdl::Commands {
 
 namespace {
 
-/// Thrown where text fails to reach the file, so that the writers do not go on for nothing. One
-/// statement may hold a port map of 2^31 bits: no check between statements would do.
+/// Thrown inside a writer when text cannot reach the file, to end the generation of more. A test
+/// between statements would not do: one statement may have a port map of 2^31 bits.
 struct TextIsLost {};
 
-/// The file of a write command, from the opening to the report to the opener.
+/// The file of a write command, from its opening to the report to the opener. Whatever ends the
+/// command, the file is closed and Finish called once.
 class CommandFile : private Basis::Stream::Guard {
 public:
     CommandFile(Model &model, WriteArguments const &arguments)
         : opener(model.GetWriteOpener()), stream(arguments.fileName) {
         status.fileName = arguments.fileName;
-        status.error = ECANCELED; // until the text is written
+        status.error = ECANCELED; // what the opener sees if an exception ends the command
         stream.SetGuard(this);
         if (opener)
             Adopt(opener->Open(arguments.fileName, arguments.append));
@@ -39,13 +43,14 @@ public:
     ~CommandFile() override {
         try {
             stream.Close();
-        } catch (std::bad_alloc const &) { // as what ends the command, most likely
+        } catch (std::bad_alloc const &) { // a destructor must not throw
         }
         Finish();
     }
 
-    /// Calls `write` with the stream; what it throws passes on, but not TextIsLost. The netlist is
-    /// rewritten before the first text is written, so that it is the same after a failed write.
+    /// Calls `write` with the stream, closes the file and reports. Exceptions of `write` pass
+    /// through, but TextIsLost ends here: a file that cannot be written is no refusal. The netlist
+    /// is rewritten before the first text, so that it is the same after a failed write.
     template <class Write> WriteStatus const &Run(Write write) {
         try {
             generating = true;
@@ -64,6 +69,7 @@ public:
 
 private:
     int Allow(std::size_t bytes) override { return opener ? opener->Allow(bytes) : 0; }
+    /// Closing may fail, too, and must not throw: only a writer is interrupted.
     void Failed() override {
         if (generating)
             throw TextIsLost();
@@ -73,7 +79,7 @@ private:
         try {
             stream.Adopt(descriptor);
         } catch (...) {
-            ::close(descriptor);
+            ::close(descriptor); // the stream did not get it
             Finish();
             throw;
         }
@@ -83,14 +89,14 @@ private:
             asked->Finish(status);
     }
 
-    WriteOpener *opener; ///< null when there is none, or none to report to any more
+    WriteOpener *opener; ///< null if there is none, and after Finish
     TextFileOutStream stream;
     WriteStatus status;
-    bool generating = false;
+    bool generating = false; ///< a writer is running
 };
 
-/// Writes the model's netlist. A file that cannot be written raises nothing: the model remembers
-/// what became of the write.
+/// Writes the model's netlist. Required: a file that cannot be written raises nothing. Clients ask
+/// Model::GetLastWrite.
 template <class Write>
 void WriteFile(Model &model, WriteArguments const &arguments, Write writeNetlist) {
     CommandFile file(model, arguments);

@@ -2,7 +2,7 @@
 
 #include "vesk_hdl/engine/CommandOf.h"
 
-// The commands that write a file: they open it, say whether it gets a header, and hand netlist and
+// The commands that write a file: they open it, set the option for the header, and pass netlist and
 // options to a writer.
 
 namespace Vesk_Hdl::Commands {
@@ -13,16 +13,19 @@ struct WriteArguments {
     bool append = false;
     bool writeHeader = true;
 
-    /// Required: the number of tokens alone decides which one is the file name. With more than two
-    /// tokens in front of it, none of them is an option, and the first one is the file name.
+    /// Required: the number of tokens alone decides which one is the file name, the second of two
+    /// and the third of three. With four or more tokens none is an option, and the first one is the
+    /// file name.
     bool Parse(StringArray const &tokens, int first);
 };
 
+/// Writes Verilog.
 struct WriteVerilog : WriteArguments {
     void Run(Model &model) const;
 };
 using WriteVerilogCommand = CommandOf<"WRITE VERILOG", WriteVerilog>;
 
+/// Writes VHDL.
 struct WriteVhdl : WriteArguments {
     void Run(Model &model) const;
 };

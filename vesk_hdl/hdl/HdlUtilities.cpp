@@ -1,3 +1,5 @@
+// Helpers of both writers.
+
 #include "vesk_hdl/hdl/HdlUtilities.h"
 
 #include "vesk_hdl/hdl/NetlistHeader.h"
@@ -13,6 +15,7 @@ using Text = Basis::StringBase<char>;
 
 namespace {
 
+/// MM/DD/YYYY hh:mm:ss.
 Text Join(TP_TIMESTAMP const &stamp) {
     Text text = stamp.getTimeStampMonthNumber();
     text += '/';
@@ -54,8 +57,8 @@ Text HdlUtilities::AddDummySuffix(char const *name) {
 Text HdlUtilities::RemoveQuotes(char const *text) {
     Text bare(text);
     unsigned int const length = bare.GetLength();
-    // The length is that of the given text throughout: once double quotes are gone it points behind
-    // the end, so that single quotes inside double ones stay.
+    // Required: the length is that of the given text for both kinds. Once double quotes are gone it
+    // is past the end, so that single quotes inside double ones stay.
     auto const enclosedIn = [&bare, length](char quote) {
         return length > 0 && length <= bare.GetLength() && bare.GetText()[0] == quote &&
                bare.GetText()[length - 1] == quote;
@@ -67,6 +70,7 @@ Text HdlUtilities::RemoveQuotes(char const *text) {
     return bare;
 }
 
+/// Required: the attributes of the component are not among them.
 StringArray HdlUtilities::GetAttrNames(Instance const *instance) {
     StringArray names;
     if (instance && instance->HasAttrs())

@@ -1,3 +1,5 @@
+// The header of written files.
+
 #include "vesk_hdl/hdl/NetlistHeader.h"
 
 #include "vesk_hdl/hdl/HdlUtilities.h"
@@ -11,8 +13,8 @@ using Text = Basis::StringBase<char>;
 
 namespace {
 
-constexpr int FIRST_COLUMN = 6; ///< behind a comment mark and four blanks
-constexpr int LAST_COLUMN = 79;
+constexpr int FIRST_COLUMN = 6; ///< the columns of a comment mark and four blanks
+constexpr int LAST_COLUMN = 79; ///< no word ends after it, unless it is longer than a line
 
 } // namespace
 
@@ -53,6 +55,7 @@ void NetlistHeader::WriteFields() {
     Put(stream, commentPrefix, EOL);
 }
 
+/// Forty comment marks: 80 columns, which a line may have.
 void NetlistHeader::WriteDivider() {
     for (int i = 0; i < 40; ++i)
         stream << commentPrefix;
@@ -67,7 +70,7 @@ void NetlistHeader::WriteLogo(Text const &applicationText, Text const &fileNameT
     WriteLogo(applicationText, fileNameText, HdlUtilities::CurrentTimeString());
 }
 
-/// The drawing keeps to 16 columns behind the comment mark; the fields begin in column 17.
+/// The drawing takes the 16 columns after the comment mark; the fields begin in column 17.
 void NetlistHeader::WriteLogo(Text const &applicationText, Text const &fileNameText,
                               Text const &timestamp) {
     Text const &P = commentPrefix;
@@ -103,7 +106,7 @@ void NetlistHeader::WritePurpose() {
     WriteSentences(purpose);
 }
 
-/// The title has no colon, unlike that of the purpose; kept as it stands.
+/// Required: the title has no colon, unlike that of the purpose.
 void NetlistHeader::WriteReference() {
     if (reference.IsEmpty())
         return;
@@ -111,7 +114,8 @@ void NetlistHeader::WriteReference() {
     WriteSentences(reference);
 }
 
-/// Every word has a blank behind it but the first line of one that holds line ends.
+/// Writes a word and a blank. A word that holds line ends takes several lines. Required: its first
+/// line has no blank at its end, and the others have one.
 void NetlistHeader::WriteWord(Text const &word, int &column) {
     auto const writePart = [this, &column](Text const &part) {
         Put(stream, part, " ");
@@ -133,7 +137,9 @@ void NetlistHeader::WriteWord(Text const &word, int &column) {
     }
 }
 
-/// Wraps a free text. The test measures a word whole, line ends included.
+/// Wraps a free text at its blanks. Required: a word is measured as a whole, its line ends
+/// included, and the first word is tested as well, so that a very long one leaves an empty comment
+/// line before it.
 void NetlistHeader::WriteSentences(Text const &text) {
     StringArray const words(text, " ", true, nullptr);
     Put(stream, commentPrefix, "    ");

@@ -1,6 +1,7 @@
 #pragma once
 
-/// Marks that keep a synthesis tool away from text for simulation only.
+/// Marks around text for simulation only. Simulators read them as comments; synthesis tools of
+/// several vendors skip what is between them.
 namespace Vesk_Hdl::Translate {
 
 inline constexpr char VHDL_OFF[] = "-- synopsys translate_off";

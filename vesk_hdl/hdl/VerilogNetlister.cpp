@@ -1,6 +1,7 @@
+// The Verilog writer. After the visitor of a pin connection it reads like the file that it writes.
+
 #include "vesk_hdl/hdl/VerilogNetlister.h"
 
-#include <string>
 #include <unordered_map>
 #include <vector>
 
@@ -11,7 +12,6 @@
 #include "vesk_hdl/netlist/CompoundWalk.h"
 #include "vesk_hdl/netlist/Netlist.h"
 #include "vesk_hdl/text/ForEachAhead.h"
-#include "vesk_hdl/text/basis/Ascii.h"
 
 using namespace Vesk_Hdl;
 using Text = Basis::StringBase<char>;
@@ -20,36 +20,24 @@ namespace {
 
 using VerilogOption = HdlOptions::VerilogOption;
 
-/// Separates the items of a list: on one line, or each under the first one.
-class ListSeparator {
-public:
-    ListSeparator(OutStream &out, bool onePerLine, std::size_t column)
-        : stream(out), isOnePerLine(onePerLine), padding(onePerLine ? column : 0, ' ') {}
-    void Next() {
-        if (!first)
-            stream << ", ";
-        if (!first && isOnePerLine)
-            Put(stream, EOL, padding.c_str());
-        first = false;
-    }
+/// Separates ports or pins: on one line, or each in the column of the first one.
+ListSeparator PortSeparator(OutStream &stream, HdlOptions const &options, std::size_t column) {
+    return options.portOnePerLine ? ListSeparator(stream, ", ", column)
+                                  : ListSeparator(stream, ", ");
+}
 
-private:
-    OutStream &stream;
-    bool isOnePerLine;
-    std::string padding;
-    bool first = true;
-};
-
-/// Writes the signal side of a pin connection.
+/// Writes the signal side of a pin connection. A signal that is called "open" leaves the brackets
+/// empty, which is an open pin in Verilog (IEEE 1364-1995, 12.3.4).
 class WriteSignalVisitor : public SignalVisitor {
 public:
     WriteSignalVisitor(OutStream &out, VerilogStatements const &verilog)
         : stream(out), statements(verilog) {}
 
     void VisitScalarSignal(ScalarSignal *signal) override {
-        if (!IsOpen(*signal))
+        if (!IsOpenName(signal->GetNameRef().View()))
             stream << signal->GetNameRef();
     }
+    /// A part-select of one bit, D[3:3], is legal but written as the bit that it is.
     void VisitBus(Bus *bus) override {
         Text name = bus->GetName();
         if (bus->GetWidth() == 1 && Bus::IsBusName(name))
@@ -64,15 +52,16 @@ public:
     }
 
 private:
-    /// {first, second}; nothing for a compound without members.
+    /// {first, second}; nothing for a compound without members, since an empty concatenation is
+    /// illegal.
     class Concatenation {
     public:
         Concatenation(OutStream &out, SignalVisitor &toWrite) : stream(out), members(toWrite) {}
 
         void Enter(CompoundBus const &compound) {
             if (!separators.empty())
-                Separate();
-            separators.push_back("");
+                separators.back().Next();
+            separators.emplace_back(stream, ", ");
             if (compound.GetSize() > 0)
                 stream << "{";
         }
@@ -82,28 +71,20 @@ private:
                 stream << "}";
         }
         void Visit(Signal &member) {
-            Separate();
+            separators.back().Next();
             member.AcceptSignal(members);
         }
 
     private:
-        void Separate() {
-            stream << separators.back();
-            separators.back() = ", ";
-        }
-
         OutStream &stream;
         SignalVisitor &members;
-        std::vector<char const *> separators; ///< of each compound that is open
+        std::vector<ListSeparator> separators; ///< one for each compound of the path
     };
 
-    static bool IsOpen(Signal const &signal) {
-        std::string_view const name = signal.GetNameRef().View();
-        return name.empty() || Basis::Ascii::EqualIgnoringCase(name, "open");
-    }
-
+    /// The brackets are replaced and the bounds not read: required, so that they keep their
+    /// spelling.
     void WriteBracketed(Signal const &signal, Text name) {
-        if (IsOpen(signal))
+        if (IsOpenName(signal.GetNameRef().View()))
             return;
         statements.NormalizeBusName(name);
         stream << name;
@@ -121,11 +102,11 @@ bool IsDeclaredWire(Signal const &signal) {
 
 namespace Vesk_Hdl {
 
-/// The attributes of a component that may be written at its instances. They are collected once: a
-/// component may have many that are never written, and as many instances.
+/// The attributes of a component that may be written at its instances. They are collected once for
+/// each component: one with many attributes that are never written may have as many instances.
 struct VerilogNetlister::ComponentAttrs {
-    PtrArray<Attribute *> synthesis; ///< of each name the first, if it is written
-    PtrArray<Attribute *> generics;  ///< and INIT, which a macro hands on in any case
+    PtrArray<Attribute *> synthesis; ///< the first attribute of each name, if it is written
+    PtrArray<Attribute *> generics; ///< the generics, and INIT, which a macro passes on in any case
 
     explicit ComponentAttrs(Component const *component) {
         if (!component || !component->HasAttrs())
@@ -151,7 +132,7 @@ void VerilogNetlister::WriteNetlist(Netlist *netlist, HdlOptions const &options)
     if (!netlist)
         return;
     netlist->SortNetlist();
-    netlist->CreateVhdlDummySignals(); // the VHDL pass, so that both languages get one structure
+    netlist->CreateVhdlDummySignals(); // the VHDL pass, so that both files describe one structure
     SetNameCase(netlist, options);
 
     Text const name = netlist->GetName();
@@ -179,7 +160,8 @@ void VerilogNetlister::WriteNetlist(Netlist *netlist, HdlOptions const &options)
     Put(*stream, "endmodule", EOL);
 }
 
-/// Only the names of signals, components and instances are touched.
+/// Renames for good. Objects are still found by their former names, whose case does not matter.
+/// Pins and attributes keep theirs: they have to match what is declared elsewhere.
 void VerilogNetlister::SetNameCase(Netlist *netlist, HdlOptions const &options) {
     auto const setCase = [this](auto const &objects, VerilogOption::CaseType type) {
         if (type != VerilogOption::CASE_DEFAULT)
@@ -201,8 +183,8 @@ void VerilogNetlister::SetNameCase(Object *object, bool upper) {
     object->SetName(name);
 }
 
-/// Whether the macro takes INIT as a parameter of its own. Unlike in VHDL, one of option "NOSYN"
-/// does not count: meant so.
+/// Whether the macro takes INIT as a parameter of its own. Required: unlike in VHDL, one of option
+/// "NOSYN" does not count.
 bool VerilogNetlister::InitDefined(Netlist const *netlist) {
     bool defined = false;
     if (netlist && netlist->HasAttrs())
@@ -215,18 +197,13 @@ bool VerilogNetlister::InitDefined(Netlist const *netlist) {
 void VerilogNetlister::GetGenericAttrs(Iterator<Attribute *> &attrs, PtrArray<Attribute *> &syn,
                                        PtrArray<Attribute *> &nosyn) {
     attrs.Rewind();
-    ForEach(attrs, [&](Attribute *attr) {
-        if (attr->IsGenericSyn())
-            syn.Add(attr);
-        else if (attr->IsGenericNoSyn())
-            nosyn.Add(attr);
-    });
+    ForEach(attrs, [&](Attribute *attr) { AddGeneric(attr, syn, nosyn); });
 }
 
 void VerilogNetlister::WriteModulelAndPorts(Text const &name, Iterator<Signal *> const &signals,
                                             HdlOptions const &options) {
     Put(*stream, "module", " ", name, "(");
-    ListSeparator separator(*stream, options.portOnePerLine, name.GetLength() + 8);
+    ListSeparator separator = PortSeparator(*stream, options, name.GetLength() + 8);
     ForEachAhead(signals, [&](Signal const *signal) {
         if (!IsDeclaredPort(*signal))
             return;
@@ -237,7 +214,7 @@ void VerilogNetlister::WriteModulelAndPorts(Text const &name, Iterator<Signal *>
     Put(*stream, ");", EOL, EOL);
 }
 
-/// Writes items as lines, those for simulation only between translate marks.
+/// Writes items as lines; those for simulation only are between marks that synthesis tools skip.
 template <class WriteItem>
 void VerilogNetlister::WriteGenerics(PtrArray<Attribute *> const &syn,
                                      PtrArray<Attribute *> const &nosyn, WriteItem writeItem) {
@@ -266,7 +243,8 @@ void VerilogNetlister::WriteParameters(Netlist const *netlist) {
         *stream << EOL;
 }
 
-/// Ends a statement, with its attributes inside it or behind it.
+/// Ends a statement. Its attributes come before the ";" or on lines after it, as the synthesis tool
+/// reads them.
 template <class WriteAttrs>
 void VerilogNetlister::EndWithAttrs(HdlOptions const &options, WriteAttrs writeAttrs) {
     bool const before = options.verilogOption.IsSemiColonWrittenBeforeAttr();
@@ -277,13 +255,20 @@ void VerilogNetlister::EndWithAttrs(HdlOptions const &options, WriteAttrs writeA
         Put(*stream, ";", EOL);
 }
 
-void VerilogNetlister::WritePortDeclarations(Iterator<Signal *> const &signals,
-                                             HdlOptions const &options) {
+/// Required: the empty line after the declarations is written even if there are none.
+void VerilogNetlister::WriteDeclarations(Iterator<Signal *> const &signals,
+                                         bool (VerilogNetlister::*write)(Signal const *),
+                                         HdlOptions const &options) {
     ForEachAhead(signals, [&](Signal const *signal) {
-        if (WritePortDeclaration(signal))
+        if ((this->*write)(signal))
             EndWithAttrs(options, [&] { WriteSynthesisAttr(signal, options); });
     });
     *stream << EOL;
+}
+
+void VerilogNetlister::WritePortDeclarations(Iterator<Signal *> const &signals,
+                                             HdlOptions const &options) {
+    WriteDeclarations(signals, &VerilogNetlister::WritePortDeclaration, options);
 }
 
 bool VerilogNetlister::WritePortDeclaration(Signal const *signal) {
@@ -296,11 +281,7 @@ bool VerilogNetlister::WritePortDeclaration(Signal const *signal) {
 
 void VerilogNetlister::WriteSignalDeclarations(Iterator<Signal *> const &signals,
                                                HdlOptions const &options) {
-    ForEachAhead(signals, [&](Signal const *signal) {
-        if (WriteSignalDeclaration(signal))
-            EndWithAttrs(options, [&] { WriteSynthesisAttr(signal, options); });
-    });
-    *stream << EOL;
+    WriteDeclarations(signals, &VerilogNetlister::WriteSignalDeclaration, options);
 }
 
 bool VerilogNetlister::WriteSignalDeclaration(Signal const *signal) {
@@ -311,21 +292,8 @@ bool VerilogNetlister::WriteSignalDeclaration(Signal const *signal) {
     return true;
 }
 
-/// Constants first, then what is assigned from another signal.
 void VerilogNetlister::WriteSignalAssignments(Iterator<Signal *> const &signals) {
-    ForEachAhead(signals, [this](Signal const *signal) {
-        if (!signal->HasConstantValue())
-            return;
-        statements->WriteConstantSignalAssignment(signal->GetNameRef(), IsOneDigit(*signal),
-                                                  signal->GetConstantValue());
-        Put(*stream, ";", EOL);
-    });
-    ForEachAhead(signals, [this](Signal const *target) {
-        ForEach(target->GetSignalIterator(), [this, target](Signal const *source) {
-            statements->WriteSignalAssignment(target->GetNameRef(), source->GetNameRef());
-            Put(*stream, ";", EOL);
-        });
-    });
+    PutAssignments(signals, *statements, [this] { Put(*stream, ";", EOL); });
 }
 
 void VerilogNetlister::WriteInstances(Iterator<Instance *> const &instances,
@@ -345,7 +313,8 @@ void VerilogNetlister::WriteInstances(Iterator<Instance *> const &instances,
     });
 }
 
-/// The component's comment is repeated at each instance.
+/// Writes an instance up to its ")". Required: the component's comment is repeated at each
+/// instance, since Verilog has no declaration of the component in this file.
 bool VerilogNetlister::WriteInstance(Instance const *instance, HdlOptions const &options) {
     if (!instance)
         return false;
@@ -354,8 +323,8 @@ bool VerilogNetlister::WriteInstance(Instance const *instance, HdlOptions const 
     statements->WriteComment(instance->GetComponent());
     statements->WriteComment(instance);
     Put(*stream, componentName, " ", instanceName, " ", "(");
-    ListSeparator separator(*stream, options.portOnePerLine,
-                            componentName.GetLength() + instanceName.GetLength() + 3);
+    ListSeparator separator =
+        PortSeparator(*stream, options, componentName.GetLength() + instanceName.GetLength() + 3);
     WriteSignalVisitor visitor(*stream, *statements);
     ForEach(instance->GetPinIterator(), [&](Pin const *pin) {
         separator.Next();
@@ -374,7 +343,8 @@ void VerilogNetlister::WriteSynthesisAttr(Signal const *signal, HdlOptions const
                            options);
 }
 
-/// The instance's attributes, then those of its component that it does not have itself.
+/// Writes the instance's attributes, then those of its component that it does not have itself:
+/// Verilog can only attach them to the instance.
 void VerilogNetlister::WriteSynthesisAttr(Instance const *instance, ComponentAttrs const &inherited,
                                           HdlOptions const &options) {
     PtrArray<Attribute *> merged;
@@ -405,15 +375,15 @@ void VerilogNetlister::WriteSynthesisAttr(Iterator<Attribute *> const &attrs, ch
     case VerilogOption::SYNTHESIS_SYNOPSYS:
         return statements->WriteSynopsysAttr(attrs);
     case VerilogOption::SYNTHESIS_VERILOG2001:
-        return; // this tool gets no attributes
+        return; // required: this tool gets no attributes
     case VerilogOption::SYNTHESIS_PRECISION:
         return statements->WritePrecisionAttr(attrs, target);
     }
 }
 
-/// The instance's generics, then those of its component that it does not have itself. In a macro
-/// INIT is handed on instead of set. It is left out of the lines for synthesis but not of those
-/// between the translate marks: meant so.
+/// Writes the instance's generics, then those of its component that it does not have itself. In a
+/// macro INIT is passed on from the macro's own parameter. Required: INIT is then left out of the
+/// lines for synthesis, but not of those for simulation only.
 void VerilogNetlister::WriteDefParam(Instance const *instance, ComponentAttrs const &inherited,
                                      HdlOptions const &options) {
     if (!instance->HasAttrs() && inherited.generics.IsEmpty())
@@ -424,7 +394,7 @@ void VerilogNetlister::WriteDefParam(Instance const *instance, ComponentAttrs co
     PtrArray<Attribute *> nosyn;
     IStringPtrMap<Attribute *> names;
 
-    /// Whether the attribute is the macro's INIT, now or before.
+    // Whether the attribute is called INIT and the macro has found its INIT, which may be this one.
     auto const isInit = [&](Attribute const *attr) {
         bool const named = attr->GetNameRef() == "INIT";
         if (macro && named && !init)

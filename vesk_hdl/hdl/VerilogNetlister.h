@@ -44,6 +44,9 @@ private:
     void WriteModulelAndPorts(Basis::StringBase<char> const &name,
                               Iterator<Signal *> const &signals, HdlOptions const &options);
     void WriteParameters(Netlist const *netlist);
+    void WriteDeclarations(Iterator<Signal *> const &signals,
+                           bool (VerilogNetlister::*write)(Signal const *),
+                           HdlOptions const &options);
     void WritePortDeclarations(Iterator<Signal *> const &signals, HdlOptions const &options);
     bool WritePortDeclaration(Signal const *signal);
     void WriteSignalDeclarations(Iterator<Signal *> const &signals, HdlOptions const &options);

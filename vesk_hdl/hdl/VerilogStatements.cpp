@@ -1,3 +1,6 @@
+// The statements of the Verilog writer. Each piece of a Put is one piece of the required text, see
+// Pieces.h.
+
 #include "vesk_hdl/hdl/VerilogStatements.h"
 
 #include "vesk_hdl/hdl/HdlUtilities.h"
@@ -9,17 +12,18 @@ using Text = Basis::StringBase<char>;
 
 namespace {
 
-/// Under the first name of a Synopsys comment; the Synplicity comment keeps to the same column,
-/// although its opening is shorter.
+/// Blanks up to the column of the first name in a Synopsys comment. Required: the Synplicity
+/// comment has the same, although its beginning is shorter.
 constexpr char const *ATTR_COLUMN = "                      ";
 
-/// The size and base of a literal, if the value was given with them.
+/// The size and base of a number, if the value was given with them.
 void WriteSize(OutStream &stream, BitVectorValue const &value) {
     if (value.HasBaseAndLength())
         Put(stream, value.GetLength(), "'", HdlUtilities::ConvertVerilogBase(value.GetBase()));
 }
 
-/// An attribute's value as a Verilog literal. Booleans and user values are strings.
+/// Writes an attribute's value as a Verilog literal. Verilog has no booleans and no types of the
+/// user, so that both are strings.
 class WriteVerilogAttrValueVisitor : public AttributeVisitor {
 public:
     explicit WriteVerilogAttrValueVisitor(OutStream &out) : stream(out) {}
@@ -51,10 +55,11 @@ private:
 
 void WriteValue(OutStream &stream, Attribute const *attr) {
     WriteVerilogAttrValueVisitor visitor(stream);
-    const_cast<Attribute *>(attr)->AcceptAttribute(visitor); // a visitor that only reads
+    const_cast<Attribute *>(attr)->AcceptAttribute(visitor); // the visitor does not change it
 }
 
-/// Calls `write` with name and bare value of each attribute that is to be written.
+/// Calls `write` with the name of each attribute that is to be written, and its value without
+/// quotes.
 template <class Write> void ForEachSynAttr(Iterator<Attribute *> const &attrs, Write write) {
     ForEach(attrs, [&write](Attribute const *attr) {
         if (attr->IsSynAssigned())
@@ -73,6 +78,7 @@ void VerilogStatements::WriteTimeScale(char const *unit, char const *precision) 
     Put(stream, "`timescale", " ", unit, " / ", precision, EOL);
 }
 
+/// For clients, as in VHDL. Required: without a file two blanks remain before the hyphen.
 void VerilogStatements::WriteTimeStamp(char const *fileName) {
     stream << "// Verilog model ";
     if (fileName && *fileName)
@@ -102,13 +108,10 @@ void VerilogStatements::WritePortDeclaration(Text const &name, Polarity const &p
          : polarity == Polarity::BIDIRECTIONAL ? " inout"
                                                : "output"),
         " ");
-    Text base;
-    int left = 0;
-    int right = 0;
-    if (Bus::IsBusName(name) && Bus::ParseBusName(name, base, left, right))
-        Put(stream, "[", left, ":", right, "]", " ", base);
-    else
-        stream << name;
+    NameParts const parts(name);
+    if (parts.isBus)
+        Put(stream, "[", parts.left, ":", parts.right, "]", " ");
+    stream << parts.base;
 }
 
 void VerilogStatements::WriteSignalDeclaration(Text const &name) {
@@ -121,22 +124,17 @@ void VerilogStatements::WriteSignalDeclaration(Text const &name) {
 void VerilogStatements::WriteWire(Text const &name) { Put(stream, "wire", " ", name); }
 
 void VerilogStatements::WriteWireBus(Text const &name) {
-    Text base;
-    int left = 0;
-    int right = 0;
-    Bus::ParseBusName(name, base, left, right);
-    Put(stream, "wire", " ", "[", left, ":", right, "]", " ", base);
+    NameParts const parts(name);
+    Put(stream, "wire", " ", "[", parts.left, ":", parts.right, "]", " ", parts.base);
 }
 
+/// Required: only a range gets square brackets. The name of a bit keeps its parentheses here,
+/// unlike at the pin of an instance.
 void VerilogStatements::WriteSignalName(char const *name) {
-    Text const text(name);
-    Text base;
-    int left = 0;
-    int right = 0;
-    if (Bus::IsBusName(text) && Bus::ParseBusName(text, base, left, right))
-        Put(stream, base, "[", left, ":", right, "]");
-    else
-        stream << text;
+    NameParts const parts{Text(name)};
+    stream << parts.base;
+    if (parts.isBus)
+        Put(stream, "[", parts.left, ":", parts.right, "]");
 }
 
 void VerilogStatements::NormalizeBusName(Text &name) const {
@@ -144,6 +142,7 @@ void VerilogStatements::NormalizeBusName(Text &name) const {
     name.ReplaceChars(')', ']');
 }
 
+/// Required: the target is the base name, also for one bit of a bus.
 void VerilogStatements::WriteConstantSignalAssignment(Text const &name, bool isScalar,
                                                       BitVectorValue const &value) {
     Put(stream, "assign", " ", Object::GetBaseName(name), " = ");
@@ -173,6 +172,9 @@ void VerilogStatements::WriteDefParamInitStatement(Attribute const *attr, char c
     if (attr)
         Put(stream, "defparam", " ", instance, ".", attr->GetNameRef(), " = ", attr->GetNameRef());
 }
+
+// Three tools read one comment line for each attribute, which names its target. The other two read
+// one comment for all attributes, which is inside or directly after the statement of the target.
 
 void VerilogStatements::WriteQRTAttr(Iterator<Attribute *> const &attrs, char const *target) {
     ForEachSynAttr(attrs, [this, target](Text const &name, Text const &value) {
@@ -208,6 +210,7 @@ void VerilogStatements::WritePrecisionAttrStatement(char const *name, char const
     Put(stream, "//pragma attribute ", target, " ", name, " ", value, EOL);
 }
 
+/// Required: a line of this comment ends in a comma and a backslash.
 void VerilogStatements::WriteSynplicityAttr(Iterator<Attribute *> const &attrs) {
     bool first = true;
     ForEachSynAttr(attrs, [this, &first](Text const &name, Text const &value) {

@@ -1,3 +1,5 @@
+// The VHDL writer. From WriteNetlist on it reads like the file that it writes.
+
 #include "vesk_hdl/hdl/VhdlNetlister.h"
 
 #include <unordered_map>
@@ -17,33 +19,28 @@ using Text = Basis::StringBase<char>;
 
 namespace {
 
-/// The statements of a netlister and its copies, which the last of them deletes.
+/// The statements of a netlister and its copies. The last of them deletes it.
 struct SharedStatements : VhdlStatements {
     using VhdlStatements::VhdlStatements;
     int owners = 1;
 };
 
-/// A port clause of an entity or component: the caller writes the items.
-class PortClause {
-public:
-    explicit PortClause(OutStream &out) : stream(out) { Put(stream, "port", " ( "); }
-    /// Ends the item before, if there is one, and begins the next line under it.
-    void NextItem() {
-        stream << separator;
-        if (*separator)
-            Put(stream, EOL, "       ");
-        separator = "; ";
-    }
-    void End() { Put(stream, ");", EOL); }
+/// Writes a port clause of an entity or component with an item for each object, in order.
+template <class Objects, class Write>
+void WritePortClause(OutStream &stream, Objects const &objects, Write writeItem) {
+    Put(stream, "port", " ( ");
+    ListSeparator separator(stream, "; ", 7); // the column after "port ("
+    ForEachAhead(objects, [&](auto const *object) {
+        separator.Next();
+        writeItem(*object);
+    });
+    Put(stream, ");", EOL);
+}
 
-private:
-    OutStream &stream;
-    char const *separator = "";
-};
-
-/// The instances that the declarations need: the first of each component and those with attributes
-/// of their own. The others would add nothing, so that one walk over a million of them is enough.
-void FindTelling(Netlist const *netlist, PtrArray<Instance *> &telling) {
+/// The instances that the declarations depend on: the first of each component and those with
+/// attributes of their own. The others would add nothing to them, so that one walk over a million
+/// instances is enough.
+void FindRepresentatives(Netlist const *netlist, PtrArray<Instance *> &representatives) {
     std::unordered_set<Component const *> seen;
     Component const *last = nullptr;
     ForEachAhead(netlist->GetInstances(), [&](Instance *instance) {
@@ -51,7 +48,7 @@ void FindTelling(Netlist const *netlist, PtrArray<Instance *> &telling) {
         bool const isFirst = component != last && seen.insert(component).second;
         last = component;
         if (isFirst || instance->HasAttrs())
-            telling.Add(instance);
+            representatives.Add(instance);
     });
 }
 
@@ -62,7 +59,7 @@ Text BaseNameOf(Object const &object) { return Object::GetBaseName(object.GetNam
 namespace Vesk_Hdl {
 
 VhdlNetlister::VhdlNetlister(OutStream &out) : statements(nullptr), stream(&out) {
-    statements = new SharedStatements(out); // last: nobody but the destructor gives it back
+    statements = new SharedStatements(out); // last: only the destructor deletes it
 }
 
 VhdlNetlister::VhdlNetlister(VhdlNetlister &other)
@@ -102,15 +99,18 @@ void VhdlNetlister::WriteNetlist(Netlist *netlist, HdlOptions const *options) {
         statements->WriteKorbalLibrary(false);
         *stream << EOL;
     }
-    WriteEntity(netlist, options);
-    WriteArchitecture(netlist, options);
+    {
+        SignalLists const signals(*netlist); // freed before the configuration needs as much memory
+        WriteEntity(netlist, signals, options);
+        WriteArchitecture(netlist, signals, options);
+    }
     *stream << EOL;
     if (!vhdl.suppressConfiguration)
         WriteConfiguration(netlist);
     *stream << EOL;
 }
 
-/// Whether the macro takes INIT as a generic of its own, for its instances to be handed on.
+/// Whether the macro takes INIT as a generic of its own, which it then passes on to its instances.
 bool VhdlNetlister::InitDefined(AttributeHolder const *holder) {
     bool defined = false;
     if (holder && holder->HasAttrs())
@@ -121,22 +121,18 @@ bool VhdlNetlister::InitDefined(AttributeHolder const *holder) {
     return defined;
 }
 
-void VhdlNetlister::WriteEntity(Netlist const *netlist, HdlOptions const *options) {
-    if (!netlist)
-        return;
-    SignalLists const signals(*netlist);
+/// Required: an entity without ports has an empty port clause, unlike a component without pins.
+void VhdlNetlister::WriteEntity(Netlist const *netlist, SignalLists const &signals,
+                                HdlOptions const *options) {
     bool const useAttrType = options->vhdlOption.useAttrType;
     Put(*stream, "entity", " ", netlist->GetNameRef(), " ", "is", EOL);
     stream->Indent();
     WriteGenericMap(netlist, true);
     Iterator<Signal *> ports(&signals.ports);
     int const width = Netlist::GetLongestPortName(ports);
-    PortClause clause(*stream);
-    ForEachAhead(ports, [&](Signal const *port) {
-        clause.NextItem();
-        statements->WritePortStatement(port->GetNameRef(), port->GetPortPolarity(), width);
+    WritePortClause(*stream, signals.ports, [&](Signal const &port) {
+        statements->WritePortStatement(port.GetNameRef(), port.GetPortPolarity(), width);
     });
-    clause.End();
     ForEachAhead(ports, [&](Signal const *port) {
         if (!port->HasAttrs())
             return;
@@ -147,40 +143,42 @@ void VhdlNetlister::WriteEntity(Netlist const *netlist, HdlOptions const *option
     Put(*stream, "end", " ", netlist->GetNameRef(), ";", EOL, EOL);
 }
 
-void VhdlNetlister::WriteArchitecture(Netlist const *netlist, HdlOptions const *options) {
+void VhdlNetlister::WriteArchitecture(Netlist const *netlist, SignalLists const &signals,
+                                      HdlOptions const *options) {
     Put(*stream, "architecture", " BEHAVIORAL ", "of", " ", netlist->GetNameRef(), " ", "is", EOL);
     stream->Indent();
-    Instances telling;
-    FindTelling(netlist, telling);
-    SignalLists const signals(*netlist);
-    WriteAttrDeclarations(signals.innerWithAttrs, telling, options);
+    Instances representatives;
+    FindRepresentatives(netlist, representatives);
+    WriteAttrDeclarations(signals.innerWithAttrs, representatives, options);
     Iterator<Signal *> all(&netlist->GetSignals());
     int const width = Netlist::GetLongestSignalName(all);
     ForEachAhead(all,
                  [&](Signal const *signal) { WriteSignalDeclaration(signal, options, width); });
     if (!options->vhdlOption.suppressComponent)
-        WriteComponents(telling, options);
-    WriteSynthesisAttrAssignment(signals.innerWithAttrs, telling, options);
+        WriteComponents(representatives, options);
+    WriteSynthesisAttrAssignment(signals.innerWithAttrs, representatives, options);
     stream->Unindent();
     Put(*stream, "begin", EOL);
     stream->Indent();
-    WriteAssignments(signals.assigned);
+    PutAssignments(Iterator<Signal *>(&signals.assigned), *statements, [] {});
     ForEachAhead(netlist->GetInstances(),
                  [&](Instance const *instance) { WriteInstance(instance, options); });
     stream->Unindent();
     Put(*stream, "end", " BEHAVIORAL;", EOL);
 }
 
-/// The attributes of ports were declared in the entity. The width is that of
-/// Netlist::GetLongestAttrName, which would walk over all signals and instances.
+/// The attributes of ports were declared in the entity, and are declared once in a file: an
+/// attribute declaration in an entity is visible in its architectures (IEEE 1076-1993, 10.2). The
+/// width is that of Netlist::GetLongestAttrName, which would walk over all signals and instances.
 void VhdlNetlister::WriteAttrDeclarations(PtrArray<Signal *> const &signals,
-                                          Instances const &telling, HdlOptions const *options) {
+                                          Instances const &representatives,
+                                          HdlOptions const *options) {
     bool const useAttrType = options->vhdlOption.useAttrType;
     auto const forEachHolder = [&](auto act) {
         ForEachAhead(signals, act);
-        // A component declares nothing more at its later instances.
+        // At its later instances a component declares nothing more.
         std::unordered_set<Component const *> seen;
-        ForEachAhead(telling, [&](Instance const *instance) {
+        ForEachAhead(representatives, [&](Instance const *instance) {
             Component const *const component = instance->GetComponent();
             if (component && component->HasAttrs() && seen.insert(component).second)
                 act(component);
@@ -207,10 +205,11 @@ void VhdlNetlister::WriteSignalDeclaration(Signal const *signal, HdlOptions cons
     }
 }
 
-/// Each component once, at its first instance.
-void VhdlNetlister::WriteComponents(Instances const &telling, HdlOptions const *options) {
+/// Writes each component once, at its first instance. A component without instances is not
+/// declared.
+void VhdlNetlister::WriteComponents(Instances const &representatives, HdlOptions const *options) {
     StringSet names;
-    ForEachAhead(telling, [&](Instance const *instance) {
+    ForEachAhead(representatives, [&](Instance const *instance) {
         Component const *const component = instance->GetComponent();
         if (!component || names.IContains(component->GetNameRef().View()))
             return;
@@ -229,12 +228,9 @@ void VhdlNetlister::WriteComponent(Component const *component, HdlOptions const 
     WriteGenericMap(component, true);
     if (pins.HasMore()) {
         int const width = Netlist::GetLongestPinName(pins);
-        PortClause ports(*stream);
-        ForEach(pins, [&](Pin const *pin) {
-            ports.NextItem();
-            statements->WritePortStatement(pin->GetNameRef(), pin->GetPolarity(), width);
+        WritePortClause(*stream, pins, [&](Pin const &pin) {
+            statements->WritePortStatement(pin.GetNameRef(), pin.GetPolarity(), width);
         });
-        ports.End();
     }
     stream->Unindent();
     Put(*stream, "end", " ", "component", ";", EOL);
@@ -244,34 +240,22 @@ void VhdlNetlister::WriteComponent(Component const *component, HdlOptions const 
 }
 
 void VhdlNetlister::WriteSynthesisAttrAssignment(PtrArray<Signal *> const &signals,
-                                                 Instances const &telling,
+                                                 Instances const &representatives,
                                                  HdlOptions const *options) {
     ForEachAhead(signals, [&](Signal const *signal) {
         statements->WriteAttrAssignment(signal, BaseNameOf(*signal), "signal",
                                         options->vhdlOption.useAttrType);
     });
-    ForEachAhead(telling,
+    ForEachAhead(representatives,
                  [&](Instance const *instance) { WriteInstanceAttrAssignment(instance, options); });
 }
 
-/// Constants first, then what is assigned from another signal.
-void VhdlNetlister::WriteAssignments(PtrArray<Signal *> const &signals) {
-    ForEachAhead(signals, [&](Signal const *signal) {
-        if (!signal->HasConstantValue())
-            return;
-        statements->WriteConstantSignalAssignment(signal->GetNameRef(), IsOneDigit(*signal),
-                                                  signal->GetConstantValue());
-    });
-    ForEachAhead(signals, [&](Signal const *target) {
-        ForEach(target->GetSignalIterator(), [&](Signal const *source) {
-            statements->WriteSignalAssignment(target->GetNameRef(), source->GetNameRef());
-        });
-    });
-}
-
+/// A configuration binds each instance for simulation. Synthesis tools do not read it, so that it
+/// is always between the marks that they skip.
 void VhdlNetlister::WriteConfiguration(Netlist const *netlist) {
     Text const &name = netlist->GetNameRef();
-    // One walk gives each component its instances, in order.
+    // One walk finds the instances of all components, each in order; Netlist::GetInstances would
+    // walk for each component.
     std::unordered_map<Component const *, PtrArray<Instance *>> instances;
     ForEachAhead(netlist->GetInstances(), [&instances](Instance *instance) {
         if (Component const *const component = instance->GetComponent())
@@ -295,7 +279,7 @@ void VhdlNetlister::WriteConfiguration(Netlist const *netlist) {
     Put(*stream, Translate::VHDL_ON, EOL);
 }
 
-/// Primitives of the vendor's library are not configured.
+/// Cells of the vendor's library are not configured: the library has their models.
 void VhdlNetlister::WriteConfigurationItem(Component const *component,
                                            PtrArray<Instance *> const &instances) {
     if (!component || instances.IsEmpty())
@@ -304,10 +288,10 @@ void VhdlNetlister::WriteConfigurationItem(Component const *component,
     if (level && Basis::stricmp(level->GetValueString(), "ORVANE") == 0)
         return;
     Put(*stream, "for", " ");
-    char const *separator = "";
+    ListSeparator separator(*stream, ", ");
     ForEachAhead(instances, [&](Instance const *instance) {
-        Put(*stream, separator, instance->GetNameRef());
-        separator = ", ";
+        separator.Next();
+        *stream << instance->GetNameRef();
     });
     Put(*stream, " : ", component->GetNameRef(), EOL);
     stream->Indent();

@@ -9,6 +9,7 @@ namespace Vesk_Hdl {
 class HdlOptions;
 class OutStream;
 class VhdlStatements;
+struct SignalLists;
 
 /// Writes one netlist as one structural VHDL file (IEEE 1076-1993): library clauses, an entity, an
 /// architecture named BEHAVIORAL and a configuration. It decides what is written and in which
@@ -48,17 +49,17 @@ public:
     void WriteGenericAssociations(Instance const &instance, bool handsInitOn);
 
 private:
-    void WriteEntity(Netlist const *netlist, HdlOptions const *options);
-    void WriteArchitecture(Netlist const *netlist, HdlOptions const *options);
+    void WriteEntity(Netlist const *netlist, SignalLists const &signals, HdlOptions const *options);
+    void WriteArchitecture(Netlist const *netlist, SignalLists const &signals,
+                           HdlOptions const *options);
     using Instances = PtrArray<Instance *>;
-    void WriteAttrDeclarations(PtrArray<Signal *> const &signals, Instances const &telling,
+    void WriteAttrDeclarations(PtrArray<Signal *> const &signals, Instances const &representatives,
                                HdlOptions const *options);
     void WriteSignalDeclaration(Signal const *signal, HdlOptions const *options, int width);
-    void WriteComponents(Instances const &telling, HdlOptions const *options);
+    void WriteComponents(Instances const &representatives, HdlOptions const *options);
     void WriteComponent(Component const *component, HdlOptions const *options);
-    void WriteSynthesisAttrAssignment(PtrArray<Signal *> const &signals, Instances const &telling,
-                                      HdlOptions const *options);
-    void WriteAssignments(PtrArray<Signal *> const &signals);
+    void WriteSynthesisAttrAssignment(PtrArray<Signal *> const &signals,
+                                      Instances const &representatives, HdlOptions const *options);
     void WriteConfiguration(Netlist const *netlist);
     void WriteConfigurationItem(Component const *component, PtrArray<Instance *> const &instances);
     bool InitDefined(AttributeHolder const *holder);

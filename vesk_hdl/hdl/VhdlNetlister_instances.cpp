@@ -1,4 +1,4 @@
-// Generic clauses and instance statements of the VHDL writer, callee after caller.
+// The generic clauses and instance statements of the VHDL writer.
 
 #include "vesk_hdl/hdl/VhdlNetlister.h"
 
@@ -6,33 +6,33 @@
 #include <limits>
 #include <vector>
 
-#include "vesk_hdl/hdl/Pieces.h"
+#include "vesk_hdl/hdl/Shared.h"
 #include "vesk_hdl/hdl/Translate.h"
 #include "vesk_hdl/hdl/VhdlStatements.h"
 #include "vesk_hdl/model/HdlOptions.h"
 #include "vesk_hdl/netlist/CompoundWalk.h"
 #include "vesk_hdl/netlist/Names.h"
 #include "vesk_hdl/netlist/Netlist.h"
-#include "vesk_hdl/text/basis/Ascii.h"
 
 using namespace Vesk_Hdl;
 using Text = Basis::StringBase<char>;
 
 namespace {
 
-/// Writes the association of one pin in a port map, whatever kind of signal the pin is on. A signal
-/// that cannot be associated whole becomes several associations.
+/// Writes the association of one pin in a port map, whatever class of signal the pin is on. A
+/// signal that cannot be associated as a whole becomes several associations with parts of the pin
+/// (IEEE 1076-1993, 4.3.2.2).
 class WritePortAssignmentVisitor : public SignalVisitor {
 public:
-    /// `sharedSeparator` is that of the whole port map: what stands in front of the next
-    /// association, empty before the first.
-    WritePortAssignmentVisitor(Text const &pinName, char const *&sharedSeparator, char const *next,
-                               VhdlStatements &vhdl, OutStream &out)
-        : separator(sharedSeparator), nextSeparator(next), statements(vhdl), stream(out) {
+    /// `portMap` separates the associations of all pins of the instance.
+    WritePortAssignmentVisitor(Text const &pinName, ListSeparator &portMap, VhdlStatements &vhdl,
+                               OutStream &out)
+        : separator(portMap), statements(vhdl), stream(out) {
         SetFormal(pinName);
     }
 
-    /// What the next association names on its left: one bit of a range by its index.
+    /// Sets the left side of the next association. A range of one bit is named by its index: D(3)
+    /// for D(3:3).
     void SetFormal(Text const &name) {
         formal = name;
         formalIsPlain = !Bus::IsBusName(name);
@@ -53,25 +53,27 @@ public:
         BeginAssociation();
         WriteFormal();
         stream << "=>";
-        if (IsOpen(name))
+        if (IsOpenName(name.View()))
             WriteOrOpen(name);
         else
             statements.WriteBus(name);
     }
 
-    /// Each member takes its piece of the pin.
+    /// Associates each member with its piece of the pin.
     void VisitCompoundBus(CompoundBus *compound) override {
         Pieces pieces(*this);
         WalkCompound(*compound, pieces);
     }
 
-    /// A pin on no signal: a scalar or a bus without a name.
+    /// One association with a signal of one bit. An empty name means that the pin is open.
     void AssociateBit(Text const &name) {
         BeginAssociation();
         Put(stream, formal, "=>");
         WriteOrOpen(name);
     }
 
+    /// One association with a whole bus. An empty name means that the pin is open; the pin is then
+    /// named without its range.
     void AssociateBus(Text const &name) {
         BeginAssociation();
         if (name.IsEmpty())
@@ -79,7 +81,7 @@ public:
         else
             WriteFormal();
         stream << "=>";
-        if (IsOpen(name))
+        if (IsOpenName(name.View()))
             WriteOrOpen(name);
         else if (Names::IsOneBitBus(name.View()))
             stream << OneBit(name);
@@ -88,7 +90,8 @@ public:
     }
 
 private:
-    /// Cuts the pin into the pieces that the members of a compound take, one after the other.
+    /// Cuts the pin into pieces as wide as the members of a compound, one after the other from the
+    /// left. A piece past the end of the pin has an empty name.
     class Pieces {
     public:
         explicit Pieces(WritePortAssignmentVisitor &toWrite) : associations(toWrite) {}
@@ -106,8 +109,8 @@ private:
 
     private:
         struct Level {
-            Text whole;
-            long long position; ///< of the next piece, in bits
+            Text whole;         ///< the part of the pin that the compound has
+            long long position; ///< where the next piece begins in it, in bits
         };
 
         void Cut(int width) {
@@ -120,29 +123,27 @@ private:
 
         WritePortAssignmentVisitor &associations;
         CompoundWidths widths;
-        std::vector<Level> levels; ///< of the compounds that are open
+        std::vector<Level> levels; ///< one for each compound of the path
     };
 
-    /// A range against the direction of its bus cannot be associated whole (IEEE 1076-1993, 6.5).
+    /// A range against the direction of its bus is no legal slice (IEEE 1076-1993, 6.5): its bits
+    /// are associated one by one.
     void AssociateBits(Text const &name) {
         Text const whole = formal;
-        Names::BusParts parts;
+        std::string_view base;
         Names::Bounds bounds;
-        if (!Bus::IsBusName(name) || !Names::SplitBusName(name.View(), parts) ||
-            !Names::ParseBounds(name.View(), bounds))
+        if (!Names::ParseBus(name.View(), base, bounds))
             return;
         for (unsigned int position = 0;; ++position) {
             if (!BusIndex::IsBusIndexName(whole))
                 SetFormal(Bus::GetBusSliceName(whole, static_cast<int>(position), 1));
-            AssociateBit(Names::BitName(parts.base, bounds.IndexAt(position)));
+            AssociateBit(Names::BitName(base, bounds.IndexAt(position)));
             if (position == bounds.Distance())
                 return;
         }
     }
 
-    static bool IsOpen(Text const &name) {
-        return name.IsEmpty() || Basis::Ascii::EqualIgnoringCase(name.View(), "open");
-    }
+    /// Required: a signal that is called "open" keeps the case of its name.
     void WriteOrOpen(Text const &name) {
         if (name.IsEmpty())
             stream << "open";
@@ -153,10 +154,7 @@ private:
     /// The name of the bit of a one-bit bus: D(3) for D(3:3).
     static Text OneBit(Text const &name) { return Bus::GetBusSliceName(name, 0, 1); }
 
-    void BeginAssociation() {
-        stream << separator;
-        separator = nextSeparator;
-    }
+    void BeginAssociation() { separator.Next(); }
 
     void WriteFormal() {
         if (formalIsPlain)
@@ -165,30 +163,24 @@ private:
             statements.WriteBus(formal);
     }
 
-    char const *&separator;
-    char const *nextSeparator;
+    ListSeparator &separator;
     Text formal;
     VhdlStatements &statements;
     OutStream &stream;
-    bool formalIsPlain = true;
+    bool formalIsPlain = true; ///< `formal` is written as it is, and not as a bus with a direction
 };
 
 } // namespace
 
 namespace Vesk_Hdl {
 
-/// What a generic clause lists.
+/// The items of a generic clause.
 struct VhdlNetlister::GenericItems {
-    Attribute const *init = nullptr; ///< the macro's INIT, which is handed on
-    PtrArray<Attribute *> syn;
-    PtrArray<Attribute *> nosyn;
+    Attribute const *init = nullptr; ///< the macro's INIT, which is passed on
+    PtrArray<Attribute *> syn;       ///< for simulation and synthesis
+    PtrArray<Attribute *> nosyn;     ///< for simulation only
 
-    void Add(Attribute *attr) {
-        if (attr->IsGenericSyn())
-            syn.Add(attr);
-        else if (attr->IsGenericNoSyn())
-            nosyn.Add(attr);
-    }
+    void Add(Attribute *attr) { AddGeneric(attr, syn, nosyn); }
     bool IsEmpty() const { return !init && syn.IsEmpty() && nosyn.IsEmpty(); }
 };
 
@@ -208,7 +200,8 @@ void VhdlNetlister::WriteGenericMap(AttributeHolder const *holder, bool isDeclar
     WriteGenericClause(items, isDeclaration);
 }
 
-/// A component's attributes are generic defaults, no items of a map, but for a macro's INIT.
+/// The attributes of a component are defaults of its generics and no items of a map, except for
+/// INIT in a macro.
 void VhdlNetlister::WriteInstanceGenericMap(Instance const *instance, bool isDeclaration,
                                             bool macroNetlist) {
     if (!instance)
@@ -224,9 +217,9 @@ void VhdlNetlister::WriteInstanceGenericMap(Instance const *instance, bool isDec
     WriteGenericClause(items, isDeclaration);
 }
 
-/// The separator of an item is written when the next one comes. In a mixed clause the one behind
-/// the last item for synthesis stands inside the translate brackets, so that both kinds of reader
-/// see a well-formed list.
+/// In a clause with both kinds of items, the separator after the last item for synthesis is between
+/// the marks that synthesis tools skip: it is written when the next item comes. So simulators and
+/// synthesis tools both read a well-formed list.
 void VhdlNetlister::WriteGenericClause(GenericItems const &items, bool isDeclaration) {
     if (items.IsEmpty())
         return;
@@ -234,25 +227,18 @@ void VhdlNetlister::WriteGenericClause(GenericItems const &items, bool isDeclara
     if (onlyNosyn)
         Put(*stream, Translate::VHDL_OFF, EOL);
     Put(*stream, (isDeclaration ? "generic" : "generic map"), "( ");
-    char const *pending = "";
-    bool first = true;
+    // Both separators put the items into the column after "generic(".
+    ListSeparator separator(*stream, isDeclaration ? ";" : ",", 9);
     if (items.init) {
+        separator.Next();
         statements->WriteGenericMapInitAttr(items.init);
-        pending = ",";
-        first = false;
     }
     auto const writeItem = [&](Attribute const *attr) {
-        *stream << pending;
-        if (*pending)
-            *stream << EOL;
-        if (!first)
-            *stream << "         ";
-        first = false;
+        separator.Next();
         if (isDeclaration)
             statements->WriteGenericMapAttrType(attr);
         else
             statements->WriteGenericMapAttr(attr);
-        pending = isDeclaration ? ";" : ",";
     };
     ForEach(items.syn, writeItem);
     if (!items.nosyn.IsEmpty()) {
@@ -277,11 +263,10 @@ void VhdlNetlister::WriteInstance(Instance const *instance, HdlOptions const *op
     Iterator<Pin *> const pins = instance->GetPinIterator();
     if (pins.HasMore()) {
         Put(*stream, "port", " ", "map", " (");
-        char const *separator = "";
-        char const *const next = options->portOnePerLine ? ",\n          " : ", ";
+        // Required: the line end is part of the text of the separator, and not the operand.
+        ListSeparator separator(*stream, options->portOnePerLine ? ",\n          " : ", ");
         ForEach(pins, [&](Pin const *pin) {
-            WritePortAssignmentVisitor visitor(pin->GetNameRef(), separator, next, *statements,
-                                               *stream);
+            WritePortAssignmentVisitor visitor(pin->GetNameRef(), separator, *statements, *stream);
             if (Signal *const signal = pin->GetSignal())
                 signal->AcceptSignal(visitor);
             else if (pin->GetPinType() == Pin::PIN_BUS)
@@ -296,7 +281,8 @@ void VhdlNetlister::WriteInstance(Instance const *instance, HdlOptions const *op
     *stream << EOL;
 }
 
-/// What merely repeats the component's attribute is covered by the component's assignment.
+/// Leaves out an attribute that only repeats the component's: the assignment to the component
+/// covers it.
 void VhdlNetlister::WriteInstanceAttrAssignment(Instance const *instance,
                                                 HdlOptions const *options) {
     if (!instance || !instance->HasAttrs())

@@ -1,3 +1,6 @@
+// The statements of the VHDL writer. Each piece of a Put is one piece of the required text, see
+// Pieces.h.
+
 #include "vesk_hdl/hdl/VhdlStatements.h"
 
 #include <string>
@@ -12,7 +15,7 @@ using Text = Basis::StringBase<char>;
 
 namespace {
 
-/// An attribute's type in VHDL.
+/// Writes the VHDL type of an attribute.
 class WriteVhdlAttrTypeVisitor : public AttributeVisitor {
 public:
     explicit WriteVhdlAttrTypeVisitor(OutStream &out) : stream(out) {}
@@ -29,7 +32,8 @@ private:
     OutStream &stream;
 };
 
-/// An attribute's value as a VHDL literal.
+/// Writes the value of an attribute as a VHDL literal of that type. The text of a user's type is an
+/// expression and not quoted; an empty one would be no expression, so that it is an empty string.
 class WriteVhdlAttrValueVisitor : public AttributeVisitor {
 public:
     explicit WriteVhdlAttrValueVisitor(OutStream &out) : stream(out) {}
@@ -62,7 +66,7 @@ private:
     OutStream &stream;
 };
 
-/// A visitor's view of an attribute that is only read.
+/// Visits an attribute with a visitor that does not change it.
 void Accept(Attribute const *attr, AttributeVisitor &&visitor) {
     const_cast<Attribute *>(attr)->AcceptAttribute(visitor);
 }
@@ -73,6 +77,7 @@ namespace Vesk_Hdl {
 
 VhdlStatements::VhdlStatements(OutStream &out) : stream(out) {}
 
+/// For clients: the files of the writers have the time in their header.
 void VhdlStatements::WriteTimeStamp(char const *fileName) {
     stream << "-- VHDL model";
     if (fileName && *fileName)
@@ -88,6 +93,7 @@ void VhdlStatements::WriteIEEELibrary() {
     Put(stream, "use", " ieee.numeric_std.ALL;", EOL);
 }
 
+/// Neither writer asks for the marks; they are for clients whose synthesis tool lacks the library.
 void VhdlStatements::WriteKorbalLibrary(bool translate) {
     if (translate)
         Put(stream, Translate::VHDL_OFF, EOL);
@@ -107,6 +113,7 @@ void VhdlStatements::WriteUseUserLibrary(StringArray const &names) {
         Put(stream, "use", " ", names.At(i), ";", EOL);
 }
 
+/// Required: two blanks after the sign.
 void VhdlStatements::WriteGenericMapAttrType(Attribute const *attr) {
     if (!attr)
         return;
@@ -129,11 +136,8 @@ void VhdlStatements::WriteGenericMapInitAttr(Attribute const *attr) {
 }
 
 void VhdlStatements::WritePortStatement(Text const &name, Polarity const &polarity, int width) {
-    Text base = name;
-    int left = 0;
-    int right = 0;
-    bool const isBus = Bus::IsBusName(name) && Bus::ParseBusName(name, base, left, right);
-    WritePadded(base, width);
+    NameParts const parts(name);
+    WritePadded(parts.base, width);
     Put(stream, ":", " ");
     switch (polarity.GetValue()) {
     case Polarity::INPUT:
@@ -142,12 +146,12 @@ void VhdlStatements::WritePortStatement(Text const &name, Polarity const &polari
     case Polarity::BIDIRECTIONAL:
         stream << "inout";
         break;
-    default:
+    default: // required: also of a polarity that is no direction
         stream << "out  ";
     }
     stream << " ";
-    if (isBus)
-        WriteStdLogicVector(left, right);
+    if (parts.isBus)
+        WriteStdLogicVector(parts.left, parts.right);
     else
         WriteStdLogic();
 }
@@ -159,6 +163,7 @@ void VhdlStatements::WriteStdLogicVector(int left, int right) {
     WriteBusIndex(left, right);
 }
 
+/// Equal bounds are written as "downto".
 void VhdlStatements::WriteBusIndex(int left, int right) {
     Put(stream, "(", left, " ", (left < right ? "to" : "downto"), " ", right, ")");
 }
@@ -181,6 +186,8 @@ void VhdlStatements::WriteSignalStatement(Text const &name, int width) {
     Put(stream, ":", " ", "std_logic", ";", EOL);
 }
 
+/// Required: the result of the parse is not tested. A bus without a range, such as the dummy of a
+/// base that ends in the mark, is declared with the bounds 0 and 0.
 void VhdlStatements::WriteSignalVectorStatement(Text const &name, int width) {
     Text base = name;
     int left = 0;
@@ -193,6 +200,7 @@ void VhdlStatements::WriteSignalVectorStatement(Text const &name, int width) {
     Put(stream, ";", EOL);
 }
 
+/// Required: this is the only statement with a blank before its semicolon.
 void VhdlStatements::WriteAttrDeclaration(Attribute const *attr, bool useAttrType, int width) {
     if (!attr)
         return;
@@ -219,8 +227,10 @@ void VhdlStatements::WriteAttrAssignment(Attribute const *attr, char const *targ
     Put(stream, ";", EOL);
 }
 
+/// A second declaration of a name would be illegal. Names are compared as VHDL does, without case.
 void VhdlStatements::WriteAttrDeclaration(AttributeHolder const *holder, StringSet &declared,
                                           bool useAttrType, int width) {
+    // Asking an empty holder for an iterator would make a list in it: see AttributeHolder.
     if (!holder || !holder->HasAttrs())
         return;
     ForEach(holder->GetAttrIterator(), [&](Attribute const *attr) {
@@ -241,6 +251,7 @@ void VhdlStatements::WriteAttrAssignment(AttributeHolder const *holder, char con
     });
 }
 
+/// Without base and length the digits are taken as bits, one for each character.
 void VhdlStatements::WriteConstantSignalAssignment(Text const &name, bool isScalar,
                                                    BitVectorValue const &value) {
     char const *const quote = isScalar ? "'" : "\"";
@@ -258,7 +269,7 @@ void VhdlStatements::WriteSignalAssignment(Text const &target, Text const &sourc
     Put(stream, ";", EOL);
 }
 
-/// The name, a blank and the padding, which is a piece of its own.
+/// Writes the name, a blank and the padding. Each is a piece of its own: required.
 void VhdlStatements::WritePadded(Text const &name, int width) {
     Put(stream, name, " ");
     int const length = static_cast<int>(name.GetLength());
@@ -266,6 +277,8 @@ void VhdlStatements::WritePadded(Text const &name, int width) {
         stream << std::string(static_cast<std::size_t>(width - length), ' ').c_str();
 }
 
+/// Writes one side of an assignment. Required: IsBusName decides, and WriteBus reads the name
+/// again, token by token.
 void VhdlStatements::WriteSide(Text const &name) {
     if (Bus::IsBusName(name))
         WriteBus(name);

@@ -184,9 +184,8 @@ public:
     bool ConnectSignals(char const *left, char const *right);
     /// Ties a pin to the signal INSTANCE_PIN_CONST_SIGNAL, which gets the constant of a text, see
     /// BitVectorValue. A second call replaces the constant. The signal does not list the pin.
-    /// Refused: an
-    /// unknown instance or pin, as in ConnectSignalToPin; a name of the new signal that is taken
-    /// (NAME_TAKEN, BUS_DECLARED).
+    /// Refused: an unknown instance or pin, as in ConnectSignalToPin; a name of the new signal that
+    /// is taken (NAME_TAKEN, BUS_DECLARED).
     bool AssignConstantToPin(char const *instanceName, char const *pinName, char const *value);
     /// Gives a signal the constant of a text in place of a former one.
     bool AssignConstantToSignal(char const *signalName, char const *value);

@@ -8,6 +8,8 @@
 
 namespace Vesk_Hdl {
 
+// Required: the copy operations take a reference that is not const.
+
 HdlOptions::VhdlOption::VhdlOption()
     : suppressConfiguration(false), flattenBus(false), useDefaultLibrary(true), useAttrType(false),
       openPin(true), suppressComponent(false) {}

@@ -35,6 +35,7 @@ unsigned int GetOption(unsigned int options, Option const &option) {
     return (options >> option.shift) & 3U;
 }
 
+/// Sets the two bits of an option; false, and no change, for a word that it does not have.
 bool SetOption(unsigned int &options, Option const &option, char const *word) {
     int const value = Vocabulary::IndexOf(option.words, word);
     if (value < 0)
@@ -355,6 +356,7 @@ bool AttributeHolder::HasAttrs() const {
     return own && !own->attributes.IsEmpty();
 }
 
+/// The words and the creators are two tables in the order of ValueType.
 AttributeFactory::AttributeFactory()
     : creators(std::make_unique<IStringPtrMap<AttributeCreator>>()) {
     static constexpr AttributeCreator CREATORS[] = {
@@ -363,6 +365,7 @@ AttributeFactory::AttributeFactory()
         AttributeFloat::CreateAttribute,  AttributeBoolean::CreateAttribute,
         AttributeBit::CreateAttribute,    AttributeBitVector::CreateAttribute,
         AttributeUser::CreateAttribute};
+    static_assert(std::size(CREATORS) == std::size(Vocabulary::ATTRIBUTE_TYPES));
     for (std::size_t type = 0; type < std::size(CREATORS); ++type)
         creators->Add(Vocabulary::ATTRIBUTE_TYPES[type], CREATORS[type]);
 }

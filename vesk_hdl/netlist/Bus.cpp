@@ -76,15 +76,14 @@ bool Bus::ParseBusName(StringBase<char> const &name, StringBase<char> &base, int
 }
 
 bool Bus::ParseBusName(StringBase<char> const &name, StringArray &bits) {
-    Names::BusParts parts;
+    std::string_view base;
     Names::Bounds bounds;
-    if (!Names::IsBusName(name.View()) || !Names::SplitBusName(name.View(), parts) ||
-        !Names::ParseBounds(name.View(), bounds))
+    if (!Names::ParseBus(name.View(), base, bounds))
         return false;
     // The test is at the end: a bus over all int values has one bit more than the counter can
     // count.
     for (unsigned int position = 0;; ++position) {
-        bits.Add(Names::BitName(parts.base, bounds.IndexAt(position)));
+        bits.Add(Names::BitName(base, bounds.IndexAt(position)));
         if (position == bounds.Distance())
             return true;
     }
@@ -93,10 +92,9 @@ bool Bus::ParseBusName(StringBase<char> const &name, StringArray &bits) {
 /// Computes what an expansion of the bus into its bits would show, since a bus of 2^31 bits is a
 /// few characters of input.
 StringBase<char> Bus::GetBusSliceName(StringBase<char> const &name, int start, int count) {
-    Names::BusParts parts;
+    std::string_view base;
     Names::Bounds bounds;
-    if (!Names::IsBusName(name.View()) || !Names::SplitBusName(name.View(), parts) ||
-        !Names::ParseBounds(name.View(), bounds))
+    if (!Names::ParseBus(name.View(), base, bounds))
         return {};
     long long const bits = static_cast<long long>(bounds.Distance()) + 1;
     long long const end = static_cast<long long>(start) + count;
@@ -104,8 +102,8 @@ StringBase<char> Bus::GetBusSliceName(StringBase<char> const &name, int start, i
         return {};
     auto const first = static_cast<unsigned int>(start);
     if (count < 2)
-        return Names::BitName(parts.base, bounds.IndexAt(first));
-    return Names::BusName(parts.base, bounds.IndexAt(first),
+        return Names::BitName(base, bounds.IndexAt(first));
+    return Names::BusName(base, bounds.IndexAt(first),
                           bounds.IndexAt(static_cast<unsigned int>(end - 1)));
 }
 

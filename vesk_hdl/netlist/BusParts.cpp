@@ -78,6 +78,7 @@ Bus *BusIndex::GetParent() const { return parentRecord->bus; }
 
 Signal::SignalType BusIndex::GetSignalType() const { return SIGNAL_BUS_INDEX; }
 
+/// A port that is declared by one bit makes the whole bus a port: only whole buses can be declared.
 void BusIndex::SetPortPolarity(Polarity const &polarity) {
     if (Bus *const parent = GetParent())
         parent->SetPortPolarity(polarity);
@@ -99,6 +100,7 @@ int BusIndex::GetWidth() const { return 1; }
 bool BusIndex::IsPort() const { return GetPortPolarity() != Polarity::INVALID; }
 bool BusIndex::IsNeededToDeclared() const { return false; }
 
+/// Required: a base that ends in the mark gets another one, unlike that of a bus.
 StringBase<char> BusIndex::GetDummySignalName() const {
     StringBase<char> base = GetBaseName();
     base += Names::DUMMY_TAG;
@@ -107,7 +109,7 @@ StringBase<char> BusIndex::GetDummySignalName() const {
 
 StringBase<char> BusIndex::GetIndex() const {
     std::string_view base;
-    std::string_view index;
+    std::string_view index; // stays empty if the name has another form
     Names::SplitBusIndexName(GetNameRef().View(), base, index);
     return StringBase<char>(index);
 }

@@ -41,6 +41,7 @@ private:
 
 } // namespace
 
+/// Most compounds hold no other one, and their sum needs neither the table nor the path of Get.
 bool CompoundWidths::Find(CompoundBus const &compound, long long &width) const {
     if (auto const known = widths.find(&compound); known != widths.end()) {
         width = known->second;
@@ -63,7 +64,7 @@ int CompoundWidths::Get(CompoundBus const &compound) {
     if (Find(compound, width))
         return static_cast<int>(std::min(width, MAX_WIDTH));
     std::vector<Step> path = {{&compound, 0, 0}};
-    widths[&compound] = 0;
+    widths[&compound] = 0; // in case it is inside of itself
     for (;;) {
         Step &step = path.back();
         if (step.next < step.compound->GetSize()) {

@@ -27,7 +27,7 @@ public:
     template <class T> bool Contains(T *item) const { return items.contains(KeyOf(item)); }
 
 private:
-    /// Objects are at even addresses, so that the lowest bit can tell signals from pins.
+    /// Objects are at even addresses, so that the lowest bit can mark signals.
     static std::uintptr_t KeyOf(Pin *pin) { return reinterpret_cast<std::uintptr_t>(pin); }
     static std::uintptr_t KeyOf(Signal *signal) {
         return reinterpret_cast<std::uintptr_t>(signal) | 1;

@@ -143,6 +143,15 @@ bool ParseBounds(std::string_view name, Bounds &bounds) {
     return true;
 }
 
+bool ParseBus(std::string_view name, std::string_view &base, Bounds &bounds) {
+    BusParts parts;
+    if (!IsBusName(name) || !SplitBusName(name, parts))
+        return false;
+    base = parts.base;
+    bounds = {ToInt(parts.left), ToInt(parts.right)};
+    return true;
+}
+
 int BusWidth(std::string_view name) {
     Bounds bounds;
     if (!ParseBounds(name, bounds))
@@ -152,8 +161,9 @@ int BusWidth(std::string_view name) {
 }
 
 bool IsOneBitBus(std::string_view name) {
+    std::string_view base;
     Bounds bounds;
-    return IsBusName(name) && ParseBounds(name, bounds) && bounds.Distance() == 0;
+    return ParseBus(name, base, bounds) && bounds.Distance() == 0;
 }
 
 namespace {

@@ -60,6 +60,8 @@ struct Bounds {
 };
 /// Reads the bounds of a bus name by SplitBusName; false, and `bounds` as they were, if it is none.
 bool ParseBounds(std::string_view name, Bounds &bounds);
+/// The base and the bounds of a name that is a bus name by both readings; false otherwise.
+bool ParseBus(std::string_view name, std::string_view &base, Bounds &bounds);
 /// The width in bits of a bus name by SplitBusName, at most INT_MAX; 0 if it is none.
 int BusWidth(std::string_view name);
 /// Whether the name is a bus of exactly one bit, D(3:3), by IsBusName.

@@ -11,7 +11,7 @@ namespace Vesk_Hdl {
 /// A name that enters an object is rewritten to the one form that the library works with,
 /// NAME(LEFT:RIGHT), whatever brackets the client wrote. Names keep their case; lookups ignore it.
 /// Copies share name and comment until one of them changes, so that the pins of a million instances
-/// cost no name. If memory runs out (std::bad_alloc), an object is as it was.
+/// cost no name. A setter that runs out of memory (std::bad_alloc) leaves the object as it was.
 class VESK_HDL_API Object {
 public:
     /// The kinds of objects. A client class that derives from one of the library's has the kind of
@@ -58,9 +58,8 @@ public:
     /// hyphen becomes a colon, also one outside brackets.
     static void NormalizeName(Basis::StringBase<char> &name);
     /// The name of the whole bus: "D" for "D(7:0)" and "D[3]". It is the rewritten text before the
-    /// first
-    /// "(" if there are both brackets and no comma, otherwise the whole rewritten text. Null gives
-    /// the empty string.
+    /// first "(" if there are both brackets and no comma, otherwise the whole rewritten text. Null
+    /// gives the empty string.
     static Basis::StringBase<char> GetBaseName(char const *name);
     /// Whether the text is a base name: a letter, underscore or apostrophe, then letters, digits
     /// and underscores. Null is none.

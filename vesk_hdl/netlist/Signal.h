@@ -317,9 +317,9 @@ private:
 };
 
 /// A bundle of signals in the order of its name, A,D(3:0),E(2). In a port map VHDL gets one
-/// association for each member (IEEE 1076-1993, 4.3.2.2), Verilog a concatenation (IEEE
-/// 1364-1995, 4.1.14). It lists its members and owns none of them; they must live as long as the
-/// compound is asked about them.
+/// association for each member (IEEE 1076-1993, 4.3.2.2), Verilog a concatenation (IEEE 1364-1995,
+/// 4.1.14). It lists its members and owns none of them; they must live as long as the compound is
+/// asked about them.
 ///
 /// A client may nest compounds, also in a circle. Walks over the members (width, polarity, dummy
 /// name, written text) enter compounds among them and leave out a compound that they are inside of.

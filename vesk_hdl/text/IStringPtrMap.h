@@ -9,8 +9,8 @@ namespace Vesk_Hdl {
 /// The map owns copies of its names and none of the objects: who removes a value or ends the map
 /// leaves the object to its owner. It offers no walk, so that nothing that is written can depend on
 /// the order of a hash table. A null name counts as the empty one, which is a legal key. A map that
-/// never held anything costs no allocation. If memory runs out (std::bad_alloc), the map is as it
-/// was.
+/// never held anything costs no allocation. If memory runs out (std::bad_alloc), Add leaves the map
+/// as it was.
 class VESK_HDL_API IStringPtrMapBase {
 public:
     /// An empty map.

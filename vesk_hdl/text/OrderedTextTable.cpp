@@ -95,7 +95,7 @@ void OrderedTextTable::Rebuild(std::uint32_t newCount) {
             first = number;
             number = next;
         }
-    if (longest > LONGEST_BUCKET)
+    if (longest > MAX_BUCKET)
         MakeIndex();
 }
 
@@ -116,7 +116,7 @@ void OrderedTextTable::Add(Basis::StringBase<char> const &key) {
     std::uint32_t passed = 0;
     if (Find(key.View(), hash, passed))
         return;
-    if (passed >= LONGEST_BUCKET)
+    if (passed >= MAX_BUCKET)
         MakeIndex();
     // All that may run out of memory comes before the first change, so that a failed Add leaves the
     // table whole.

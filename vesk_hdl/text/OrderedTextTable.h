@@ -22,8 +22,8 @@ namespace Vesk_Hdl {
 /// primes, and a table never holds more texts than it has buckets. A table that holds nothing yet
 /// costs no allocation.
 ///
-/// This hash is known, so that somebody can write names that all belong into one bucket. As soon as
-/// a bucket is longer than chance makes it, a TextIndex of all texts finds them in place of the
+/// This hash is known, so that names can be made that all belong into one bucket. As soon as a
+/// bucket is longer than chance makes it, a TextIndex of all texts finds them in place of the
 /// chains; the order does not change.
 class OrderedTextTable {
 public:
@@ -57,7 +57,7 @@ public:
     Node const *GetNext(Node const *node) const;
 
 private:
-    static constexpr std::uint32_t LONGEST_BUCKET = 50; ///< chance makes none of that length
+    static constexpr std::uint32_t MAX_BUCKET = 50; ///< chance makes no bucket longer than this
 
     static std::uint32_t Hash(std::string_view key);
     std::uint32_t BucketOf(std::uint32_t hash) const { return hash % bucketCount; }

@@ -46,7 +46,7 @@ public:
     /// What can be done besides writing text.
     enum Operand : int {
         NEW_LINE = 0, ///< ends the line
-        FLUSH = 1     ///< hands on what the destination has collected
+        FLUSH = 1     ///< passes on what the destination has collected
     };
 
     /// Takes over the destination, which must not be null and is deleted with the stream.
@@ -81,8 +81,7 @@ protected:
 /// Each line begins with three blanks for each level. A piece that would make its line longer than
 /// 80 columns folds the line: it ends at its last blank, else at its last comma, else where it is,
 /// and continues six blanks deeper on the next line. Two things are never folded: a line that holds
-/// "/" or
-/// "--", since it may be a comment, and the text before a "\n" in the same piece.
+/// "/" or "--", since it may be a comment, and the text before a "\n" in the same piece.
 ///
 /// Lines end in "\n". While no file is open, text is dropped and nothing is reported.
 class VESK_HDL_API TextFileOutStream : public OutStream {

@@ -63,7 +63,7 @@ void PtrArrayBase::MoveHead(std::ptrdiff_t places, int elements) {
 /// that is filled at one end and emptied at the other then never grows.
 void PtrArrayBase::Reserve(int capacity, int gap) {
     if (capacity <= 0 || capacity > MAX_CAPACITY || gap > MAX_CAPACITY)
-        throw std::bad_alloc(); // more than a block counts
+        throw std::bad_alloc(); // more elements than a block can count
     int const size = GetSize();
     std::size_t const free = GetGap();
     if (gap == 0 && free > 0 && free >= static_cast<std::size_t>(size) &&

@@ -103,7 +103,7 @@ private:
     Block *block;
 };
 
-/// An ordered array of pointers, in order of addition until somebody sorts. `T` is a pointer type.
+/// An ordered array of pointers, in order of addition until it is sorted. `T` is a pointer type.
 /// Each operation is that of PtrArrayBase with `T` in place of `void *`.
 template <class T> class PtrArray : public PtrArrayBase {
 public:

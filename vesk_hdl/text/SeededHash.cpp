@@ -39,7 +39,7 @@ struct Key {
 };
 
 /// Both halves of the product, combined. Each factor has been combined with a secret number before,
-/// so that nobody can choose texts that give the same result.
+/// so that texts with the same result cannot be chosen.
 std::uint64_t Mix(std::uint64_t a, std::uint64_t b) {
     __extension__ using Product = unsigned __int128;
     Product const product = Product{a} * b;

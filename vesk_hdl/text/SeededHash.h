@@ -13,7 +13,7 @@
 namespace Vesk_Hdl {
 
 /// The hash of every table whose order is not visible. Its key is random and drawn once in a
-/// process, so that nobody can write a file of names that all collide.
+/// process, so that a file of names that all collide cannot be made.
 ///
 /// Texts that differ only in the low four bits of their last character get hashes that differ only
 /// in the low four bits: numbered names, such as N10 to N19, are neighbours in a table and so in

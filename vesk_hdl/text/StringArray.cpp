@@ -2,6 +2,7 @@
 
 #include "vesk_hdl/text/StringArray.h"
 
+#include <algorithm>
 #include <cassert>
 #include <string>
 #include <vector>
@@ -162,6 +163,9 @@ constexpr char QUOTES[] = "\"\"''";
 
 /// A slot that was never assigned reads as the empty string, so that it need not be null.
 struct StringArray::Record {
+    bool Contains(StringBase<char> const &wanted, StringBase<char>::CompareType type) const;
+    bool ContainsAll(Record const &others, StringBase<char>::CompareType type) const;
+
     std::vector<StringBase<char>> strings;
 };
 
@@ -287,36 +291,31 @@ void StringArray::ParseLine(char const *line, std::vector<Basis_Range> *places) 
         strings.pop_back();
 }
 
+bool StringArray::Record::Contains(StringBase<char> const &wanted,
+                                   StringBase<char>::CompareType type) const {
+    return std::any_of(strings.begin(), strings.end(),
+                       [&](StringBase<char> const &own) { return own.Compare(wanted, type) == 0; });
+}
+
+/// Required: an array that is longer is not looked into, even if its strings repeat.
+bool StringArray::Record::ContainsAll(Record const &others,
+                                      StringBase<char>::CompareType type) const {
+    return strings.size() >= others.strings.size() &&
+           std::all_of(others.strings.begin(), others.strings.end(),
+                       [&](StringBase<char> const &wanted) { return Contains(wanted, type); });
+}
+
 bool StringArray::Contains(StringBase<char> const &string) const {
-    for (StringBase<char> const &own : record->strings)
-        if (own.Compare(string, StringBase<char>::COMPARE_EXACT) == 0)
-            return true;
-    return false;
+    return record->Contains(string, StringBase<char>::COMPARE_EXACT);
 }
-
 bool StringArray::IContains(StringBase<char> const &string) const {
-    for (StringBase<char> const &own : record->strings)
-        if (own.Compare(string, StringBase<char>::COMPARE_IGNORING_CASE) == 0)
-            return true;
-    return false;
+    return record->Contains(string, StringBase<char>::COMPARE_IGNORING_CASE);
 }
-
 bool StringArray::Contains(StringArray const &strings) const {
-    if (GetSize() < strings.GetSize())
-        return false;
-    for (StringBase<char> const &wanted : strings.record->strings)
-        if (!Contains(wanted))
-            return false;
-    return true;
+    return record->ContainsAll(*strings.record, StringBase<char>::COMPARE_EXACT);
 }
-
 bool StringArray::IContains(StringArray const &strings) const {
-    if (GetSize() < strings.GetSize())
-        return false;
-    for (StringBase<char> const &wanted : strings.record->strings)
-        if (!IContains(wanted))
-            return false;
-    return true;
+    return record->ContainsAll(*strings.record, StringBase<char>::COMPARE_IGNORING_CASE);
 }
 
 StringBase<char> StringArray::Concatenate(StringBase<char> const &separator) const {

@@ -96,8 +96,9 @@ Stream::~Stream() { delete record; }
 
 Stream &Stream::operator<<(char const *text) { return Write(text ? text : ""); }
 
+/// Collects text in a block, so that a line of a netlist is no call of the system.
 Stream &Stream::Write(std::string_view text) {
-    if (record->descriptor < 0)
+    if (record->descriptor < 0) // a stream for reading, or one that is closed
         return *this;
     if (text.size() > record->text.size() - record->position) {
         record->Flush();
@@ -140,6 +141,7 @@ Stream *File::open(char const *name, Stream::Access access, bool) {
                       : access == Stream::ACCESS_APPEND ? O_WRONLY | O_CREAT | O_APPEND
                                                         : O_WRONLY | O_CREAT | O_TRUNC;
     auto record = std::make_unique<Stream::Record>();
+    // Opening a pipe waits for its other end, and a signal may interrupt that.
     do
         record->descriptor = ::open(OrEmpty(name), flags | O_CLOEXEC, 0666);
     while (record->descriptor < 0 && errno == EINTR);

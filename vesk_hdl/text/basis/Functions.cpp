@@ -52,6 +52,7 @@ int stricmp(char const *a, char const *b) {
     return Ascii::EqualIgnoringCase(OrEmpty(a), OrEmpty(b)) ? 0 : 1;
 }
 
+/// Ends at the NUL of either text: beyond it there is nothing to compare.
 int strnicmp(char const *a, char const *b, std::uint64_t count) {
     a = OrEmpty(a);
     b = OrEmpty(b);

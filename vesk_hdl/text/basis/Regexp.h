@@ -11,7 +11,7 @@
 class VESK_HDL_API Basis_Regexp {
 public:
     /// Compiles a pattern. Null counts as the empty pattern, which matches nothing. Every text is a
-    /// legal pattern: a bracket that nobody closes ends at the end of the text.
+    /// legal pattern: a bracket that is not closed ends at the end of the text.
     Basis_Regexp(char const *pattern);
     /// Frees the compiled pattern.
     ~Basis_Regexp();

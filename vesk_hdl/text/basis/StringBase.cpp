@@ -97,6 +97,7 @@ StringBase<char> &StringBase<char>::operator=(StringBase const &other) noexcept 
     return *this = StringBase(other);
 }
 
+/// The old text is freed with `other`, mostly a temporary.
 StringBase<char> &StringBase<char>::operator=(StringBase &&other) noexcept {
     std::swap(rep, other.rep);
     return *this;
@@ -128,7 +129,7 @@ StringBase<char> &StringBase<char>::Append(StringBase const &text) { return *thi
 StringBase<char> &StringBase<char>::Append(char const *text, unsigned int count) {
     if (!text || count == NOT_FOUND)
         return *this += ViewOf(text);
-    return *this += std::string_view(text, ::strnlen(text, count));
+    return *this += std::string_view(text, ::strnlen(text, count)); // no NUL gets into a string
 }
 
 void StringBase<char>::Empty() {
@@ -174,6 +175,7 @@ unsigned int StringBase<char>::GetIndexOfString(char const *text, CompareType ty
     return NOT_FOUND;
 }
 
+/// A text without the character is not copied: most names are normal and share their text.
 unsigned int StringBase<char>::ReplaceChars(char from, char to) {
     if (from == to || to == '\0' || GetIndexOfFirstChar(from, 0) == NOT_FOUND)
         return 0;
@@ -188,7 +190,7 @@ unsigned int StringBase<char>::ReplaceChars(char from, char to) {
 }
 
 void StringBase<char>::MakeUpper() {
-    if (IsEmpty())
+    if (IsEmpty()) // the text of all empty strings must not be written
         return;
     char *const text = Writable(GetLength());
     for (unsigned int i = 0; i < GetLength(); ++i)
@@ -196,7 +198,7 @@ void StringBase<char>::MakeUpper() {
 }
 
 void StringBase<char>::MakeLower() {
-    if (IsEmpty())
+    if (IsEmpty()) // likewise
         return;
     char *const text = Writable(GetLength());
     for (unsigned int i = 0; i < GetLength(); ++i)
@@ -216,7 +218,7 @@ StringBase<char> StringBase<char>::Extract(Basis_Range const &range) const {
     if (range.first > range.last || range.first >= GetLength())
         return {};
     if (range.first == 0 && range.last >= GetLength() - 1)
-        return *this;
+        return *this; // the whole text is shared and not copied
     std::size_t const count = static_cast<std::size_t>(range.last) + 1 - range.first;
     return StringBase(View().substr(range.first, count));
 }

@@ -1,3 +1,5 @@
+// The version of the library, for clients and for the header of written files.
+
 #include "vesk_hdl/text/basis/Version.h"
 
 namespace Basis {

@@ -1,22 +1,12 @@
 #pragma once
 
 #include "vesk_hdl/engine/CommandOf.h"
+#include "vesk_hdl/engine/WriteArguments.h"
 
 // The commands that write a file: they open it, say whether it gets a header, and hand netlist and
 // options to a writer.
 
 namespace Vesk_Hdl::Commands {
-
-/// [option [option]] file
-struct WriteArguments {
-    Basis::StringBase<char> fileName;
-    bool append = false;
-    bool writeHeader = true;
-
-    /// Required: the number of tokens alone decides which one is the file name. With more than two
-    /// tokens in front of it, none of them is an option, and the first one is the file name.
-    bool Parse(StringArray const &tokens, int first);
-};
 
 struct WriteVerilog : WriteArguments {
     void Run(Model &model) const;

@@ -47,7 +47,8 @@ void Checker::Finish(std::function<void(Diagnostic &)> const &show) {
     findings.Show(places, show);
 }
 
-/// A line that writes: its arguments are read and what it would write is checked.
+/// A line that writes: its arguments are read and what it would write is checked. The design stays
+/// as it is until the next line: most often there is none, and no text need be made.
 std::optional<Diagnostic> Checker::PassWrite(std::string const &line, Place const &place,
                                              std::uint32_t number, CommandHelp const &command) {
     WriteArguments arguments;

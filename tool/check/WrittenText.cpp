@@ -46,6 +46,7 @@ bool WrittenText::MayFold(int level) const {
     return false;
 }
 
+/// Folding is known to file streams alone, so that this has to be a file.
 std::string WrittenText::TakeFile(int level, Write const &write) {
     if (!file.IsOpen()) {
         file = Descriptor(::memfd_create("vesk-hdl", MFD_CLOEXEC));
@@ -57,6 +58,7 @@ std::string WrittenText::TakeFile(int level, Write const &write) {
     write(stream);
     for (int i = 0; i < level; ++i)
         stream.Unindent();
+    // Statements end their lines: nothing stays in the stream but what a flush brings to the file.
     stream << OutStream::FLUSH;
     std::string text(static_cast<std::size_t>(::lseek(file.Get(), 0, SEEK_END)), '\0');
     bool const isWhole =
@@ -69,6 +71,8 @@ std::string WrittenText::TakeFile(int level, Write const &write) {
     return text;
 }
 
+/// A line folds behind a blank. So a text is whole if the line folds at its beginning, and broken
+/// if it folds behind its last character.
 bool WrittenText::IsFoldedWithin(std::size_t begin, std::size_t end) const {
     return std::any_of(folds.begin(), folds.end(),
                        [begin, end](std::size_t fold) { return begin < fold && fold <= end; });

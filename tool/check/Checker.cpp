@@ -71,7 +71,7 @@ std::optional<Diagnostic> Checker::PassWrite(std::string const &line, Place cons
     return std::nullopt;
 }
 
-/// What the lines that wrote did to the design, for the first line behind them: most often there
+/// What the lines that wrote did to the design, for the first line after them: most often there
 /// is none.
 void Checker::RewriteDesign() {
     for (std::string const &line : std::exchange(lastWrites, {}))

@@ -88,8 +88,8 @@ std::string WrittenText::ReadOn() {
     return text;
 }
 
-/// A line folds behind a blank. So a text is whole if the line folds at its beginning, and broken
-/// if it folds behind its last character.
+/// A line folds after a blank. So a text is whole if the line folds at its beginning, and broken if
+/// it folds after its last character.
 bool WrittenText::IsFoldedWithin(std::size_t begin, std::size_t end) const {
     auto const fold = std::upper_bound(folds.begin(), folds.end(), begin);
     return fold != folds.end() && *fold <= end;

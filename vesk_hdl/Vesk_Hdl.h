@@ -17,6 +17,7 @@
 #include "vesk_hdl/engine/HdlCmd.h"
 #include "vesk_hdl/engine/HdlEngine.h"
 #include "vesk_hdl/engine/PinReference.h"
+#include "vesk_hdl/engine/WriteArguments.h"
 #include "vesk_hdl/hdl/HdlUtilities.h"
 #include "vesk_hdl/hdl/NetlistHeader.h"
 #include "vesk_hdl/hdl/VerilogNetlister.h"

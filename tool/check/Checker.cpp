@@ -12,14 +12,23 @@ using namespace Vesk_Hdl;
 
 namespace Checks {
 
+namespace {
+
+/// The language that the command writes.
+Languages LanguageOf(CommandHelp const &command) {
+    return std::strcmp(command.keyword, "WRITE VHDL") == 0      ? VHDL
+           : std::strcmp(command.keyword, "WRITE VERILOG") == 0 ? VERILOG
+                                                                : NO_LANGUAGE;
+}
+
+} // namespace
+
 std::optional<Diagnostic> Checker::RunLine(std::string const &line, Place const &place) {
     std::uint32_t const number = places.NextLine(line);
     tokens.Read(line);
     CommandHelp const *const command = CommandReference::FindFor(tokens.GetTokens());
-    bool const isVhdl = command && std::strcmp(command->keyword, "WRITE VHDL") == 0;
-    bool const isVerilog = command && std::strcmp(command->keyword, "WRITE VERILOG") == 0;
-    if ((isVhdl || isVerilog) && line.find('\0') == std::string::npos)
-        return PassWrite(line, place, number, isVhdl ? VHDL : VERILOG);
+    if (command && LanguageOf(*command) != NO_LANGUAGE && line.find('\0') == std::string::npos)
+        return PassWrite(line, place, number, *command);
     if (tokens.GetSize() > 0) {
         changed = true;
         RewriteDesign();
@@ -38,28 +47,31 @@ void Checker::Finish(std::function<void(Diagnostic &)> const &show) {
     findings.Show(places, show);
 }
 
-/// A line that writes: its arguments are read and what it would write is checked.
+/// A line that writes: its arguments are read and what it would write is checked. The design stays
+/// as it is until the next line: most often there is none, and no text need be made.
 std::optional<Diagnostic> Checker::PassWrite(std::string const &line, Place const &place,
-                                             std::uint32_t number, Languages language) {
-    std::unique_ptr<Command> const command(
-        factory.CreateCommand(&session.GetModel(), tokens.GetTokens()));
-    if (!command->ParseArguments(tokens.GetTokens())) {
+                                             std::uint32_t number, CommandHelp const &command) {
+    WriteArguments arguments;
+    if (!arguments.Parse(tokens.GetTokens(), command.words)) {
         Basis::Exception refusal("DesignEntry", "Checker", "", __LINE__);
-        refusal.setDescription("%s: Invalid Arguments.\n", command->GetKeyword())
-            .setKind(Exception::INVALID_ARGUMENTS, command->GetKeyword());
+        refusal.setDescription("%s: Invalid Arguments.\n", command.keyword)
+            .setKind(Exception::INVALID_ARGUMENTS, command.keyword);
         return ExplainRefusal(line, place, refusal, session.GetModel());
     }
+    Languages const language = LanguageOf(command);
     written |= language;
     changed = false;
     findings.SetLanguages(RequestedOr(language));
-    CheckWriteLine(number);
+    // Each line says whether there is a header.
+    session.GetModel().GetOptions()->writeHeader = arguments.writeHeader;
+    CheckWriteLine(number, command.words, arguments);
     CheckDesign(RequestedOr(language));
     lastWrites.push_back(line);
     writesVhdl |= language == VHDL;
     return std::nullopt;
 }
 
-/// What the lines that wrote did to the design, for the first line behind them: most often there
+/// What the lines that wrote did to the design, for the first line after them: most often there
 /// is none.
 void Checker::RewriteDesign() {
     for (std::string const &line : std::exchange(lastWrites, {}))
@@ -67,29 +79,20 @@ void Checker::RewriteDesign() {
     writesVhdl = false;
 }
 
-/// The number of tokens alone tells which one names the file. Each line says whether there is a
-/// header.
-void Checker::CheckWriteLine(std::uint32_t number) {
-    constexpr int FIRST = 2;
-    int const size = tokens.GetSize();
-    int const file = size == FIRST + 2 || size == FIRST + 3 ? size - 1 : FIRST;
+void Checker::CheckWriteLine(std::uint32_t number, int first, WriteArguments const &arguments) {
+    int const file = arguments.fileToken;
     auto const add = [&](Id id, int token) {
         findings.Add({id, SpotOf(tokens, token, number), Quoted(tokens.At(token))});
     };
     if (tokens.At(file).substr(0, 1) == "-")
         add(Id::WRITE_FILE_NAME, file);
-    bool &writeHeader = session.GetModel().GetOptions()->writeHeader;
-    writeHeader = true;
-    for (int token = FIRST; token < size; ++token) {
-        auto const is = [&](char const *word) { return SameIgnoringCase(tokens.At(token), word); };
-        writeHeader &= token >= file || !is("-NOHEADER");
-        bool const known = is("-APPEND") || is("-OVERWRITE") || is("-NOHEADER");
-        if (token > file || (token < file && !known))
+    for (int token = first; token < tokens.GetSize(); ++token)
+        if (token > file || (token < file && Vocabulary::IndexOf(Vocabulary::WRITE_OPTIONS,
+                                                                 tokens.GetTokens().At(token)) < 0))
             add(Id::WRITE_OPTION, token);
-    }
     std::string_view const path = tokens.At(file);
     Languages const readers = RefusedInComment(path.substr(path.rfind('/') + 1));
-    if (writeHeader && readers != NO_LANGUAGE)
+    if (arguments.writeHeader && readers != NO_LANGUAGE)
         findings.Add({Id::TEXT_CHARACTER,
                       SpotOf(tokens, file, number),
                       "file name " + Quoted(path) + " in the header",

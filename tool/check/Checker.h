@@ -33,9 +33,9 @@ public:
 
 private:
     std::optional<Diagnostic> PassWrite(std::string const &line, Place const &place,
-                                        std::uint32_t number, Languages language);
+                                        std::uint32_t number, Vesk_Hdl::CommandHelp const &command);
     void RewriteDesign();
-    void CheckWriteLine(std::uint32_t number);
+    void CheckWriteLine(std::uint32_t number, int first, Vesk_Hdl::WriteArguments const &arguments);
     void CheckDesign(Languages languages);
     Design DesignNow() { return Design(session.GetModel(), places, recorder, findings); }
     Languages RequestedOr(Languages others) const {
@@ -43,7 +43,6 @@ private:
     }
 
     Session session;
-    Vesk_Hdl::CommandFactory factory;
     Places places;
     Findings findings;
     Recorder recorder;

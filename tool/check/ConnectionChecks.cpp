@@ -58,7 +58,7 @@ private:
             {id, design.AssignedAt(target), NetName(side), {}, languages, std::move(detail)});
     }
 
-    /// VHDL also tells one bit from a vector of one bit.
+    /// To VHDL one bit and a vector of one bit are two types.
     void CheckWidth() {
         auto const isVector = [](Signal const &side) {
             return side.GetSignalType() == Signal::SIGNAL_BUS ||
@@ -125,7 +125,7 @@ private:
             Add(Id::BYPASSED_DUMMY, member, BOTH);
     }
 
-    /// Once for each check: the first member that it finds stands for the others.
+    /// Once for each check: with the first member that it finds.
     void Add(Id id, Signal const &member, Languages languages) {
         if (!found.insert(id).second)
             return;

@@ -94,6 +94,7 @@ Use Design::UseOf(Pin const *pin) {
             pin, nullptr};
 }
 
+/// Constants are rare. Without one there is nothing to find on the pins.
 template <class Act> void Design::ForEachTie(Act act) const {
     std::unordered_set<Pin const *> listed;
     bool hasConstants = false;
@@ -111,6 +112,8 @@ template <class Act> void Design::ForEachTie(Act act) const {
         });
 }
 
+/// Most nets have no use but their pins. The others are kept in two sorted arrays, which take less
+/// memory than a table of lists.
 void Design::FindUses() {
     std::vector<std::pair<Signal const *, Use>> found;
     auto const addTo = [&found](Signal const *signal, Use const &use) {

@@ -20,7 +20,7 @@ struct Use {
     Vesk_Hdl::Signal const *source; ///< of an assignment, else null
 };
 
-/// The netlist as it stands, and what the writers would make of it; nothing is changed. Made anew
+/// The netlist as it is, and what the writers would make of it; nothing is changed. Made anew
 /// for each write that is checked, in one walk over the design.
 class Design {
 public:
@@ -46,7 +46,7 @@ public:
     /// which are `count`.
     Spot TextAt(void const *option) const { return places.Find(Places::TEXT, option); }
     std::vector<Spot> TextsAt(void const *owner, int count) const;
-    /// Whether a bit or slice stands anywhere in the text.
+    /// Whether a bit or slice occurs anywhere in the text.
     bool IsWritten(Vesk_Hdl::Signal const &part) const;
     /// The bus of a bit or slice, null if there is none.
     Vesk_Hdl::Bus *BusOf(Vesk_Hdl::Signal const &part) const;

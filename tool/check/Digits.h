@@ -42,10 +42,10 @@ public:
         if (rest.empty())
             return 0;
         auto const dashes = std::count(rest.begin(), rest.end(), '_');
-        std::size_t const behind = rest.size() - static_cast<std::size_t>(dashes) - 1;
+        std::size_t const further = rest.size() - static_cast<std::size_t>(dashes) - 1;
         char const first = rest.front();
         int const bits = first == '1' ? 1 : first <= '3' ? 2 : first <= '7' ? 3 : 4;
-        return behind * GetBitsOfDigit() +
+        return further * GetBitsOfDigit() +
                std::min(GetBitsOfDigit(), static_cast<std::size_t>(bits));
     }
 

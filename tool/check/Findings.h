@@ -29,10 +29,10 @@ struct Finding {
     std::string subject; ///< what was found, in front of the sentence
     std::vector<Related> related = {};
     Languages languages = BOTH; ///< of those of the check
-    std::string detail = {};    ///< behind the sentence, in brackets
+    std::string detail = {};    ///< after the sentence, in brackets
 };
 
-/// Takes findings, leaves out what nobody asked for, tells each once with all languages that it
+/// Takes findings, leaves out what nobody asked for, keeps each once with all languages that it
 /// concerns, and gives them in the order of the lines.
 class Findings {
 public:

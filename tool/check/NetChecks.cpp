@@ -32,11 +32,11 @@ public:
 
     /// The lowest bit of `bits` that is not covered; false if there is none.
     bool FindGap(Range const &bits, long long &gap) const {
-        auto const behind =
+        auto const after =
             std::upper_bound(ranges.begin(), ranges.end(), bits.Low(),
                              [](long long low, Range const &range) { return low < range.left; });
-        bool const inside = behind != ranges.begin() && std::prev(behind)->right >= bits.Low();
-        gap = inside ? std::prev(behind)->right + 1 : bits.Low();
+        bool const inside = after != ranges.begin() && std::prev(after)->right >= bits.Low();
+        gap = inside ? std::prev(after)->right + 1 : bits.Low();
         return gap <= bits.High();
     }
 

@@ -53,8 +53,8 @@ void CheckComponent(Design const &design, Component const &component) {
     });
 }
 
-/// Pins are appended to the component: the late ones are those behind the instance's. Each is told
-/// once, with the first instance that lacks it.
+/// Pins are appended to the component: the late ones are those after the instance's. Each gets one
+/// finding, with the first instance that lacks it.
 void CheckLatePins(Design const &design) {
     std::unordered_map<Component const *, int> checkedFrom; ///< the pins from this one on
     design.ForEachInstance([&](Instance const *instance) {

@@ -26,7 +26,8 @@ std::uint32_t Places::NextLine(std::string const &text) {
     return ++lineCount;
 }
 
-/// The tokens of a line are put from left to right, so that the last one put is behind the others.
+/// The tokens of a line are put from left to right, so that the last one put comes after the
+/// others.
 bool Places::Less::operator()(Entry const &left, Entry const &right) const {
     return std::tie(left.key, left.spot.line, left.spot.column) <
            std::tie(right.key, right.spot.line, right.spot.column);
@@ -49,18 +50,18 @@ Spot Places::Find(Event event, void const *object, std::uint32_t before) const {
         if (entries[i].key == end.key && entries[i].spot.line < before)
             return entries[i].spot;
     auto const sortedEnd = entries.begin() + static_cast<std::ptrdiff_t>(sortedCount);
-    auto const behind = std::lower_bound(entries.begin(), sortedEnd, end, Less());
-    if (behind == entries.begin() || std::prev(behind)->key != end.key)
+    auto const after = std::lower_bound(entries.begin(), sortedEnd, end, Less());
+    if (after == entries.begin() || std::prev(after)->key != end.key)
         return {};
-    return std::prev(behind)->spot;
+    return std::prev(after)->spot;
 }
 
 /// The last file that begins before the line.
 std::size_t Places::FileOf(std::uint32_t line) const {
-    auto const behind =
+    auto const after =
         std::partition_point(files.begin() + 1, files.end(),
                              [line](File const &file) { return file.linesBefore < line; });
-    return static_cast<std::size_t>(behind - files.begin()) - 1;
+    return static_cast<std::size_t>(after - files.begin()) - 1;
 }
 
 Place Places::GetPlace(Spot spot) const {

@@ -22,7 +22,7 @@ struct Spot {
     std::uint16_t length = 0;
 };
 
-/// Where a token stands, or its line as a whole if that is too far to the right for a spot.
+/// The place of a token, or its line as a whole if that is too far to the right for a spot.
 Spot SpotOf(LineTokens const &tokens, int token, std::uint32_t line);
 
 /// Who was made, connected, or given a constant or a text where.
@@ -79,7 +79,7 @@ private:
         std::unique_ptr<LineStore> lines; ///< of an input that cannot be read again
     };
 
-    /// Objects stand at even addresses of eight bytes: the low bits are free for the event.
+    /// The addresses of objects are multiples of eight: the low bits are free for the event.
     static std::uintptr_t KeyOf(Event event, void const *object) {
         return reinterpret_cast<std::uintptr_t>(object) | event;
     }

@@ -49,7 +49,7 @@ private:
         TEXT
     };
 
-    /// A net that the line names, if there is something to look at behind the line: it did not
+    /// A net that the line names, if there is something to look at after the line: it did not
     /// exist, or it is spelled in another way.
     struct Named {
         Text name;

@@ -34,7 +34,7 @@ void Rewrite(Session &session, Design const &design, Places &places, std::string
     session.GetModel().SetWriteOpener(&nowhere);
     session.RunLine(line, {});
     session.GetModel().SetWriteOpener(nullptr);
-    // The write sorted the nets and put those that it made behind them.
+    // The write sorted the nets and put those that it made after them.
     for (int i = before; i < nets.GetSize(); ++i)
         places.PutOpen(nets.GetAt(i));
     for (auto const &[name, spot] : dummyNames)

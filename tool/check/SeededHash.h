@@ -8,7 +8,7 @@
 namespace Checks {
 
 /// A hash of texts for tables whose order nobody sees. A text is read as the digits of a number to
-/// a random base, modulo the prime 2^61 - 1: whoever writes a command file does not know the base,
+/// a random base, modulo the prime 2^61 - 1: the author of a command file does not know the base,
 /// and two texts of that file collide by chance alone.
 struct SeededHash {
     std::size_t operator()(std::string_view text) const {

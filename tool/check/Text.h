@@ -47,7 +47,7 @@ inline std::string NameInVerilog(Vesk_Hdl::Object const &object,
                                                                     : verilog.CASE_DEFAULT);
 }
 
-/// The bits of a bus, a slice or one bit, as its name tells them.
+/// The bits of a bus, a slice or one bit, as its name says.
 struct Range {
     long long left = 0;
     long long right = 0;

@@ -40,7 +40,7 @@ char const *ClassOf(AttributeUse::Kind kind) {
                                             : "component";
 }
 
-/// One item of a generic clause or map, which ends in the quote behind the value.
+/// One item of a generic clause or map, which ends in the quote after the value.
 std::string ItemOf(AttributeUse const &use, Attribute const &generic) {
     return WrittenText::Plain([&](OutStream &stream) {
         VhdlStatements statements(stream);

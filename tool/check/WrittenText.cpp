@@ -46,6 +46,7 @@ bool WrittenText::MayFold(int level) const {
     return false;
 }
 
+/// Folding is known to file streams alone, so that this has to be a file.
 std::string WrittenText::TakeFile(int level, Write const &write) {
     if (!file.IsOpen()) {
         file = Descriptor(::memfd_create("vesk-hdl", MFD_CLOEXEC));
@@ -57,21 +58,41 @@ std::string WrittenText::TakeFile(int level, Write const &write) {
     write(stream);
     for (int i = 0; i < level; ++i)
         stream.Unindent();
+    // Statements end their lines: nothing stays in the stream but what a flush brings to the file.
     stream << OutStream::FLUSH;
-    std::string text(static_cast<std::size_t>(::lseek(file.Get(), 0, SEEK_END)), '\0');
-    bool const isWhole =
-        stream.GetError() == 0 &&
-        ::pread(file.Get(), text.data(), text.size(), 0) == static_cast<ssize_t>(text.size()) &&
-        ::ftruncate(file.Get(), 0) == 0 && ::lseek(file.Get(), 0, SEEK_SET) == 0;
-    if (!isWhole)
-        throw std::system_error(stream.GetError() != 0 ? stream.GetError() : errno,
-                                std::generic_category());
+    if (stream.GetError() != 0)
+        throw std::system_error(stream.GetError(), std::generic_category());
+    return ReadOn();
+}
+
+/// What was written since the last call. The file begins anew when it is large: to empty it takes
+/// longer than to read a statement.
+std::string WrittenText::ReadOn() {
+    constexpr std::size_t PIECE = 4096;
+    constexpr off_t MAX_SIZE = 1024 * 1024;
+    std::string text;
+    char piece[PIECE];
+    ssize_t count = 0;
+    do {
+        count = ::pread(file.Get(), piece, sizeof piece, readUpTo);
+        if (count < 0)
+            throw std::system_error(errno, std::generic_category());
+        text.append(piece, static_cast<std::size_t>(count));
+        readUpTo += count;
+    } while (count == sizeof piece);
+    if (readUpTo > MAX_SIZE) {
+        readUpTo = 0;
+        if (::ftruncate(file.Get(), 0) != 0 || ::lseek(file.Get(), 0, SEEK_SET) != 0)
+            throw std::system_error(errno, std::generic_category());
+    }
     return text;
 }
 
+/// A line folds after a blank. So a text is whole if the line folds at its beginning, and broken if
+/// it folds after its last character.
 bool WrittenText::IsFoldedWithin(std::size_t begin, std::size_t end) const {
-    return std::any_of(folds.begin(), folds.end(),
-                       [begin, end](std::size_t fold) { return begin < fold && fold <= end; });
+    auto const fold = std::upper_bound(folds.begin(), folds.end(), begin);
+    return fold != folds.end() && *fold <= end;
 }
 
 } // namespace Checks

@@ -2,6 +2,7 @@
 
 #include <functional>
 #include <string>
+#include <sys/types.h>
 #include <vector>
 
 #include "tool/session/Descriptor.h"
@@ -31,8 +32,10 @@ public:
 private:
     bool MayFold(int level) const;
     std::string TakeFile(int level, Write const &write);
+    std::string ReadOn();
 
-    Descriptor file; ///< in memory; opened for the first text that may fold, empty between two
+    Descriptor file; ///< in memory; opened for the first text that may fold
+    off_t readUpTo = 0;
     Vesk_Hdl::TextFileOutStream stream{nullptr};
     std::string plain;
     std::vector<std::size_t> folds; ///< indexes of the plain text at which a file begins a line

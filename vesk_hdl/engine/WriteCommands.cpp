@@ -16,7 +16,23 @@
 #include "vesk_hdl/netlist/Vocabulary.h"
 #include "vesk_hdl/text/OutStream.h"
 
-namespace Vesk_Hdl::Commands {
+namespace Vesk_Hdl {
+
+bool WriteArguments::Parse(StringArray const &tokens, int first) {
+    int const given = tokens.GetSize() - first;
+    int const options = given == 2 || given == 3 ? given - 1 : 0;
+    for (int i = first; i < first + options; ++i) {
+        // Required: "-OVERWRITE" is known and changes nothing, and any other word is dropped.
+        int const option = Vocabulary::IndexOf(Vocabulary::WRITE_OPTIONS, tokens.At(i));
+        append |= option == Vocabulary::WRITE_APPEND;
+        writeHeader &= option != Vocabulary::WRITE_NOHEADER;
+    }
+    fileToken = first + options;
+    fileName = tokens.At(fileToken);
+    return !fileName.IsEmpty();
+}
+
+namespace Commands {
 
 namespace {
 
@@ -108,19 +124,6 @@ void WriteFile(Model &model, WriteArguments const &arguments, Write writeNetlist
 
 } // namespace
 
-bool WriteArguments::Parse(StringArray const &tokens, int first) {
-    int const given = tokens.GetSize() - first;
-    int const options = given == 2 || given == 3 ? given - 1 : 0;
-    for (int i = first; i < first + options; ++i) {
-        // Required: "-OVERWRITE" is known and changes nothing, and any other word is dropped.
-        int const option = Vocabulary::IndexOf(Vocabulary::WRITE_OPTIONS, tokens.At(i));
-        append |= option == Vocabulary::WRITE_APPEND;
-        writeHeader &= option != Vocabulary::WRITE_NOHEADER;
-    }
-    fileName = tokens.At(first + options);
-    return !fileName.IsEmpty();
-}
-
 void WriteVerilog::Run(Model &model) const {
     WriteFile(model, *this, [](OutStream &stream, Netlist *netlist, HdlOptions const &options) {
         VerilogNetlister(stream).WriteNetlist(netlist, options);
@@ -133,4 +136,5 @@ void WriteVhdl::Run(Model &model) const {
     });
 }
 
-} // namespace Vesk_Hdl::Commands
+} // namespace Commands
+} // namespace Vesk_Hdl

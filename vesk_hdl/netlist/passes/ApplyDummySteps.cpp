@@ -58,29 +58,46 @@ Signal *MakePartDummy(Signal const *part, Bus *parent) {
 
 class DummyMaker {
 public:
-    DummyMaker(Netlist &changed, bool portIsAssigned)
-        : netlist(changed), portTakesDummy(portIsAssigned), scalarMembers(changed.GetSignals()) {}
+    DummyMaker(Netlist &changed, DummySteps const &decided, bool portIsAssigned)
+        : netlist(changed), plan(decided), portTakesDummy(portIsAssigned),
+          scalarMembers(changed.GetSignals()) {}
 
-    void Run(std::vector<DummySteps::Step> const &steps) {
-        made.reserve(steps.size());
-        for (DummySteps::Step const &step : steps)
-            made.push_back(Make(step));
+    void Run() {
+        std::vector<DummySteps::Step> const &steps = plan.Get();
+        for (std::size_t i = 0; i < steps.size(); ++i) {
+            if (i + STEPS_AHEAD < steps.size())
+                Prefetch(steps[i + STEPS_AHEAD]);
+            Signal *const dummy = Make(steps[i].name, NetOf(i));
+            if (plan.HaveFormers())
+                made.push_back(dummy);
+        }
     }
 
 private:
-    Signal *Make(DummySteps::Step const &step) {
-        Signal *const net = step.former == DummySteps::NONE
-                                ? step.net
-                                : made[static_cast<std::size_t>(step.former)];
+    /// Nets and names lie all over the memory, see ForEachAhead.
+    static void Prefetch(DummySteps::Step const &step) {
+        __builtin_prefetch(step.net);
+        __builtin_prefetch(step.name.GetText());
+    }
+
+    Signal *NetOf(std::size_t step) const {
+        int const former = plan.GetFormer(step);
+        assert(former < static_cast<int>(step));
+        return former == DummySteps::NONE ? plan.Get()[step].net
+                                          : made[static_cast<std::size_t>(former)];
+    }
+
+    /// The assertions: the name means by now what the plan foresaw.
+    Signal *Make(StringBase<char> const &name, Signal *net) {
         if (auto *const scalar = As<ScalarSignal>(net)) {
-            assert(netlist.GetSignal(step.name) == net && "the plan foresees what a name means");
-            return MakeOfScalar(*scalar, step.name);
+            assert(netlist.GetSignal(name) == net);
+            return MakeOfScalar(*scalar, name);
         }
         if (auto *const bus = As<Bus>(net)) {
-            assert(netlist.GetParentBus(step.name) == net && "the plan foresees what a name means");
+            assert(!As<ScalarSignal>(netlist.GetSignal(name)) && netlist.GetParentBus(name) == net);
             return MakeOfBus(*bus);
         }
-        assert(netlist.GetSignal(step.name) == net && As<CompoundBus>(net));
+        assert(netlist.GetSignal(name) == net && As<CompoundBus>(net));
         return MakeOfCompound(static_cast<CompoundBus &>(*net));
     }
 
@@ -126,16 +143,19 @@ private:
             dummy.Connect(&net);
     }
 
+    static constexpr std::size_t STEPS_AHEAD = 12;
+
     Netlist &netlist;
+    DummySteps const &plan;
     bool portTakesDummy;
     ScalarMembers scalarMembers;
-    std::vector<Signal *> made; ///< the dummy of each step so far
+    std::vector<Signal *> made; ///< the dummy of each step so far, if any step refers to one
 };
 
 } // namespace
 
 void ApplyDummySteps(Netlist &netlist, DummySteps const &plan, bool portTakesDummy) {
-    DummyMaker(netlist, portTakesDummy).Run(plan.Get());
+    DummyMaker(netlist, plan, portTakesDummy).Run();
 }
 
 } // namespace Vesk_Hdl

@@ -1,7 +1,8 @@
 #include "vesk_hdl/netlist/passes/DummyPlan.h"
 
+#include <algorithm>
 #include <cassert>
-#include <unordered_map>
+#include <functional>
 #include <unordered_set>
 #include <vector>
 
@@ -13,9 +14,45 @@ namespace Vesk_Hdl {
 
 using Basis::StringBase;
 
+namespace {
+
+/// The first step about each net.
+class StepsOfNets {
+public:
+    /// Steps are added in ascending order; those of a stage are found once Sort was called.
+    void Add(Signal const *net, int index) { entries.push_back({net, index}); }
+    void Sort() {
+        std::sort(entries.begin(), entries.end(), [](Entry const &left, Entry const &right) {
+            return std::less<>()(left.net, right.net);
+        });
+        assert(std::adjacent_find(entries.begin(), entries.end(),
+                                  [](Entry const &left, Entry const &right) {
+                                      return left.net == right.net;
+                                  }) == entries.end() &&
+               "a later step of the net is about the dummy of the first one");
+    }
+    /// NONE if there is none.
+    int Find(Signal const *net) const {
+        auto const found = std::lower_bound(
+            entries.begin(), entries.end(), net,
+            [](Entry const &entry, Signal const *key) { return std::less<>()(entry.net, key); });
+        return found == entries.end() || found->net != net ? DummyPlan::NONE : found->index;
+    }
+
+private:
+    struct Entry {
+        Signal const *net;
+        int index;
+    };
+
+    std::vector<Entry> entries;
+};
+
+} // namespace
+
 struct DummyPlan::Record {
     std::vector<Step> steps;
-    std::unordered_map<Signal const *, int> firstSteps; ///< by their nets
+    StepsOfNets firstSteps;
 };
 
 namespace {
@@ -28,19 +65,22 @@ namespace {
 /// candidates of the first two stages, and a later stage leaves out those that are gone.
 class StageSimulator {
 public:
-    StageSimulator(Netlist const &planned, std::vector<DummyPlan::Step> &found,
-                   std::unordered_map<Signal const *, int> &firsts)
+    StageSimulator(Netlist const &planned, std::vector<DummyPlan::Step> &found, StepsOfNets &firsts)
         : netlist(planned), steps(found), firstSteps(firsts), resolved(planned) {}
 
     void Run() {
         FindFeedBack();
         EndStage(DummyPlan::READ_OUT_PORT);
+        if (!drivers.empty())
+            for (DummyPlan::Step const &step : steps)
+                NoteMoved(*step.net);
         for (Pin const *const pin : drivers)
             if (moved.count(pin) == 0 && !IsLedByDummy(*pin->GetSignal()))
                 Demand(*pin->GetSignal());
         EndStage(DummyPlan::DRIVEN_IN_PORT);
         ForEachAhead(netlist.GetSignals(), [this](Signal const *signal) {
-            if (DummyPlan::HasSeveralDrivers(*signal) && !HasMoved(*signal) && !IsLedByDummy(*signal))
+            if (DummyPlan::HasSeveralDrivers(*signal) && !HasMoved(*signal) &&
+                !IsLedByDummy(*signal))
                 Demand(*signal);
         });
         EndStage(DummyPlan::SEVERAL_DRIVERS);
@@ -78,7 +118,8 @@ private:
         if (names.IContains(name.View()))
             return;
         names.Add(name);
-        demands.emplace(name.View(), &demand);
+        if (!(name == demand.GetNameRef()))
+            demands.emplace(name.View(), &demand);
     }
 
     /// Turns the names of a stage into steps and notes what these would change.
@@ -87,22 +128,24 @@ private:
         for (std::size_t i = steps.size(); i < resolved.Get().size(); ++i) {
             DummySteps::Step const &step = resolved.Get()[i];
             auto const index = static_cast<int>(i);
-            steps.push_back({step.net, demands.find(step.name.View())->second, reason, step.former,
-                             DummyPlan::NONE});
-            if (step.former != DummyPlan::NONE)
-                steps[static_cast<std::size_t>(step.former)].later = index;
+            int const former = resolved.GetFormer(i);
+            auto const demand = demands.find(step.name.View());
+            steps.push_back({step.net, demand == demands.end() ? step.net : demand->second, reason,
+                             former, DummyPlan::NONE});
+            if (former != DummyPlan::NONE)
+                steps[static_cast<std::size_t>(former)].later = index;
             else
-                firstSteps.emplace(step.net, index);
-            NoteMoved(*step.net);
+                firstSteps.Add(step.net, index);
         }
+        firstSteps.Sort();
         names.Empty(); // its names stay out of the later stages
         demands.clear();
     }
 
-    /// Notes the pins that are on a dummy signal from now on. Those of scalars and buses need not be
-    /// noted, as the names of these are out of the later stages anyway. A net takes along what it
-    /// lists, also a pin that was connected to another net later.
-    void NoteMoved(Signal &net) {
+    /// Notes the pins that are on a dummy signal from now on. Those of scalars and buses need not
+    /// be noted, as the names of these are out of the later stages anyway. A net takes along what
+    /// it lists, also a pin that was connected to another net later.
+    void NoteMoved(Signal const &net) {
         bool const isCompound = As<CompoundBus>(&net) != nullptr;
         auto const noteListed = [this, isCompound](Signal const &listing) {
             ForEach(listing.GetPinIterator(), [&](Pin const *pin) {
@@ -115,15 +158,17 @@ private:
             ForEach(bus->GetBusSliceIterator(), [&](Signal const *part) { noteListed(*part); });
     }
 
-    bool HasMoved(Signal const &signal) const { return firstSteps.count(&signal) > 0; }
+    bool HasMoved(Signal const &signal) const {
+        return firstSteps.Find(&signal) != DummyPlan::NONE;
+    }
 
     /// Scalars are replaced in all compounds, parts and buses in none.
     bool IsReplaced(Signal const *member) const {
         return HasMoved(*member) && As<ScalarSignal>(member);
     }
 
-    /// Whether the first member of a compound is a dummy signal by now. A compound has the direction
-    /// of its first member, and a dummy signal has none.
+    /// Whether the first member of a compound is a dummy signal by now. A compound has the
+    /// direction of its first member, and a dummy signal has none.
     bool IsLedByDummy(Signal const &signal) const {
         Signal const *first = &signal;
         // The walk ends at a port: only that gives the compound the direction it has.
@@ -134,10 +179,10 @@ private:
 
     Netlist const &netlist;
     std::vector<DummyPlan::Step> &steps;
-    std::unordered_map<Signal const *, int> &firstSteps;
+    StepsOfNets &firstSteps;
     DummySteps resolved;
     StringSet names;                  ///< of the stage; those of all stages in any case
-    TextMap<Signal const *> demands; ///< on whose pins each name of the stage was found
+    TextMap<Signal const *> demands;  ///< for names that are not their own
     std::vector<Pin const *> drivers; ///< on in ports
     std::unordered_set<Pin const *> moved;
 };
@@ -158,8 +203,8 @@ DummyPlan::Step const &DummyPlan::GetAt(int index) const {
 }
 
 DummyPlan::Step const *DummyPlan::Find(Signal const *net) const {
-    auto const found = record->firstSteps.find(net);
-    return found == record->firstSteps.end() ? nullptr : &GetAt(found->second);
+    int const index = record->firstSteps.Find(net);
+    return index == NONE ? nullptr : &GetAt(index);
 }
 
 bool DummyPlan::FindReason(Pin const &pin, Reason &reason) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <utility>
 #include <vector>
 
 #include "vesk_hdl/netlist/Netlist.h"
@@ -19,7 +20,6 @@ public:
     struct Step {
         Basis::StringBase<char> name; ///< as the stage found it
         Signal *net;                  ///< a scalar, a bus or a compound
-        int former;                   ///< the step whose dummy is meant in place of the net
     };
 
     explicit DummySteps(Netlist const &changedLater) : netlist(changedLater) {}
@@ -28,14 +28,21 @@ public:
     /// order of the set, then compounds. Names that mean nothing are passed over.
     void AddStage(StringSet &names);
     std::vector<Step> const &Get() const { return steps; }
+    /// Whether some step of the last stage is about a compound.
+    bool HasCompounds() const;
+    /// The earlier step whose dummy is meant in place of the net of a step, or NONE.
+    int GetFormer(std::size_t step) const;
+    /// Whether some step has a former one, which takes a name that ends like that of a dummy.
+    bool HaveFormers() const { return !formers.empty(); }
 
 private:
-    Step Resolve(Basis::StringBase<char> const &name);
+    Signal *Resolve(Basis::StringBase<char> const &name, int &former);
     int FindFormer(std::string_view name);
-    void Append(Step const &step);
+    void Append(Step &&step);
 
     Netlist const &netlist;
-    std::vector<Step> steps;
+    std::vector<Step> steps; ///< kept small: a design may have a million of them
+    std::vector<std::pair<std::size_t, int>> formers; ///< of the few steps that have one, ascending
     FoldedTextMap<int> stepsByName; ///< filled when a name is first looked for here
     bool isIndexed = false;
 };

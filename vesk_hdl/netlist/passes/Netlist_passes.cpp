@@ -37,7 +37,8 @@ void FindFeedBack(Netlist const &netlist, StringSet &read, PtrArray<Signal *> &d
 
 } // namespace
 
-/// In ports are looked for together with out ports, and again only if the latter changed anything.
+/// In ports are looked for together with out ports, and a second time only if the dummies of out
+/// ports may have changed the answer.
 void Netlist::CreateVhdlDummySignals() {
     // One set for all stages: emptied, it still keeps the names that a stage handled out of the
     // later ones.
@@ -45,11 +46,18 @@ void Netlist::CreateVhdlDummySignals() {
     PtrArray<Signal *> driven;
     FindFeedBack(*this, names, driven);
     if (!names.IsEmpty()) {
-        AddDummySignals(true, names);
+        DummySteps plan(*this);
+        plan.AddStage(names);
+        ApplyDummySteps(*this, plan, true);
         names.Empty();
-        driven.Empty(); // the netlist is another one now
-        StringSet ignored;
-        FindFeedBack(*this, ignored, driven);
+        // Pins moved away from ports, which leaves fewer in ports that are driven. Only a
+        // compound's dummy may begin with a port: one that has the name of the first member's
+        // dummy.
+        if (!driven.IsEmpty() || plan.HasCompounds()) {
+            StringSet ignored;
+            driven.Empty();
+            FindFeedBack(*this, ignored, driven);
+        }
     }
     AddNames(driven, names);
     AddDummySignals(false, names);
@@ -92,7 +100,9 @@ void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
         return;
     DummySteps plan(*this);
     plan.AddStage(names);
+    // XX names.Empty();
     ApplyDummySteps(*this, plan, portTakesDummy);
+    names.Empty();
 }
 
 void Netlist::ConnectOpenPinToDummy() {

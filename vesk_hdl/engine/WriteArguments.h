@@ -1,0 +1,25 @@
+#pragma once
+
+#include "vesk_hdl/Api.h"
+#include "vesk_hdl/text/basis/StringBase.h"
+
+namespace Vesk_Hdl {
+
+class StringArray;
+
+/// The arguments of WRITE VHDL and WRITE VERILOG: [option [option]] file.
+struct VESK_HDL_API WriteArguments {
+    Basis::StringBase<char> fileName;
+    bool append = false;
+    bool writeHeader = true;
+    int fileToken = 0; ///< the index of the token that is the file name
+
+    /// Reads the tokens of a line from the index of the first argument on, into arguments that are
+    /// as they were made. False if there is no file name.
+    ///
+    /// Required: the number of tokens alone decides which one is the file name. With more than two
+    /// tokens in front of it, none of them is an option, and the first one is the file name.
+    bool Parse(StringArray const &tokens, int first);
+};
+
+} // namespace Vesk_Hdl

@@ -17,8 +17,9 @@ struct VESK_HDL_API WriteArguments {
     /// Reads the tokens of a line from the index of the first argument on, into arguments that are
     /// as they were made. False if there is no file name.
     ///
-    /// Required: the number of tokens alone decides which one is the file name. With more than two
-    /// tokens in front of it, none of them is an option, and the first one is the file name.
+    /// Required: the number of tokens alone decides which one is the file name, the second of two
+    /// and the third of three. With four or more tokens none is an option, and the first one is the
+    /// file name.
     bool Parse(StringArray const &tokens, int first);
 };
 

@@ -9,9 +9,9 @@ class StringArray;
 
 /// The arguments of WRITE VHDL and WRITE VERILOG: [option [option]] file.
 struct VESK_HDL_API WriteArguments {
-    Basis::StringBase<char> fileName;
-    bool append = false;
-    bool writeHeader = true;
+    Basis::StringBase<char> fileName; ///< as it was typed
+    bool append = false;              ///< -APPEND: the text goes to the end of the file
+    bool writeHeader = true;          ///< false after -NOHEADER
     int fileToken = 0; ///< the index of the token that is the file name
 
     /// Reads the tokens of a line from the index of the first argument on, into arguments that are

@@ -23,6 +23,7 @@ class Signal;
 /// A plan points at the signals of the netlist and is valid until the netlist is changed.
 class VESK_HDL_API DummyPlan {
 public:
+    /// Why a net gets a dummy signal. The values are the stages, in their order.
     enum Reason : int {
         READ_OUT_PORT = 1,  ///< an instance reads an out port
         DRIVEN_IN_PORT = 2, ///< an instance drives an in port
@@ -37,7 +38,7 @@ public:
         /// On whose pins the reason was found: the net itself, a part of it, or a compound with the
         /// net as a member, which is why the net need not be a port. Never null.
         Signal const *demand;
-        Reason reason;
+        Reason reason; ///< also the stage that handles the net
         /// The earlier step whose dummy signal is meant in place of the net, or NONE. A compound
         /// that a later stage handles may by then have that dummy as a member.
         int former;
@@ -49,6 +50,7 @@ public:
         bool IsNetAssigned() const { return reason != DRIVEN_IN_PORT; }
     };
 
+    /// Makes the plan in one walk over pins and signals. The netlist must outlive it.
     explicit DummyPlan(Netlist const &netlist);
     ~DummyPlan();
     DummyPlan(DummyPlan const &) = delete;

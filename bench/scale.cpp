@@ -172,7 +172,7 @@ private:
 } // namespace
 
 int main(int argc, char **argv) {
-    CLI::App app("Tells how the tool's time and memory grow with the design.", "vesk_hdl_scale");
+    CLI::App app("Measures how the tool's time and memory grow with the design.", "vesk_hdl_scale");
     Options options;
     std::vector<std::string> kindNames;
     for (Kind const &kind : GetKinds())

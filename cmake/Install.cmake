@@ -41,7 +41,7 @@ configure_package_config_file(
     ${PROJECT_SOURCE_DIR}/cmake/Vesk_HdlConfig.cmake.in
     ${PROJECT_BINARY_DIR}/Vesk_HdlConfig.cmake
     INSTALL_DESTINATION ${package_dir})
-# As with the SOVERSION, all releases of one major version can stand for each other.
+# As with the SOVERSION, a release can replace any other one of its major version.
 write_basic_package_version_file(
     ${PROJECT_BINARY_DIR}/Vesk_HdlConfigVersion.cmake
     COMPATIBILITY SameMajorVersion)

@@ -1,3 +1,3 @@
--- Stands for the library that written files name. No design here takes anything from it.
+-- In place of the library that written files name. No design here takes anything from it.
 package Kelements is
 end Kelements;

@@ -80,8 +80,8 @@ def accepts(folder, language, commands):
 
 
 def findings(folder, *arguments):
-    told = run(folder, TOOL, "check", "--diagnostics", "json", *arguments).stderr.splitlines()
-    return [one for one in map(json.loads, told) if one["severity"] != "count"]
+    found = run(folder, TOOL, "check", "--diagnostics", "json", *arguments).stderr.splitlines()
+    return [one for one in map(json.loads, found) if one["severity"] != "count"]
 
 
 def check(folder, check_name, *files):

@@ -170,7 +170,8 @@ TEST(Netlist, SeriesThatTakeTurnsAreMergedAsTheArraySortSorts) {
             PtrArray<Signal *> expected;
             for (int i = 0; i < 300; ++i) {
                 int const one = static_cast<int>(random()) & 0xff;
-                std::string name = std::string(13, 'x') + char('a' + one % series);
+                std::string name(static_cast<std::size_t>(7 * series), 'x');
+                name += char('a' + one % series);
                 name += std::to_string(repeats && i == 200 ? 100 : i);
                 expected.Add(AddScalar(netlist, name.c_str()));
             }

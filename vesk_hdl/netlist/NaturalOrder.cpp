@@ -42,24 +42,32 @@ unsigned int RunLength(char const *text) {
 
 } // namespace
 
-NaturalHead HeadOf(char const *name) {
+NaturalHead HeadOf(char const *name, unsigned int head) {
     std::array<unsigned char, sizeof(NaturalHead)> bytes = {};
+    std::size_t const begin = head * bytes.size();
+    std::size_t const end = begin + bytes.size();
+    std::size_t at = 0;
+    auto const put = [&](unsigned int byte) {
+        if (at >= begin)
+            bytes[at - begin] = static_cast<unsigned char>(byte);
+        ++at;
+    };
     bool more = true;
-    for (std::size_t i = 0; more && i < bytes.size();) {
+    while (more && at < end) {
         if (unsigned int run = RunLength(name)) {
-            bytes[i++] = static_cast<unsigned char>(FIRST_RUN + run);
-            more = run < MAX_RUN; // runs of that length may differ in length: the head ends here
-            for (; more && run > 0 && i < bytes.size(); --run)
-                bytes[i++] = static_cast<unsigned char>(*name++);
+            put(FIRST_RUN + run);
+            more = run < MAX_RUN; // runs of that length may differ in length: the heads end here
+            for (; more && run > 0 && at < end; --run)
+                put(static_cast<unsigned char>(*name++));
         } else {
-            bytes[i++] = RANKS[static_cast<unsigned char>(*name)];
+            put(RANKS[static_cast<unsigned char>(*name)]);
             more = *name++ != '\0';
         }
     }
-    NaturalHead head = {};
+    NaturalHead result = {};
     for (std::size_t i = 0; i < bytes.size(); ++i)
-        head[i / 8] = head[i / 8] << 8 | bytes[i]; // the first byte weighs most, as in a text
-    return head;
+        result[i / 8] = result[i / 8] << 8 | bytes[i]; // the first byte weighs most, as in a text
+    return result;
 }
 
 int NaturalCompare(char const *a, char const *b) {

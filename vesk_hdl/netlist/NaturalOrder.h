@@ -21,8 +21,8 @@ int NaturalCompare(char const *a, char const *b);
 /// if they are equal, NaturalCompare decides. So a sort seldom reads the names, which are scattered
 /// over the memory.
 using NaturalHead = std::array<std::uint64_t, 2>;
-/// The head of a name.
-NaturalHead HeadOf(char const *name);
+/// The head of a name. Further heads, counted from 0, hold what comes after it, in the same manner.
+NaturalHead HeadOf(char const *name, unsigned int head = 0);
 
 /// Sorts objects by polarity, then by name. `polarityOf` returns the polarity of an object; for
 /// objects without one it returns the same for all, which then sort by name alone.
@@ -55,6 +55,7 @@ private:
     };
     static constexpr int PARTS = 4; ///< INVALID, INPUT, OUTPUT, BIDIRECTIONAL
     static constexpr std::size_t MAX_SERIES = 8;
+    static constexpr unsigned int MAX_HEADS = 4;
     static constexpr int NONE = -1;
 
     NaturalSort(PtrArray<T> &sorted, PolarityOf &polarity) : array(sorted), polarityOf(polarity) {}
@@ -108,25 +109,70 @@ private:
                 array.SetAt(size++, item);
     }
 
-    void SortAll() {
+    void MakeKeys() {
+        keys.clear();
         keys.reserve(static_cast<std::size_t>(GetSize()));
         for (int i = 0; i < GetSize(); ++i)
             keys.push_back({HeadOf(NameAt(i)), PolarityAt(i), i});
+    }
+
+    void SortAll() {
+        MakeKeys();
         std::vector<T> sorted;
         sorted.reserve(keys.size());
         if (!Merge(sorted)) {
             sorted.clear();
             for (int i = 0; i < GetSize(); ++i)
                 KeyAt(i).place = i;
-            auto less = [this](Key const &a, Key const &b) {
-                return IsLess(a, a.place, b, b.place);
-            };
-            IntroSort<Key, decltype(less)>::Sort(keys.data(), keys.data() + keys.size(), less);
+            if (!SortByHeads(keys.data(), keys.data() + keys.size(), 0)) {
+                MakeKeys(); // the steps for equal objects begin with the order of the array
+                SortKeys(
+                    keys.data(), keys.data() + keys.size(),
+                    [this](Key const &a, Key const &b) { return IsLess(a, a.place, b, b.place); });
+            }
             for (Key const &key : keys)
                 sorted.push_back(array.GetAt(key.place));
         }
         for (int i = 0; i < GetSize(); ++i)
             array.SetAt(i, sorted[static_cast<std::size_t>(i)]);
+    }
+
+    template <class Less> static void SortKeys(Key *first, Key *last, Less less) {
+        IntroSort<Key, Less>::Sort(first, last, less);
+    }
+
+    /// Sorts keys by their heads, then those with one head by their next heads: so each name is
+    /// read a few times and not once for each comparison, of which most wait for the memory if the
+    /// names share a long beginning. False if two objects are equal.
+    bool SortByHeads(Key *first, Key *const last, unsigned int head) {
+        SortKeys(first, last, [](Key const &a, Key const &b) {
+            return a.polarity != b.polarity ? a.polarity < b.polarity : a.head < b.head;
+        });
+        while (first != last) {
+            Key *end = first + 1;
+            while (end != last && end->polarity == first->polarity && end->head == first->head)
+                ++end;
+            if (end - first > 1 && !SortAfterHead(first, end, head))
+                return false;
+            first = end;
+        }
+        return true;
+    }
+
+    /// The same for keys with one polarity and head.
+    bool SortAfterHead(Key *first, Key *last, unsigned int head) {
+        if (head + 1 < MAX_HEADS) {
+            for (Key *key = first; key != last; ++key)
+                key->head = HeadOf(NameAt(key->place), head + 1);
+            return SortByHeads(first, last, head + 1);
+        }
+        auto const compare = [this](Key const &a, Key const &b) {
+            return NaturalCompare(NameAt(a.place), NameAt(b.place));
+        };
+        SortKeys(first, last, [&](Key const &a, Key const &b) { return compare(a, b) < 0; });
+        return std::adjacent_find(first, last, [&](Key const &a, Key const &b) {
+                   return compare(a, b) == 0;
+               }) == last;
     }
 
     /// False if there are too many series, or two objects are equal.

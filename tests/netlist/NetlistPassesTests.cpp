@@ -126,6 +126,20 @@ TEST(NetlistPasses, ACompoundListsTheLastOfTwoDummiesOfOneName) {
     }
 }
 
+/// A compound with a backslash means the bus of its base name, and that bus has a dummy of the same
+/// base name by then: the second dummy is one of the first.
+TEST(NetlistPasses, TheSecondNameOfABusMeansItsDummy) {
+    Design design(CellsAnd("port d_DUMMY(3:0) out; d_DUMMY(3:0) u1.B(3:0); d_DUMMY(3:0)\\n u2.A"));
+    std::string const planned = Dummies(design.netlist, DummyPlan(design.netlist)).GetNames();
+    int const before = design.netlist.GetSignals().GetSize();
+    design.netlist.CreateVhdlDummySignals();
+    EXPECT_EQ("out d_DUMMY(3:0) <- d_DUMMY\nn <- n_DUMMY\n"
+              "out d_DUMMY(3:0)\\n {d_DUMMY(3:0) n_DUMMY}: u2.A\n"
+              "d_DUMMY <- d_DUMMY\nn_DUMMY\nd_DUMMY: u1.B(3:0)\n",
+              Wiring(design.netlist));
+    EXPECT_EQ(planned, SignalsFrom(design.netlist, before));
+}
+
 TEST(NetlistPasses, VerilogDummiesConcernInPortsAlone) {
     Design design(CellsAnd("port q out; q u1.A; q u1.Y; q u2.Y; port d in; d u3.Y"));
     design.netlist.CreateVerilogDummySignals();

@@ -7,6 +7,7 @@
 #include <clocale>
 #include <cstdlib>
 #include <locale.h>
+#include <new>
 #include <utility>
 #include <vector>
 
@@ -263,10 +264,14 @@ struct AttributeHolder::Record {
             throw;
         }
         Attribute *const added = attribute.release();
-        if (further && further->map)
-            further->map->Add(name, added);
-        else if (attributes.GetSize() > MAX_SCAN)
-            MakeMap();
+        try {
+            if (further && further->map)
+                further->map->Add(name, added);
+            else if (attributes.GetSize() > MAX_SCAN)
+                MakeMap();
+        } catch (std::bad_alloc const &) { // without memory for the map the names are searched
+            further->map.reset();
+        }
     }
 
     /// The newest attribute of a name: the search goes from the last to the first.

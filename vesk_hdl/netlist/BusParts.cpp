@@ -1,5 +1,5 @@
-// The classes for parts of a bus: slices and indices. Both find their bus through a record that they
-// share with it, see BusRecord.h.
+// The classes for parts of a bus: slices and indices. Both find their bus through a record that
+// they share with it, see BusRecord.h.
 
 #include <utility>
 
@@ -11,10 +11,12 @@ namespace Vesk_Hdl {
 
 using Basis::StringBase;
 
-BusSlice::BusSlice(char const *name, Bus *parent)
-    : Signal(name), parentRecord(parent ? Bus::Record::Join(parent->record) : nullptr) {
-    if (parent)
-        parent->AddBusSlice(this);
+/// It joins the record last: if memory runs out in between, no destructor leaves it.
+BusSlice::BusSlice(char const *name, Bus *parent) : Signal(name), parentRecord(nullptr) {
+    if (!parent)
+        return;
+    parent->AddBusSlice(this);
+    parentRecord = Bus::Record::Join(parent->record);
 }
 
 /// For a slice that takes the address of a widened bus. The list of slices already has that
@@ -65,11 +67,12 @@ BusSlice *BusSlice::CreateDummySignal(Bus *parent) const {
 }
 
 BusIndex::BusIndex(char const *name, Bus *parent)
-    : Signal(name),
-      parentRecord(parent ? Bus::Record::Join(parent->record) : new Bus::Record(nullptr)) {
+    : Signal(name), parentRecord(parent ? nullptr : new Bus::Record(nullptr)) {
     // Without a parent the record holds the polarity of the index itself.
-    if (parent)
-        parent->AddBusSlice(this);
+    if (!parent)
+        return;
+    parent->AddBusSlice(this);
+    parentRecord = Bus::Record::Join(parent->record);
 }
 
 BusIndex::~BusIndex() { Bus::Record::Leave(parentRecord); }

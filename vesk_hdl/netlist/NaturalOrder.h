@@ -74,6 +74,7 @@ private:
     /// nothing.
     bool Part() {
         char const *last[PARTS] = {};
+        int sizes[PARTS] = {};
         int highest = 0;
         bool isParted = true;
         for (int i = 0; i < GetSize(); ++i) {
@@ -84,18 +85,22 @@ private:
             if (last[part] && NaturalCompare(last[part], name) >= 0)
                 return false;
             last[part] = name;
+            ++sizes[part];
             isParted = isParted && part >= highest;
             highest = std::max(highest, part);
         }
         if (!isParted)
-            MoveParts();
+            MoveParts(sizes);
         return true;
     }
 
     /// The signals without a polarity, by far the largest part in most designs, move within the
-    /// array; only the others are copied.
-    void MoveParts() {
+    /// array; only the others are copied. All memory is taken first: without it (std::bad_alloc)
+    /// the array is as it was.
+    void MoveParts(int const (&sizes)[PARTS]) {
         std::vector<T> others[PARTS];
+        for (int part = 1; part < PARTS; ++part)
+            others[part].reserve(static_cast<std::size_t>(sizes[part]));
         int size = 0;
         for (int i = 0; i < GetSize(); ++i) {
             int const part = PolarityAt(i) - Polarity::INVALID;

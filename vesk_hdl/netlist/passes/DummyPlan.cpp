@@ -16,22 +16,19 @@ using Basis::StringBase;
 
 namespace {
 
-/// The first step about each net.
+/// The steps about each net. Two names may mean one bus: that of the bus, and that of a compound
+/// with a backslash, which begins with the bus.
 class StepsOfNets {
 public:
     /// Steps are added in ascending order; those of a stage are found once Sort was called.
     void Add(Signal const *net, int index) { entries.push_back({net, index}); }
     void Sort() {
         std::sort(entries.begin(), entries.end(), [](Entry const &left, Entry const &right) {
-            return std::less<>()(left.net, right.net);
+            return left.net == right.net ? left.index < right.index
+                                         : std::less<>()(left.net, right.net);
         });
-        assert(std::adjacent_find(entries.begin(), entries.end(),
-                                  [](Entry const &left, Entry const &right) {
-                                      return left.net == right.net;
-                                  }) == entries.end() &&
-               "a later step of the net is about the dummy of the first one");
     }
-    /// NONE if there is none.
+    /// The first step about a net, NONE if there is none.
     int Find(Signal const *net) const {
         auto const found = std::lower_bound(
             entries.begin(), entries.end(), net,

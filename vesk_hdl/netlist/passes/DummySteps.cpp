@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cassert>
+#include <string>
 #include <utility>
 
 #include "vesk_hdl/netlist/As.h"
@@ -10,6 +11,16 @@
 namespace Vesk_Hdl {
 
 using Basis::StringBase;
+
+namespace {
+
+std::string WithoutTag(std::string_view name) {
+    if (Names::EndsInDummyTag(name))
+        name.remove_suffix(std::string_view(Names::DUMMY_TAG).size());
+    return std::string(name);
+}
+
+} // namespace
 
 void DummySteps::AddStage(StringSet &names) {
     std::vector<Step> compounds;
@@ -33,45 +44,53 @@ void DummySteps::AddStage(StringSet &names) {
 /// A scalar of the whole name comes before a bus of that base name, and of two signals of one name
 /// the newer one is found.
 Signal *DummySteps::Resolve(StringBase<char> const &name, int &former) {
-    former = FindFormer(name.View());
-    Signal *const formerNet =
-        former == NONE ? nullptr : steps[static_cast<std::size_t>(former)].net;
-    if (As<ScalarSignal>(formerNet))
-        return formerNet;
-    Signal *const found = netlist.GetSignal(name);
-    if (As<ScalarSignal>(found)) {
-        former = NONE;
+    former = FindFormer(scalarSteps, name.View());
+    Signal *found = nullptr;
+    if (former == NONE)
+        found = netlist.GetSignal(name);
+    else if (Signal *const net = steps[static_cast<std::size_t>(former)].net; As<ScalarSignal>(net))
+        return net;
+    if (As<ScalarSignal>(found))
         return found;
-    }
-    if (formerNet)
-        return formerNet;
+    former = FindFormer(busSteps, Names::BaseName(name.View()));
+    if (former != NONE)
+        return steps[static_cast<std::size_t>(former)].net;
     if (Bus *const bus = netlist.GetParentBus(name))
         return bus;
     return As<CompoundBus>(found);
 }
 
-/// The step whose dummy has this name. The dummy of X_DUMMY is called X_DUMMY again and is no other
-/// step's: a name occurs once.
-int DummySteps::FindFormer(std::string_view name) {
+/// The last step whose dummy has this name. All names of dummies end alike, and few others do.
+int DummySteps::FindFormer(FoldedTextMap<int> const &latest, std::string_view name) {
     if (!Names::EndsInDummyTag(name) || steps.empty())
         return NONE;
     if (!isIndexed)
         for (std::size_t i = 0; i < steps.size(); ++i)
-            stepsByName.emplace(steps[i].name.View(), static_cast<int>(i));
+            Index(i);
     isIndexed = true;
-    name.remove_suffix(std::string_view(Names::DUMMY_TAG).size());
-    auto const found = stepsByName.find(name);
-    if (found == stepsByName.end() || Names::EndsInDummyTag(name) ||
-        As<CompoundBus>(steps[static_cast<std::size_t>(found->second)].net))
-        return NONE;
-    return found->second;
+    auto const found = latest.find(WithoutTag(name));
+    return found == latest.end() ? NONE : found->second;
+}
+
+/// The dummy of X and that of X_DUMMY are both called X_DUMMY. If X_DUMMY is a bus, its dummy has
+/// no range, and is found where a scalar would be.
+void DummySteps::Index(std::size_t step) {
+    Signal const *const net = steps[step].net;
+    std::string_view const base = Names::BaseName(steps[step].name.View());
+    bool const isBus = As<Bus>(net) != nullptr;
+    if (isBus)
+        busSteps.insert_or_assign(WithoutTag(base), static_cast<int>(step));
+    if (As<ScalarSignal>(net))
+        scalarSteps.insert_or_assign(WithoutTag(steps[step].name.View()), static_cast<int>(step));
+    else if (isBus && Names::EndsInDummyTag(base))
+        scalarSteps.insert_or_assign(WithoutTag(base), static_cast<int>(step));
 }
 
 void DummySteps::Append(Step &&step) {
     assert(step.net);
-    if (isIndexed)
-        stepsByName.emplace(step.name.View(), static_cast<int>(steps.size()));
     steps.push_back(std::move(step));
+    if (isIndexed)
+        Index(steps.size() - 1);
 }
 
 bool DummySteps::HasCompounds() const {

@@ -37,13 +37,17 @@ public:
 
 private:
     Signal *Resolve(Basis::StringBase<char> const &name, int &former);
-    int FindFormer(std::string_view name);
+    int FindFormer(FoldedTextMap<int> const &latest, std::string_view name);
+    void Index(std::size_t step);
     void Append(Step &&step);
 
     Netlist const &netlist;
     std::vector<Step> steps; ///< kept small: a design may have a million of them
     std::vector<std::pair<std::size_t, int>> formers; ///< of the few steps that have one, ascending
-    FoldedTextMap<int> stepsByName; ///< filled when a name is first looked for here
+    // The last steps whose dummies have a name, without its end "_DUMMY". They are filled when one
+    // is first looked for.
+    FoldedTextMap<int> scalarSteps; ///< by the whole name; a bus without a range is here as well
+    FoldedTextMap<int> busSteps;    ///< by the base name
     bool isIndexed = false;
 };
 

@@ -100,9 +100,7 @@ void Netlist::AddDummySignals(bool portTakesDummy, StringSet &names) {
         return;
     DummySteps plan(*this);
     plan.AddStage(names);
-    // XX names.Empty();
     ApplyDummySteps(*this, plan, portTakesDummy);
-    names.Empty();
 }
 
 void Netlist::ConnectOpenPinToDummy() {

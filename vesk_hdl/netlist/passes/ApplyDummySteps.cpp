@@ -67,9 +67,7 @@ public:
         for (std::size_t i = 0; i < steps.size(); ++i) {
             if (i + STEPS_AHEAD < steps.size())
                 Prefetch(steps[i + STEPS_AHEAD]);
-            Signal *const dummy = Make(steps[i].name, NetOf(i));
-            if (plan.HaveFormers())
-                made.push_back(dummy);
+            Make(steps[i]);
         }
     }
 
@@ -80,38 +78,30 @@ private:
         __builtin_prefetch(step.name.GetText());
     }
 
-    Signal *NetOf(std::size_t step) const {
-        int const former = plan.GetFormer(step);
-        assert(former < static_cast<int>(step));
-        return former == DummySteps::NONE ? plan.Get()[step].net
-                                          : made[static_cast<std::size_t>(former)];
+    /// The name decides, not the plan: required, it means what it means by now, and that may be a
+    /// dummy of this stage. Only a compound is the one of before the stage.
+    void Make(DummySteps::Step const &step) {
+        if (auto *const compound = As<CompoundBus>(step.net))
+            return MakeOfCompound(*compound);
+        if (auto *const scalar = As<ScalarSignal>(netlist.GetSignal(step.name))) {
+            assert(As<ScalarSignal>(step.net) && "the plan foresaw another net");
+            return MakeOfScalar(*scalar, step.name);
+        }
+        Bus *const bus = netlist.GetParentBus(step.name);
+        assert(bus && As<Bus>(step.net) && "the plan foresaw another net");
+        if (bus)
+            MakeOfBus(*bus);
     }
 
-    /// The assertions: the name means by now what the plan foresaw.
-    Signal *Make(StringBase<char> const &name, Signal *net) {
-        if (auto *const scalar = As<ScalarSignal>(net)) {
-            assert(netlist.GetSignal(name) == net);
-            return MakeOfScalar(*scalar, name);
-        }
-        if (auto *const bus = As<Bus>(net)) {
-            assert(!As<ScalarSignal>(netlist.GetSignal(name)) && netlist.GetParentBus(name) == net);
-            return MakeOfBus(*bus);
-        }
-        // The dummy of an earlier compound may have that name by now: required, it is not meant.
-        assert(As<CompoundBus>(net));
-        return MakeOfCompound(static_cast<CompoundBus &>(*net));
-    }
-
-    Signal *MakeOfScalar(ScalarSignal &net, StringBase<char> const &name) {
+    void MakeOfScalar(ScalarSignal &net, StringBase<char> const &name) {
         ScalarSignal *const dummy = net.CreateDummySignal();
         Add(dummy, net);
         Link(net, *dummy);
         scalarMembers.Replace(name, dummy);
-        return dummy;
     }
 
     /// The parts get no assignment of their own: that of the whole bus carries them.
-    Signal *MakeOfBus(Bus &net) {
+    void MakeOfBus(Bus &net) {
         Bus *const dummy = net.CreateDummySignal();
         Add(dummy, net);
         Link(net, *dummy);
@@ -119,17 +109,15 @@ private:
             if (Signal *const partDummy = MakePartDummy(part, dummy))
                 Add(partDummy, *part);
         });
-        return dummy;
     }
 
-    Signal *MakeOfCompound(CompoundBus &net) {
+    void MakeOfCompound(CompoundBus &net) {
         CompoundBus *const dummy = net.CreateDummySignal();
         Add(dummy, net);
         ForEach(net.GetBusMemberIterator(), [this, dummy](Signal const *member) {
             if (Signal *const memberDummy = netlist.GetSignal(member->GetDummySignalName()))
                 dummy->AddBusMember(memberDummy);
         });
-        return dummy;
     }
 
     void Add(Signal *dummy, Signal &net) {
@@ -150,7 +138,6 @@ private:
     DummySteps const &plan;
     bool portTakesDummy;
     ScalarMembers scalarMembers;
-    std::vector<Signal *> made; ///< the dummy of each step so far, if any step refers to one
 };
 
 } // namespace

@@ -32,8 +32,6 @@ public:
     bool HasCompounds() const;
     /// The earlier step whose dummy is meant in place of the net of a step, or NONE.
     int GetFormer(std::size_t step) const;
-    /// Whether some step has a former one, which takes a name that ends like that of a dummy.
-    bool HaveFormers() const { return !formers.empty(); }
 
 private:
     Signal *Resolve(Basis::StringBase<char> const &name, int &former);

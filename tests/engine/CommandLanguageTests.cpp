@@ -55,7 +55,8 @@ std::vector<std::pair<std::string, std::string>> Language() {
 }
 
 TEST(CommandLanguage, EachKeywordRunsOnJustEnoughArgumentsAndNeedsAModel) {
-    EXPECT_EQ(static_cast<std::size_t>(CommandReference::GetCount()), Language().size());
+    EXPECT_EQ(static_cast<std::size_t>(CommandReference::GetCount()), Language().size())
+        << "Language() in this file lists each command once: add a new one there.";
     for (auto const &[keyword, arguments] : Language()) {
         std::string const line = Lower(keyword) + " " + arguments;
         Owned design;

@@ -14,6 +14,24 @@ bool Contains(std::string_view text, std::string_view part) {
     return text.find(part) != std::string_view::npos;
 }
 
+/// A command that sets a text of the options or adds to a list of them, and that text or list.
+struct OptionRow {
+    std::string_view keyword;
+    void const *(*in)(HdlOptions const &options);
+};
+
+constexpr OptionRow OPTIONS[] = {
+    {"ADD LIBRARY", [](HdlOptions const &o) -> void const * { return &o.vhdlOption.libraries; }},
+    {"ADD USE LIBRARY",
+     [](HdlOptions const &o) -> void const * { return &o.vhdlOption.useLibraries; }},
+    {"ADD INCLUDE", [](HdlOptions const &o) -> void const * { return &o.verilogOption.includes; }},
+    {"Set Application", [](HdlOptions const &o) -> void const * { return &o.application; }},
+    {"Set Command", [](HdlOptions const &o) -> void const * { return &o.commandStr; }},
+    {"Set Device", [](HdlOptions const &o) -> void const * { return &o.device; }},
+    {"Set Purpose", [](HdlOptions const &o) -> void const * { return &o.purpose; }},
+    {"Set Reference", [](HdlOptions const &o) -> void const * { return &o.reference; }},
+};
+
 } // namespace
 
 void Recorder::Before(LineTokens const &lineTokens, CommandHelp const *command, int words,
@@ -51,11 +69,7 @@ Recorder::Kind Recorder::KindOf(CommandHelp const *command) {
         {"ADD SIGNAL", Kind::NET},          {"ADD PORT", Kind::NET},
         {"ADD COMPONENT", Kind::COMPONENT}, {"ADD PIN", Kind::PIN},
         {"ADD INSTANCE", Kind::INSTANCE},   {"SET NETLIST NAME", Kind::NAME},
-        {"ADD LIBRARY", Kind::TEXT},        {"ADD USE LIBRARY", Kind::TEXT},
-        {"ADD INCLUDE", Kind::TEXT},        {"ADD NOTES", Kind::TEXT},
-        {"Set Application", Kind::TEXT},    {"Set Command", Kind::TEXT},
-        {"Set Device", Kind::TEXT},         {"Set Purpose", Kind::TEXT},
-        {"Set Reference", Kind::TEXT},
+        {"ADD NOTES", Kind::TEXT},
     };
     if (!command)
         return Kind::OTHER;
@@ -65,6 +79,9 @@ Recorder::Kind Recorder::KindOf(CommandHelp const *command) {
     for (auto const &[word, rowKind] : ROWS)
         if (keyword == word)
             known->second = rowKind;
+    for (OptionRow const &row : OPTIONS)
+        if (keyword == row.keyword)
+            known->second = Kind::TEXT;
     if (Contains(keyword, " ATTRIBUTE"))
         known->second = Kind::ATTRIBUTE;
     else if (Contains(keyword, " COMMENT"))
@@ -346,20 +363,9 @@ void Recorder::RecordAttribute() {
 void const *Recorder::OwnerOfText() const {
     if (EndsIn(keyword, " COMMENT") || keyword == "ADD NOTES")
         return dynamic_cast<Object const *>(HolderOf(firstArgument));
-    HdlOptions const &options = *model.GetOptions();
-    std::pair<std::string_view, void const *> const rows[] = {
-        {"ADD LIBRARY", &options.vhdlOption.libraries},
-        {"ADD USE LIBRARY", &options.vhdlOption.useLibraries},
-        {"ADD INCLUDE", &options.verilogOption.includes},
-        {"Set Application", &options.application},
-        {"Set Command", &options.commandStr},
-        {"Set Device", &options.device},
-        {"Set Purpose", &options.purpose},
-        {"Set Reference", &options.reference},
-    };
-    for (auto const &[command, option] : rows)
-        if (keyword == command)
-            return option;
+    for (OptionRow const &row : OPTIONS)
+        if (keyword == row.keyword)
+            return row.in(*model.GetOptions());
     return nullptr;
 }
 

@@ -145,6 +145,8 @@ private:
     void NoteMoved(Signal const &net) {
         bool const isCompound = As<CompoundBus>(&net) != nullptr;
         auto const noteListed = [this, isCompound](Signal const &listing) {
+            if (!listing.HasPins())
+                return; // a walk would make an empty list
             ForEach(listing.GetPinIterator(), [&](Pin const *pin) {
                 if (isCompound || pin->GetSignal() != &listing)
                     moved.insert(pin);

@@ -14,10 +14,10 @@ using Basis::StringBase;
 
 namespace {
 
-std::string WithoutTag(std::string_view name) {
+std::string_view WithoutTag(std::string_view name) {
     if (Names::EndsInDummyTag(name))
         name.remove_suffix(std::string_view(Names::DUMMY_TAG).size());
-    return std::string(name);
+    return name;
 }
 
 } // namespace
@@ -79,11 +79,12 @@ void DummySteps::Index(std::size_t step) {
     std::string_view const base = Names::BaseName(steps[step].name.View());
     bool const isBus = As<Bus>(net) != nullptr;
     if (isBus)
-        busSteps.insert_or_assign(WithoutTag(base), static_cast<int>(step));
+        busSteps.insert_or_assign(std::string(WithoutTag(base)), static_cast<int>(step));
     if (As<ScalarSignal>(net))
-        scalarSteps.insert_or_assign(WithoutTag(steps[step].name.View()), static_cast<int>(step));
+        scalarSteps.insert_or_assign(std::string(WithoutTag(steps[step].name.View())),
+                                     static_cast<int>(step));
     else if (isBus && Names::EndsInDummyTag(base))
-        scalarSteps.insert_or_assign(WithoutTag(base), static_cast<int>(step));
+        scalarSteps.insert_or_assign(std::string(WithoutTag(base)), static_cast<int>(step));
 }
 
 void DummySteps::Append(Step &&step) {

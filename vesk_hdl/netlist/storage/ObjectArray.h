@@ -83,7 +83,6 @@ private:
 
     /// The place of an object, -1 if it is not here. It is taken out of the index, since the caller
     /// is about to remove the object.
-
     int Find(T *object) {
         try {
             if (!places) {

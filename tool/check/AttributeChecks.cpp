@@ -54,20 +54,35 @@ public:
         if (hasUndeclaredOfPorts)
             OrderPorts();
         ForEachAttribute(design, [this](AttributeUse const &use) {
-            if (!use.generic)
-                CheckDeclared(use);
-            else if (use.kind == AttributeUse::INSTANCE)
-                CheckGeneric(use);
-            CheckType(use);
-            CheckLiteral(use);
-            values.Check(use);
+            uses.emplace_back(use, values.Look(use));
+            if (uses.size() == MAX_USES || values.IsFull())
+                CheckUses();
         });
+        CheckUses();
         values.CheckInherited();
         FindUnwritten();
         CheckLibraries(design, typed);
     }
 
 private:
+    static constexpr std::size_t MAX_USES = 256;
+
+    /// Checks many uses at a time, so that the text of their values is read once.
+    void CheckUses() {
+        values.ReadFolds();
+        for (auto const &[use, value] : uses) {
+            if (!use.generic)
+                CheckDeclared(use);
+            else if (use.kind == AttributeUse::INSTANCE)
+                CheckGeneric(use);
+            CheckType(use);
+            CheckLiteral(use);
+            values.Report(use, value);
+        }
+        values.Clear();
+        uses.clear();
+    }
+
     /// Whether a use clause names a package of the user's: those of ieee and std declare none of
     /// the attributes.
     static bool UsesPackages(StringArray const &clauses) {
@@ -233,6 +248,7 @@ private:
     bool useAttrType;
     bool usesPackages;
     ValueChecker values;
+    std::vector<std::pair<AttributeUse, ValueChecker::Value>> uses;          ///< to be checked
     std::unordered_map<std::string, Attribute const *, SeededHash> declared; ///< by name, the first
     std::unordered_map<std::string, Attribute const *, SeededHash> declaredByPorts;
     std::vector<AttributeUse> typed; ///< with types of the user's

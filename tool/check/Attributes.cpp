@@ -22,6 +22,19 @@ Attribute const *ComingBoxTypeOf(Component const &component) {
     return IsVendorCell(component) && !component.GetAttr("BOX_TYPE") ? &boxType : nullptr;
 }
 
+bool IsLeftOut(Design const &design, AttributeUse const &use) {
+    if (use.kind == AttributeUse::COMPONENT)
+        return design.options.vhdlOption.suppressComponent;
+    if (use.kind != AttributeUse::INSTANCE)
+        return false;
+    auto const &instance = static_cast<Instance const &>(*use.owner);
+    if (use.generic)
+        return use.attribute->GetNameRef() == "INIT" && instance.GetComponent() &&
+               TakesInitOfMacro(design, *instance.GetComponent());
+    Attribute const *const inherited = instance.GetComponentAttr(use.attribute->GetNameRef());
+    return inherited && *use.attribute == *inherited;
+}
+
 void AddFinding(Design const &design, Id id, AttributeUse const &use, Languages languages,
                 std::string detail) {
     Spot const spot = design.MadeAt(use.attribute);

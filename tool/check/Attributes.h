@@ -27,10 +27,10 @@ Vesk_Hdl::Attribute const *ComingBoxTypeOf(Vesk_Hdl::Component const &component)
 /// Whether the VHDL configuration takes the component, which has instances, from the library work.
 bool IsConfigured(Design const &design, Vesk_Hdl::Component const &component);
 
-/// Whether no VHDL is written of the attribute: it is that of a component that is not declared.
-inline bool IsLeftOut(Design const &design, AttributeUse const &use) {
-    return use.kind == AttributeUse::COMPONENT && design.options.vhdlOption.suppressComponent;
-}
+/// Whether no VHDL is written of the attribute: that of a component that is not declared, that of
+/// an instance that only repeats its component's, and INIT in place of which a macro hands its own
+/// on.
+bool IsLeftOut(Design const &design, AttributeUse const &use);
 
 /// Adds a finding about an attribute, at the place where it was made.
 void AddFinding(Design const &design, Id id, AttributeUse const &use, Languages languages = BOTH,

@@ -179,17 +179,20 @@ private:
     void CheckIncludes() {
         StringArray const &includes = options.verilogOption.includes;
         std::vector<Spot> const spots = design.TextsAt(&includes, includes.GetSize());
-        WrittenText line;
+        WrittenText lines; // empty if none may fold
+        lines.Add(0, [&includes](OutStream &stream) {
+            VerilogStatements(stream).WriteIncludePath(includes);
+        });
+        lines.ReadFolds();
+        std::size_t end = 0;
         for (int i = 0; i < includes.GetSize(); ++i) {
             Spot const spot = spots[static_cast<std::size_t>(i)];
             Text const path = HdlUtilities::RemoveQuotes(includes.At(i));
             std::string const subject = "include file " + Quoted(path.View());
-            line.Take(0, [&](OutStream &stream) {
-                StringArray include;
-                include.Add(includes.At(i));
-                VerilogStatements(stream).WriteIncludePath(include);
-            });
-            if (line.IsFolded() || path.View().find('"') != std::string_view::npos)
+            std::size_t const begin = end;
+            end = std::min(lines.GetPlain().find('\n', begin), lines.GetPlain().size());
+            if (lines.IsFoldedWithin({begin, end++}) ||
+                path.View().find('"') != std::string_view::npos)
                 design.findings.Add({Id::INCLUDE_PATH, spot, subject});
             AddRefused(path.View(), true, VERILOG, spot, subject);
         }

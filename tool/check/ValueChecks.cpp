@@ -1,6 +1,9 @@
 #include "tool/check/ValueChecks.h"
 
+#include <algorithm>
+#include <functional>
 #include <unordered_map>
+#include <unordered_set>
 
 using namespace Vesk_Hdl;
 
@@ -67,98 +70,126 @@ Languages ValueChecker::QuotedIn(AttributeUse const &use) const {
     return quoted;
 }
 
-void ValueChecker::Check(AttributeUse const &use) {
+ValueChecker::Value ValueChecker::Look(AttributeUse const &use) {
+    Value value;
     Languages const quoted = QuotedIn(use);
     if (quoted == NO_LANGUAGE)
-        return;
+        return value;
     Text const bare = HdlUtilities::RemoveQuotes(use.attribute->GetValueString());
     Text const verilog = ValueInVerilog(*use.attribute);
-    Languages const bad = (BreaksVhdl(bare.View()) ? VHDL : NO_LANGUAGE) |
-                          (BreaksVerilog(verilog.View()) ? VERILOG : NO_LANGUAGE);
-    if ((bad & quoted) != NO_LANGUAGE)
-        AddFinding(design, Id::QUOTED_VALUE, use, bad & quoted);
+    value.broken = quoted & ((BreaksVhdl(bare.View()) ? VHDL : NO_LANGUAGE) |
+                             (BreaksVerilog(verilog.View()) ? VERILOG : NO_LANGUAGE));
     if (!HasBlank(bare) || !design.findings.Wants(Id::FOLDED_VALUE))
-        return;
-    Languages folded = NO_LANGUAGE;
-    if ((quoted & VHDL) != NO_LANGUAGE && FoldsInVhdl(use, bare))
-        folded |= VHDL;
-    if ((quoted & VERILOG) != NO_LANGUAGE && FoldsInVerilog(use, verilog))
-        folded |= VERILOG;
+        return value;
+    if ((quoted & VHDL) != NO_LANGUAGE)
+        LookInVhdl(value, use, bare);
+    if ((quoted & VERILOG) != NO_LANGUAGE)
+        LookInVerilog(value, use, verilog);
+    return value;
+}
+
+void ValueChecker::ReadFolds() {
+    text.ReadFolds();
+    // Further generics of the clause may come after its text is gone.
+    if (!clauseIsRead)
+        std::erase_if(clause,
+                      [this](Item const &item) { return !text.IsFoldedWithin(item.range); });
+    clauseIsRead = true;
+}
+
+void ValueChecker::Report(AttributeUse const &use, Value const &value) const {
+    if (value.broken != NO_LANGUAGE)
+        AddFinding(design, Id::QUOTED_VALUE, use, value.broken);
+    Languages const folded = value.folded | (text.IsFoldedWithin(value.vhdl) ? VHDL : NO_LANGUAGE) |
+                             (text.IsFoldedWithin(value.verilog) ? VERILOG : NO_LANGUAGE);
     if (folded != NO_LANGUAGE)
         AddFinding(design, Id::FOLDED_VALUE, use, folded);
 }
 
-bool ValueChecker::FoldsInVhdl(AttributeUse const &use, Text const &value) {
-    if (use.generic) {
-        if (clauseOwner != use.owner)
-            ReadClause(use);
-        return foldedInClause.count(use.attribute) > 0;
+void ValueChecker::LookInVhdl(Value &value, AttributeUse const &use, Text const &bare) {
+    if (!use.generic) {
+        value.vhdl = AddStatement(
+            [&](OutStream &stream) {
+                VhdlStatements(stream).WriteAttrAssignment(
+                    use.attribute, std::string(BaseOf(*use.owner)).c_str(), ClassOf(use.kind),
+                    design.options.vhdlOption.useAttrType);
+            },
+            bare);
+        return;
     }
-    return FoldsInStatement(
-        [&](OutStream &stream) {
-            VhdlStatements(stream).WriteAttrAssignment(
-                use.attribute, std::string(BaseOf(*use.owner)).c_str(), ClassOf(use.kind),
-                design.options.vhdlOption.useAttrType);
-        },
-        value);
+    if (clauseOwner != use.owner)
+        AddClause(use);
+    auto const item = std::lower_bound(clause.begin(), clause.end(), use.attribute,
+                                       [](Item const &left, Attribute const *right) {
+                                           return std::less<>()(left.generic, right);
+                                       });
+    if (item == clause.end() || item->generic != use.attribute)
+        return;
+    if (clauseIsRead)
+        value.folded |= VHDL;
+    else
+        value.vhdl = item->range;
 }
 
 /// A component's generics are written at its instances, a module's as parameters.
-bool ValueChecker::FoldsInVerilog(AttributeUse const &use, Text const &value) {
+void ValueChecker::LookInVerilog(Value &value, AttributeUse const &use, Text const &verilog) {
     if (use.kind == AttributeUse::INSTANCE)
-        return FoldsAsDefparam(static_cast<Instance const &>(*use.owner), *use.attribute);
-    return use.kind == AttributeUse::MODULE &&
-           FoldsInStatement(
-               [&](OutStream &stream) {
-                   VerilogStatements(stream).WriteParameterStatement(use.attribute);
-                   stream << ";" << OutStream::NEW_LINE;
-               },
-               value);
+        value.verilog =
+            AddDefparam(static_cast<Instance const &>(*use.owner), *use.attribute, verilog);
+    else if (use.kind == AttributeUse::MODULE)
+        value.verilog = AddStatement(
+            [&use](OutStream &stream) {
+                VerilogStatements(stream).WriteParameterStatement(use.attribute);
+                stream << ";" << OutStream::NEW_LINE;
+            },
+            verilog);
 }
 
-bool ValueChecker::FoldsAsDefparam(Instance const &instance, Attribute const &attribute) {
-    return FoldsInStatement(
+WrittenText::Range ValueChecker::AddDefparam(Instance const &instance, Attribute const &attribute,
+                                             Text const &value) {
+    return AddStatement(
         [&](OutStream &stream) {
             VerilogStatements(stream).WriteDefParamStatement(&attribute, instance.GetNameRef());
             stream << ";" << OutStream::NEW_LINE;
         },
-        ValueInVerilog(attribute));
+        value);
 }
 
-/// Of one statement in an architecture or a module, which has the value at its end.
-bool ValueChecker::FoldsInStatement(WrittenText::Write const &write, Text const &value) {
-    text.Take(1, write);
+/// Adds a statement of an architecture or a module and returns the place of the value at its end.
+WrittenText::Range ValueChecker::AddStatement(WrittenText::Write const &write, Text const &value) {
+    if (!text.Add(1, write))
+        return {};
     std::size_t const end = text.GetPlain().rfind('"');
-    return text.IsFoldedWithin(end - value.GetLength(), end);
+    return {end - value.GetLength(), end};
 }
 
-/// Finds the generics of the clause that are folded within their quotes. Where an item begins and
-/// what follows it on its line depends on the others: the clause is written as a whole.
-void ValueChecker::ReadClause(AttributeUse const &use) {
+/// Adds a clause and finds the places of its strings. Where an item begins and what follows it on
+/// its line depends on the others: the clause is written as a whole.
+void ValueChecker::AddClause(AttributeUse const &use) {
     auto const &holder = dynamic_cast<AttributeHolder const &>(*use.owner);
     clauseOwner = use.owner;
-    foldedInClause.clear();
-    text.Take(use.kind == AttributeUse::COMPONENT ? 2 : 1, [&](OutStream &stream) {
-        VhdlNetlister netlister(stream);
+    clauseIsRead = false;
+    clause.clear();
+    bool const mayFold = text.Add(use.kind == AttributeUse::COMPONENT ? 2 : 1, [&](OutStream &to) {
+        VhdlNetlister netlister(to);
         if (use.kind == AttributeUse::INSTANCE)
             netlister.WriteGenericAssociations(static_cast<Instance const &>(*use.owner),
                                                HandsInitOn(design));
         else
             netlister.WriteGenericDeclarations(holder);
     });
-    if (!text.IsFolded())
+    if (!mayFold)
         return;
-    std::size_t from = 0;
+    std::size_t from = text.GetLastBegin();
     auto const lookAt = [&](Attribute const *generic) {
-        std::string const item = ItemOf(use, *generic);
-        std::size_t const begin = text.GetPlain().find(" " + item, from);
+        std::string const item = " " + ItemOf(use, *generic);
+        std::size_t const begin = text.GetPlain().find(item, from);
         if (begin == std::string::npos)
             return; // in its place the macro hands its own one on
-        from = begin + item.size();
+        from = begin + item.size() - 1;
         Text const value = HdlUtilities::RemoveQuotes(generic->GetValueString());
-        if (generic->GetValueType() == Attribute::VALUE_STRING &&
-            text.IsFoldedWithin(from - value.GetLength(), from))
-            foldedInClause.insert(generic);
+        if (generic->GetValueType() == Attribute::VALUE_STRING)
+            clause.push_back({generic, {from - value.GetLength(), from}});
     };
     // Generics for simulation only come last.
     for (bool const isSyn : {true, false})
@@ -166,6 +197,9 @@ void ValueChecker::ReadClause(AttributeUse const &use) {
             if (isSyn ? generic->IsGenericSyn() : generic->IsGenericNoSyn())
                 lookAt(generic);
         });
+    std::sort(clause.begin(), clause.end(), [](Item const &left, Item const &right) {
+        return std::less<>()(left.generic, right.generic);
+    });
 }
 
 /// The generics of a component that a Verilog line of an instance may break.
@@ -184,6 +218,17 @@ void ValueChecker::CheckInherited() {
     if (!design.findings.Wants(Id::FOLDED_VALUE))
         return;
     std::unordered_map<Component const *, std::vector<AttributeUse>> inheritable;
+    std::unordered_set<Attribute const *> reported;
+    std::vector<Inherited> added;
+    auto const report = [&] {
+        text.ReadFolds();
+        for (Inherited const &one : added)
+            if (text.IsFoldedWithin(one.range) && reported.insert(one.use.attribute).second)
+                AddFinding(design, Id::FOLDED_VALUE, one.use, VERILOG,
+                           "at the instance " + Quoted(one.instance->GetNameRef().View()));
+        added.clear();
+        text.Clear();
+    };
     design.ForEachInstance([&](Instance const *instance) {
         Component const *const component = instance->GetComponent();
         if (!component || !component->HasAttrs())
@@ -192,15 +237,20 @@ void ValueChecker::CheckInherited() {
         std::vector<AttributeUse> &uses = known->second;
         if (isNew)
             uses = FindInheritable(*component);
-        std::erase_if(uses, [&](AttributeUse const &use) {
-            if (instance->GetAttr(use.attribute->GetNameRef()) ||
-                !FoldsAsDefparam(*instance, *use.attribute))
-                return false;
-            AddFinding(design, Id::FOLDED_VALUE, use, VERILOG,
-                       "at the instance " + Quoted(instance->GetNameRef().View()));
-            return true;
-        });
+        std::erase_if(uses,
+                      [&](AttributeUse const &use) { return reported.count(use.attribute) > 0; });
+        for (AttributeUse const &use : uses) {
+            if (instance->GetAttr(use.attribute->GetNameRef()))
+                continue;
+            WrittenText::Range const range =
+                AddDefparam(*instance, *use.attribute, ValueInVerilog(*use.attribute));
+            if (range.end > 0)
+                added.push_back({use, instance, range});
+        }
+        if (text.IsFull())
+            report();
     });
+    report();
 }
 
 } // namespace Checks

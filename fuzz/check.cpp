@@ -39,7 +39,7 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
     run.GetModel().SetWriteOpener(&capture);
     Checks::Checker checker("hdlNetlist", Checks::NO_LANGUAGE);
     checker.BeginFile("/dev/null", "x");
-    Place place{"x"};
+    SourceRange place{"x"};
     for (std::string const &line : lines) {
         ++place.line;
         auto const ran = run.RunLine(line, place);

@@ -18,7 +18,7 @@ int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
         }
     } noFile;
     session.GetModel().SetWriteOpener(&noFile);
-    Place place{"x"};
+    SourceRange place{"x"};
     for (std::string line; std::getline(lines, line);) {
         ++place.line;
         auto const diagnostic = session.RunLine(line, place);

@@ -1,13 +1,16 @@
-// The tokenizer of command lines. Without quotes it gives what a plain split gives; tokens written
-// down with quotes again read as the same tokens, and each has the place that the parser reports.
+// The tokenizer of command lines, and the values that tokens are read as. Without quotes it gives
+// what a plain split gives; tokens written down with quotes again read as the same tokens, and each
+// has the place that the parser reports. Every text can be set as a value, whose own text gives the
+// same value.
 
 #include <algorithm>
+#include <memory>
 #include <vector>
 
 #include "fuzz/Fuzz.h"
 #include "vesk_hdl/Vesk_Hdl.h"
 
-using Vesk_Hdl::StringArray;
+using namespace Vesk_Hdl;
 
 namespace {
 
@@ -36,10 +39,59 @@ void CheckPlaces(std::string const &text, StringArray const &tokens,
     }
 }
 
+/// Tokens between which empty ones count, and what is a number among them.
+void CheckKeepingEmpty(std::string const &text) {
+    StringArray const tokens(text.c_str(), " ", false, nullptr);
+    int count = 0;
+    for (std::size_t at = 0; at < text.size(); ++count) {
+        std::size_t const end = std::min(text.find(' ', at), text.size());
+        std::string const token = text.substr(at, end - at);
+        FUZZ_EXPECT(tokens.At(count).View() == token, "token %d", count);
+        int number = 77;
+        bool const isNumber = tokens.GetIntAt(count, number, 0);
+        std::size_t const sign = token.find_first_of("+-") == 0 ? 1 : 0;
+        bool const isDigits =
+            token.size() > sign && token.find_first_not_of("0123456789", sign) == std::string::npos;
+        FUZZ_EXPECT(isDigits ? token.size() > 9 || number == std::stoi(token)
+                             : !isNumber && number == 77,
+                    "%s: %d", token.c_str(), number);
+        at = end + 1;
+    }
+    FUZZ_EXPECT(tokens.GetSize() == count, "%d", tokens.GetSize());
+}
+
+void CheckValues(std::string const &text) {
+    BitVectorValue value;
+    value.SetValue(text.c_str());
+    BitVectorValue const copy(value);
+    value.SetValue("4:b:1010");
+    value = copy;
+    FUZZ_EXPECT(value.GetValue() == copy.GetValue() && value.GetLength() == copy.GetLength() &&
+                    value.GetBase() == copy.GetBase(),
+                "copy");
+    for (char const *const type :
+         {"String", "Integer", "Float", "Boolean", "Bit", "BitVector", "User"}) {
+        std::unique_ptr<Attribute> const attribute(
+            AttributeFactory::GetInstance().CreateAttribute(type, "name", text.c_str()));
+        std::string const shown(attribute->GetValueString());
+        std::unique_ptr<Attribute> const clone(attribute->CloneAttribute());
+        // A copy of a float has another width and precision, and so another text.
+        if (dynamic_cast<AttributeFloat *>(clone.get()))
+            continue;
+        FUZZ_EXPECT(*clone == *attribute, "clone of %s", type);
+        attribute->SetValue("0");
+        attribute->SetValue(shown.c_str());
+        FUZZ_EXPECT(std::string(attribute->GetValueString()) == shown, "%s: %s", type,
+                    shown.c_str());
+    }
+}
+
 } // namespace
 
 int LLVMFuzzerTestOneInput(std::uint8_t const *data, std::size_t size) {
     std::string const text = TextOf(data, size);
+    CheckKeepingEmpty(text);
+    CheckValues(text);
 
     StringArray const plain(text.c_str(), " ", true, nullptr);
     std::vector<std::string> const split = Split(text, " ");

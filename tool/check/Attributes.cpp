@@ -37,7 +37,7 @@ bool IsLeftOut(Design const &design, AttributeUse const &use) {
 
 void AddFinding(Design const &design, Id id, AttributeUse const &use, Languages languages,
                 std::string detail) {
-    Spot const spot = design.MadeAt(use.attribute);
+    CompactLocation const spot = design.MadeAt(use.attribute);
     design.findings.Add({id,
                          spot.line > 0 ? spot : design.MadeAt(use.owner),
                          "attribute " + Quoted(use.attribute->GetNameRef().View()) + " of " +

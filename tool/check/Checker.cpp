@@ -23,7 +23,7 @@ Languages LanguageOf(CommandHelp const &command) {
 
 } // namespace
 
-std::optional<Diagnostic> Checker::RunLine(std::string const &line, Place const &place) {
+std::optional<Diagnostic> Checker::RunLine(std::string const &line, SourceRange const &place) {
     std::uint32_t const number = places.NextLine(line);
     tokens.Read(line);
     CommandHelp const *const command = CommandReference::FindFor(tokens.GetTokens());
@@ -49,7 +49,7 @@ void Checker::Finish(std::function<void(Diagnostic &)> const &show) {
 
 /// A line that writes: its arguments are read and what it would write is checked. The design stays
 /// as it is until the next line: most often there is none, and no text need be made.
-std::optional<Diagnostic> Checker::PassWrite(std::string const &line, Place const &place,
+std::optional<Diagnostic> Checker::PassWrite(std::string const &line, SourceRange const &place,
                                              std::uint32_t number, CommandHelp const &command) {
     WriteArguments arguments;
     if (!arguments.Parse(tokens.GetTokens(), command.words)) {
@@ -82,7 +82,7 @@ void Checker::RewriteDesign() {
 void Checker::CheckWriteLine(std::uint32_t number, int first, WriteArguments const &arguments) {
     int const file = arguments.fileToken;
     auto const add = [&](Id id, int token) {
-        findings.Add({id, SpotOf(tokens, token, number), Quoted(tokens.At(token))});
+        findings.Add({id, LocationOf(tokens, token, number), Quoted(tokens.At(token))});
     };
     if (tokens.At(file).substr(0, 1) == "-")
         add(Id::WRITE_FILE_NAME, file);
@@ -94,7 +94,7 @@ void Checker::CheckWriteLine(std::uint32_t number, int first, WriteArguments con
     Languages const readers = RefusedInComment(path.substr(path.rfind('/') + 1));
     if (arguments.writeHeader && readers != NO_LANGUAGE)
         findings.Add({Id::TEXT_CHARACTER,
-                      SpotOf(tokens, file, number),
+                      LocationOf(tokens, file, number),
                       "file name " + Quoted(path) + " in the header",
                       {},
                       readers});

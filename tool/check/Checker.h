@@ -25,14 +25,14 @@ public:
     }
     /// Runs a line, but for one that writes: there, nothing is written. Tells what is wrong if it
     /// is refused.
-    std::optional<Diagnostic> RunLine(std::string const &line, Place const &place);
+    std::optional<Diagnostic> RunLine(std::string const &line, SourceRange const &place);
     /// Behind the last line: calls `show` with each finding, in the order of the lines.
     void Finish(std::function<void(Diagnostic &)> const &show);
 
     Vesk_Hdl::Model &GetModel() { return session.GetModel(); }
 
 private:
-    std::optional<Diagnostic> PassWrite(std::string const &line, Place const &place,
+    std::optional<Diagnostic> PassWrite(std::string const &line, SourceRange const &place,
                                         std::uint32_t number, Vesk_Hdl::CommandHelp const &command);
     void RewriteDesign();
     void CheckWriteLine(std::uint32_t number, int first, Vesk_Hdl::WriteArguments const &arguments);
@@ -43,7 +43,7 @@ private:
     }
 
     Session session;
-    Places places;
+    LocationMap places;
     Findings findings;
     Recorder recorder;
     LineTokens tokens; ///< of the line that runs

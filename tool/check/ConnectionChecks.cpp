@@ -155,7 +155,7 @@ void CheckReturns(Design const &design, Signal const &signal) {
         Instance const *const owner = design.OwnerOf(pin);
         design.findings.Add(
             {Id::PIN_RETURNS,
-             design.places.Find(Places::CONNECTED, pin),
+             design.places.Find(LocationMap::CONNECTED, pin),
              owner ? PinName(*owner, *pin) : "pin " + Quoted(pin->GetNameRef().View()),
              {{&signal, "its first net is here"}},
              BOTH,

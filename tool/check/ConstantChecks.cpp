@@ -98,7 +98,7 @@ void CheckSharedConstant(Design const &design, Signal const &signal) {
             design.findings.Add({Id::SHARED_CONSTANT,
                                  design.ConnectedAt(*instance, *use.pin),
                                  PinName(*instance, *use.pin),
-                                 {{former, "the other pin is here", Places::CONNECTED}},
+                                 {{former, "the other pin is here", LocationMap::CONNECTED}},
                                  BOTH,
                                  Quoted(signal.GetNameRef().View())});
         else

@@ -8,7 +8,7 @@ using namespace Vesk_Hdl;
 
 namespace Checks {
 
-Design::Design(Model &model, Places const &madePlaces, Recorder const &history,
+Design::Design(Model &model, LocationMap const &madePlaces, Recorder const &history,
                Findings &foundThings)
     : netlist(*model.GetNetlist()), options(*model.GetOptions()), places(madePlaces),
       recorder(history), findings(foundThings), dummies(netlist) {
@@ -22,34 +22,34 @@ Design::Design(Model &model, Places const &madePlaces, Recorder const &history,
     FindUses();
 }
 
-Spot Design::ConnectedAt(Instance const &instance, Pin const &pin) const {
-    Spot const spot = places.Find(Places::CONNECTED, &pin);
+CompactLocation Design::ConnectedAt(Instance const &instance, Pin const &pin) const {
+    CompactLocation const spot = places.Find(LocationMap::CONNECTED, &pin);
     return spot.line > 0 ? spot : MadeAt(&instance);
 }
 
-Spot Design::NetAt(Signal const &signal) const {
-    Spot const spot = MadeAt(&signal);
+CompactLocation Design::NetAt(Signal const &signal) const {
+    CompactLocation const spot = MadeAt(&signal);
     if (spot.line > 0)
         return spot;
     Bus const *const bus = BusOf(signal);
     return bus ? MadeAt(bus) : spot;
 }
 
-Spot Design::ConstantAt(Signal const &signal) const {
-    Spot const spot = places.Find(Places::CONSTANT, &signal);
+CompactLocation Design::ConstantAt(Signal const &signal) const {
+    CompactLocation const spot = places.Find(LocationMap::CONSTANT, &signal);
     return spot.line > 0 ? spot : NetAt(signal);
 }
 
-Spot Design::AssignedAt(Signal const &signal) const {
-    Spot const spot = places.Find(Places::ASSIGNED, &signal);
+CompactLocation Design::AssignedAt(Signal const &signal) const {
+    CompactLocation const spot = places.Find(LocationMap::ASSIGNED, &signal);
     return spot.line > 0 ? spot : NetAt(signal);
 }
 
-std::vector<Spot> Design::TextsAt(void const *owner, int count) const {
-    std::vector<Spot> spots(static_cast<std::size_t>(count));
-    std::uint32_t before = Places::EVER;
+std::vector<CompactLocation> Design::TextsAt(void const *owner, int count) const {
+    std::vector<CompactLocation> spots(static_cast<std::size_t>(count));
+    std::uint32_t before = LocationMap::EVER;
     for (auto spot = spots.rbegin(); spot != spots.rend(); ++spot) {
-        *spot = places.Find(Places::TEXT, owner, before);
+        *spot = places.Find(LocationMap::TEXT, owner, before);
         before = spot->line;
     }
     return spots;

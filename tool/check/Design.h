@@ -24,16 +24,18 @@ struct Use {
 /// for each write that is checked, in one walk over the design.
 class Design {
 public:
-    Design(Vesk_Hdl::Model &model, Places const &madePlaces, Recorder const &history,
+    Design(Vesk_Hdl::Model &model, LocationMap const &madePlaces, Recorder const &history,
            Findings &foundThings);
 
-    Spot MadeAt(void const *object) const { return places.Find(Places::MADE, object); }
+    CompactLocation MadeAt(void const *object) const {
+        return places.Find(LocationMap::MADE, object);
+    }
     /// Where a pin got its net, or where its instance was made.
-    Spot ConnectedAt(Vesk_Hdl::Instance const &instance, Vesk_Hdl::Pin const &pin) const;
+    CompactLocation ConnectedAt(Vesk_Hdl::Instance const &instance, Vesk_Hdl::Pin const &pin) const;
     /// Where a net was made; of a part that is outside the netlist, where its bus was.
-    Spot NetAt(Vesk_Hdl::Signal const &signal) const;
-    Spot ConstantAt(Vesk_Hdl::Signal const &signal) const;
-    Spot AssignedAt(Vesk_Hdl::Signal const &signal) const;
+    CompactLocation NetAt(Vesk_Hdl::Signal const &signal) const;
+    CompactLocation ConstantAt(Vesk_Hdl::Signal const &signal) const;
+    CompactLocation AssignedAt(Vesk_Hdl::Signal const &signal) const;
 
     bool IsUsed(Vesk_Hdl::Component const *component) const {
         return firstInstances.count(component) > 0;
@@ -44,8 +46,10 @@ public:
     }
     /// Where an option got its text; where a list of options or a comment got each of its texts,
     /// which are `count`.
-    Spot TextAt(void const *option) const { return places.Find(Places::TEXT, option); }
-    std::vector<Spot> TextsAt(void const *owner, int count) const;
+    CompactLocation TextAt(void const *option) const {
+        return places.Find(LocationMap::TEXT, option);
+    }
+    std::vector<CompactLocation> TextsAt(void const *owner, int count) const;
     /// Whether a bit or slice occurs anywhere in the text.
     bool IsWritten(Vesk_Hdl::Signal const &part) const;
     /// The bus of a bit or slice, null if there is none.
@@ -89,7 +93,7 @@ public:
 
     Vesk_Hdl::Netlist const &netlist;
     Vesk_Hdl::HdlOptions const &options;
-    Places const &places;
+    LocationMap const &places;
     Recorder const &recorder;
     Findings &findings;
     std::unordered_map<Vesk_Hdl::Component const *, Vesk_Hdl::Instance const *> firstInstances;

@@ -11,7 +11,7 @@ namespace Checks {
 
 namespace {
 
-Diagnostic DiagnosticOf(Finding const &finding, Places const &places) {
+Diagnostic DiagnosticOf(Finding const &finding, LocationMap const &places) {
     Row const &row = Get(finding.id);
     Diagnostic diagnostic;
     diagnostic.severity = Severity::WARNING;
@@ -21,7 +21,7 @@ Diagnostic DiagnosticOf(Finding const &finding, Places const &places) {
         diagnostic.message += " (" + finding.detail + ")";
     diagnostic.hints = {row.hint};
     for (Related const &related : finding.related) {
-        Spot const spot = places.Find(related.event, related.object, related.before);
+        CompactLocation const spot = places.Find(related.event, related.object, related.before);
         if (spot.line > 0)
             diagnostic.notes.push_back({places.GetPlace(spot), related.text});
     }
@@ -57,18 +57,18 @@ void Findings::Add(Finding finding) {
     findings.pop_back();
 }
 
-void Findings::Show(Places const &places, std::function<void(Diagnostic &)> const &show) {
+void Findings::Show(LocationMap const &places, std::function<void(Diagnostic &)> const &show) {
     known.clear();
     std::vector<std::uint32_t> order(findings.size());
     std::iota(order.begin(), order.end(), 0);
     std::sort(order.begin(), order.end(), [this](std::uint32_t left, std::uint32_t right) {
-        Spot const &a = findings[left].spot;
-        Spot const &b = findings[right].spot;
+        CompactLocation const &a = findings[left].spot;
+        CompactLocation const &b = findings[right].spot;
         return a.line != b.line       ? a.line < b.line
                : a.column != b.column ? a.column < b.column
                                       : left < right;
     });
-    Places::SourceReader sources(places);
+    LocationMap::SourceReader sources(places);
     for (std::uint32_t const number : order) {
         Finding const &finding = findings[number];
         Diagnostic diagnostic = DiagnosticOf(finding, places);

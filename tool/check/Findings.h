@@ -7,7 +7,7 @@
 #include <vector>
 
 #include "tool/check/Checks.h"
-#include "tool/check/Places.h"
+#include "tool/check/LocationMap.h"
 #include "tool/diagnostics/Diagnostic.h"
 
 namespace Checks {
@@ -17,15 +17,15 @@ namespace Checks {
 struct Related {
     void const *object;
     std::string text;
-    Places::Event event = Places::MADE;
-    std::uint32_t before = Places::EVER;
+    LocationMap::Event event = LocationMap::MADE;
+    std::uint32_t before = LocationMap::EVER;
 };
 
 /// What a check found. It holds places, never lines, and names as `Quoted` shortens them: a line as
 /// long as the file may have as many findings as it has names.
 struct Finding {
     Id id;
-    Spot spot;
+    CompactLocation spot;
     std::string subject; ///< what was found, in front of the sentence
     std::vector<Related> related = {};
     Languages languages = BOTH; ///< of those of the check
@@ -45,7 +45,7 @@ public:
     void Add(Finding finding);
     /// Calls `show` with each of what came in and forgets it. The lines are read again meanwhile;
     /// without findings nothing is read.
-    void Show(Places const &places, std::function<void(Diagnostic &)> const &show);
+    void Show(LocationMap const &places, std::function<void(Diagnostic &)> const &show);
 
 private:
     /// Findings by their number. Two are the same if check, line and, in any case, subject are.

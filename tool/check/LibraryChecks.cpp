@@ -65,13 +65,13 @@ public:
 private:
     /// Calls `act` with each text of a list and where it was added.
     template <class Act> void ForEachClause(StringArray const &clauses, Act act) const {
-        std::vector<Spot> const spots = design.TextsAt(&clauses, clauses.GetSize());
+        std::vector<CompactLocation> const spots = design.TextsAt(&clauses, clauses.GetSize());
         for (int i = 0; i < clauses.GetSize(); ++i)
             act(std::string(clauses.At(i).View()), spots[static_cast<std::size_t>(i)]);
     }
 
     void CheckLibraries() {
-        ForEachClause(vhdl.libraries, [this](std::string const &clause, Spot spot) {
+        ForEachClause(vhdl.libraries, [this](std::string const &clause, CompactLocation spot) {
             std::vector<std::string> const names = Split(clause, ',');
             if (!std::all_of(names.begin(), names.end(), IsName))
                 design.findings.Add({Id::ILLEGAL_LIBRARY, spot, "library " + Quoted(clause)});
@@ -80,14 +80,15 @@ private:
     }
 
     void CheckUseClauses() {
-        ForEachClause(vhdl.useLibraries, [this](std::string const &clause, Spot spot) {
+        ForEachClause(vhdl.useLibraries, [this](std::string const &clause, CompactLocation spot) {
             for (std::string const &name : Split(clause, ','))
                 CheckUse(Split(name, '.'), "use clause " + Quoted(clause), spot);
         });
     }
 
     /// LIBRARY.PACKAGE.all or a shorter name that begins with what is visible.
-    void CheckUse(std::vector<std::string> const &parts, std::string const &subject, Spot spot) {
+    void CheckUse(std::vector<std::string> const &parts, std::string const &subject,
+                  CompactLocation spot) {
         constexpr std::size_t MOST = 3;
         std::string const &last = parts.back();
         bool const isOperator = !last.empty() && (last.front() == '"' || last.front() == '\'');

@@ -43,7 +43,7 @@ void CheckComponent(Design const &design, Component const &component, Attribute 
         detail = VhdlTypeOf(*init) + " for " + VhdlTypeOf(handed);
     if (detail.empty())
         return;
-    Spot const spot = design.MadeAt(init);
+    CompactLocation const spot = design.MadeAt(init);
     design.findings.Add({Id::HANDED_INIT,
                          spot.line > 0 ? spot : design.MadeAt(&component),
                          "attribute \"INIT\" of " + Quoted(component.GetNameRef().View()),
@@ -57,7 +57,7 @@ void CheckInstance(Design const &design, Instance const &instance) {
     Attribute const *const init = InitOf(instance);
     if (!init || !init->IsGenericNoSyn())
         return;
-    Spot const spot = design.MadeAt(init);
+    CompactLocation const spot = design.MadeAt(init);
     design.findings.Add({Id::DOUBLE_DEFPARAM, spot.line > 0 ? spot : design.MadeAt(&instance),
                          "attribute \"INIT\" of " + Quoted(instance.GetNameRef().View())});
 }

@@ -114,7 +114,7 @@ private:
         name += '_';
         name += isBus ? BaseOf(pin) : pin.GetNameRef().View();
         name += "_openSignal";
-        auto const add = [&](Id id, Spot spot, std::string subject, Languages languages,
+        auto const add = [&](Id id, CompactLocation spot, std::string subject, Languages languages,
                              std::vector<Related> related = {}) {
             design.findings.Add({id, spot, std::move(subject), std::move(related),
                                  languages & writers, Quoted(name)});

@@ -303,7 +303,7 @@ private:
 
     void AddClash(Id id, std::string const &what, Object const &found, Object const &other,
                   Languages languages) {
-        Spot const spot = design.MadeAt(&found);
+        CompactLocation const spot = design.MadeAt(&found);
         design.findings.Add({id,
                              spot.line > 0 ? spot : design.MadeAt(&other),
                              what + " " + Quoted(found.GetNameRef().View()),

@@ -160,16 +160,17 @@ private:
         if (Pin const *const pin = bitUse.use.pin) {
             Instance const *const owner = design.OwnerOf(pin);
             std::string const name = owner ? PinName(*owner, *pin) : "a pin";
-            return {{pin, verb + name, Places::CONNECTED}};
+            return {{pin, verb + name, LocationMap::CONNECTED}};
         }
         if (!bitUse.through)
             return {{&net, "driven from outside, being an in port"}};
         if (Signal const *const source = bitUse.use.source)
             return {{bitUse.through, "assigned from " + Quoted(source->GetNameRef().View()),
-                     Places::ASSIGNED}};
+                     LocationMap::ASSIGNED}};
         return bitUse.use.kind == Use::READS
                    ? std::vector<Related>()
-                   : std::vector<Related>{{bitUse.through, "given a constant", Places::CONSTANT}};
+                   : std::vector<Related>{
+                         {bitUse.through, "given a constant", LocationMap::CONSTANT}};
     }
 
     Design const &design;

@@ -31,7 +31,7 @@ void CheckComponent(Design const &design, Component const &component) {
     std::map<std::string, Pin const *> pinsByBase;
     ForEach(component.GetPinIterator(), [&](Pin const *pin) {
         bool const isBit = BusIndex::IsBusIndexName(pin->GetNameRef());
-        Spot const spot = design.MadeAt(pin);
+        CompactLocation const spot = design.MadeAt(pin);
         if (IsScalarWithBrackets(*pin) && (isBit || Bus::IsBusName(pin->GetNameRef())))
             design.findings.Add({Id::BRACKETED_PIN,
                                  spot,

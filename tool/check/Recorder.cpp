@@ -117,7 +117,7 @@ bool Recorder::NameOne(Text const &name, int token, Origin origin) {
     if (places.HasOpen()) {
         Bus const *const bus = netlist.GetParentBus(name);
         if (bus && places.TakeOpen(bus))
-            places.Put(Places::MADE, bus, SpotOf(token));
+            places.Put(LocationMap::MADE, bus, LocationOf(token));
     }
     Signal const *const signal = model.GetSignal(name);
     bool const existed = signal && !places.TakeOpen(signal);
@@ -223,7 +223,7 @@ void Recorder::RecordNets() {
             continue;
         }
         places.TakeOpen(signal);
-        places.Put(Places::MADE, signal, SpotOf(named.token));
+        places.Put(LocationMap::MADE, signal, LocationOf(named.token));
         if (!respelled.empty())
             respelled.erase(signal);
         bool const bracketed = named.origin == Origin::BRACKETS &&
@@ -242,7 +242,7 @@ void Recorder::CompareSpelling(Named const &named, Signal const &signal) {
         !respelled.insert(&signal).second)
         return;
     findings.Add({Id::CASE_DIFFERS,
-                  SpotOf(named.token),
+                  LocationOf(named.token),
                   "net " + Quoted(typed),
                   {{&signal, "it is called " + Quoted(made) + " here"}}});
 }
@@ -255,8 +255,8 @@ void Recorder::RecordPin() {
     int const pinToken = firstArgument + (connects ? 1 : 0);
     if (!connects) {
         if (net != formerNet)
-            places.Put(Places::MADE, net, SpotOf(pinToken));
-        places.Put(Places::CONSTANT, net, SpotOf(pinToken));
+            places.Put(LocationMap::MADE, net, LocationOf(pinToken));
+        places.Put(LocationMap::CONSTANT, net, LocationOf(pinToken));
     }
     if (net == formerNet && !connects)
         return;
@@ -266,13 +266,13 @@ void Recorder::RecordPin() {
             movedTies.emplace(net, pin);
         findings.Add(
             {Id::PIN_MOVED,
-             SpotOf(pinToken),
+             LocationOf(pinToken),
              "pin " + Quoted(tokens->At(pinToken)),
-             {{pin, "the former net was given here", Places::CONNECTED, lineNumber}},
+             {{pin, "the former net was given here", LocationMap::CONNECTED, lineNumber}},
              BOTH,
              "from " + Quoted(formerNetName.View()) + " to " + Quoted(net->GetNameRef().View())});
     }
-    places.Put(Places::CONNECTED, pin, SpotOf(pinToken));
+    places.Put(LocationMap::CONNECTED, pin, LocationOf(pinToken));
 }
 
 /// The old bus is gone: it is known by its name and by what it had. A slice of the new one has its
@@ -281,18 +281,18 @@ void Recorder::RecordWidening(Widened const &widened) {
     Bus *const wide = netlist.GetParentBus(widened.name);
     if (!wide)
         return;
-    places.Put(Places::MADE, wide, SpotOf(widened.lastToken));
+    places.Put(LocationMap::MADE, wide, LocationOf(widened.lastToken));
     if (!widened.losses.empty())
         findings.Add({Id::WIDENED_BUS,
-                      SpotOf(widened.firstToken),
+                      LocationOf(widened.firstToken),
                       "bus " + Quoted(widened.name.View()),
-                      {{widened.bus, "it was made here", Places::MADE, lineNumber}},
+                      {{widened.bus, "it was made here", LocationMap::MADE, lineNumber}},
                       BOTH,
                       "to " + Quoted(wide->GetNameRef().View()) + "; lost: " + widened.losses});
     for (Iterator<Signal *> slices = wide->GetBusSliceIterator(); slices.HasMore();
          slices.Advance())
         if (slices.Current() && slices.Current()->GetNameRef() == widened.name) {
-            places.Put(Places::MADE, slices.Current(), SpotOf(widened.lastToken));
+            places.Put(LocationMap::MADE, slices.Current(), LocationOf(widened.lastToken));
             RecordReturns(widened, *slices.Current());
             break;
         }
@@ -310,9 +310,9 @@ void Recorder::RecordReturns(Widened const &widened, Signal &slice) {
             found->second = &slice;
         else if (found->second != &slice && listed != pin)
             findings.Add({Id::PIN_RETURNS,
-                          SpotOf(widened.firstToken),
+                          LocationOf(widened.firstToken),
                           "pin " + Quoted(listed->GetNameRef().View()),
-                          {{listed, "it was connected here", Places::CONNECTED, lineNumber}},
+                          {{listed, "it was connected here", LocationMap::CONNECTED, lineNumber}},
                           BOTH,
                           "widening takes along all that was ever connected"});
     });
@@ -327,8 +327,8 @@ void Recorder::RecordAssignment() {
     bool const isAssignment = kind == Kind::CONNECT && netCount >= 2 && !pin;
     if (isAssignment || (kind == Kind::ASSIGN && !pin && netCount > 0))
         if (Signal const *const target = model.GetSignal(firstNet))
-            places.Put(isAssignment ? Places::ASSIGNED : Places::CONSTANT, target,
-                       SpotOf(firstArgument));
+            places.Put(isAssignment ? LocationMap::ASSIGNED : LocationMap::CONSTANT, target,
+                       LocationOf(firstArgument));
 }
 
 void Recorder::RecordDeclaration() {
@@ -349,14 +349,14 @@ void Recorder::RecordDeclaration() {
         made = &netlist;
     }
     if (made)
-        places.Put(Places::MADE, made, SpotOf(token));
+        places.Put(LocationMap::MADE, made, LocationOf(token));
 }
 
 void Recorder::RecordAttribute() {
     if (!holder)
         return;
     if (Attribute const *const made = holder->GetAttr(Normal(tokens->At(attributeToken)).c_str()))
-        places.Put(Places::MADE, made, SpotOf(attributeToken));
+        places.Put(LocationMap::MADE, made, LocationOf(attributeToken));
 }
 
 /// What the line gave a comment, or the option that it set or added to; null for other lines.
@@ -371,9 +371,10 @@ void const *Recorder::OwnerOfText() const {
 
 void Recorder::RecordText() {
     if (void const *const owner = OwnerOfText())
-        places.Put(Places::TEXT, owner,
-                   SpotOf(firstArgument +
-                          (Contains(keyword, " COMMENT") && !Contains(keyword, "MODULE") ? 1 : 0)));
+        places.Put(
+            LocationMap::TEXT, owner,
+            LocationOf(firstArgument +
+                       (Contains(keyword, " COMMENT") && !Contains(keyword, "MODULE") ? 1 : 0)));
 }
 
 Origin Recorder::GetOrigin(Signal const *signal) const {

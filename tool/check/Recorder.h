@@ -6,7 +6,7 @@
 #include <vector>
 
 #include "tool/check/Findings.h"
-#include "tool/check/Places.h"
+#include "tool/check/LocationMap.h"
 #include "tool/check/Text.h"
 #include "tool/diagnostics/LineTokens.h"
 #include "vesk_hdl/Vesk_Hdl.h"
@@ -21,7 +21,7 @@ enum class Origin { DECLARED, COMPOUND, BRACKETS };
 /// After at what has become of them, so that a line costs its own length and not the design's.
 class Recorder {
 public:
-    Recorder(Vesk_Hdl::Model &watched, Places &madePlaces, Findings &foundThings)
+    Recorder(Vesk_Hdl::Model &watched, LocationMap &madePlaces, Findings &foundThings)
         : model(watched), netlist(*watched.GetNetlist()), places(madePlaces),
           findings(foundThings) {}
 
@@ -67,7 +67,9 @@ private:
     };
 
     Kind KindOf(Vesk_Hdl::CommandHelp const *command);
-    Spot SpotOf(int token) const { return Checks::SpotOf(*tokens, token, lineNumber); }
+    CompactLocation LocationOf(int token) const {
+        return Checks::LocationOf(*tokens, token, lineNumber);
+    }
     void Name(Text const &name, int token);
     bool NameOne(Text const &name, int token, Origin origin);
     void WatchBus(Text const &name, int token);
@@ -89,7 +91,7 @@ private:
 
     Vesk_Hdl::Model &model;
     Vesk_Hdl::Netlist &netlist;
-    Places &places;
+    LocationMap &places;
     Findings &findings;
 
     // The line that runs.

@@ -16,9 +16,9 @@ public:
 
 } // namespace
 
-void Rewrite(Session &session, Design const &design, Places &places, std::string const &line) {
+void Rewrite(Session &session, Design const &design, LocationMap &places, std::string const &line) {
     // A dummy signal was made where its port was.
-    std::vector<std::pair<Text, Spot>> dummyNames;
+    std::vector<std::pair<Text, CompactLocation>> dummyNames;
     auto const note = [&](Signal const &signal) {
         dummyNames.emplace_back(signal.GetDummySignalName(), design.NetAt(signal));
     };
@@ -40,7 +40,7 @@ void Rewrite(Session &session, Design const &design, Places &places, std::string
     for (auto const &[name, spot] : dummyNames)
         if (Signal const *const made = design.netlist.GetSignal(name)) {
             places.TakeOpen(made);
-            places.Put(Places::MADE, made, spot);
+            places.Put(LocationMap::MADE, made, spot);
         }
 }
 

@@ -62,7 +62,7 @@ public:
     }
 
 private:
-    void AddRefused(std::string_view text, bool inString, Languages languages, Spot spot,
+    void AddRefused(std::string_view text, bool inString, Languages languages, CompactLocation spot,
                     std::string const &subject) {
         for (Languages const language : {VHDL, VERILOG}) {
             auto const found = std::find_if(
@@ -80,7 +80,7 @@ private:
         }
     }
 
-    void AddDirective(std::string_view line, Languages languages, Spot spot,
+    void AddDirective(std::string_view line, Languages languages, CompactLocation spot,
                       std::string const &subject) {
         if (Languages const readers = DirectiveIn(line) & languages)
             design.findings.Add({Id::DIRECTIVE_COMMENT,
@@ -100,7 +100,7 @@ private:
         auto const count = static_cast<int>(std::count(rest.begin(), rest.end(), '\n'));
         std::string const subject =
             std::string("comment of ") + kind + " " + Quoted(object.GetNameRef().View());
-        for (Spot const spot : design.TextsAt(&object, count)) {
+        for (CompactLocation const spot : design.TextsAt(&object, count)) {
             std::string_view const line = rest.substr(0, rest.find('\n'));
             rest.remove_prefix(line.size() + 1);
             AddRefused(line, false, languages, spot, subject);
@@ -152,7 +152,7 @@ private:
         Text const value = isText ? attribute.GetValueString() : Text();
         if (!IsDoubtful(value.View()) && !IsDoubtful(attribute.GetNameRef().View()))
             return;
-        Spot spot = design.MadeAt(&attribute);
+        CompactLocation spot = design.MadeAt(&attribute);
         if (spot.line == 0)
             spot = design.MadeAt(use.owner);
         std::string const subject = "attribute " + Quoted(attribute.GetNameRef().View()) + " of " +
@@ -178,7 +178,7 @@ private:
 
     void CheckIncludes() {
         StringArray const &includes = options.verilogOption.includes;
-        std::vector<Spot> const spots = design.TextsAt(&includes, includes.GetSize());
+        std::vector<CompactLocation> const spots = design.TextsAt(&includes, includes.GetSize());
         WrittenText lines; // empty if none may fold
         lines.Add(0, [&includes](OutStream &stream) {
             VerilogStatements(stream).WriteIncludePath(includes);
@@ -186,7 +186,7 @@ private:
         lines.ReadFolds();
         std::size_t end = 0;
         for (int i = 0; i < includes.GetSize(); ++i) {
-            Spot const spot = spots[static_cast<std::size_t>(i)];
+            CompactLocation const spot = spots[static_cast<std::size_t>(i)];
             Text const path = HdlUtilities::RemoveQuotes(includes.At(i));
             std::string const subject = "include file " + Quoted(path.View());
             std::size_t const begin = end;

@@ -65,7 +65,7 @@ private:
     bool beyondLimit = false;
 };
 
-int CheckFiles(CheckOptions const &options, LimitedError &output, Place &place) {
+int CheckFiles(CheckOptions const &options, LimitedError &output, SourceRange &place) {
     Checks::Languages const requested = options.language == "vhdl"      ? Checks::VHDL
                                         : options.language == "verilog" ? Checks::VERILOG
                                         : options.language == "both"    ? Checks::BOTH
@@ -114,7 +114,7 @@ int Check(CheckOptions const &options) {
     Reporter reporter(std::cerr, style);
     LimitedError output(options.limits.output);
     MemoryLimit memory(options.limits.memory);
-    Place place;
+    SourceRange place;
     int exitCode = SOMETHING_REFUSED;
     try {
         memory.Apply();

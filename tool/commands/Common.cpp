@@ -101,7 +101,7 @@ std::function<std::string(char const *)> EndMessages(ReportStyle style, char con
     };
 }
 
-Diagnostic OutOfMemory(Place const &place, MemoryLimit const &limit) {
+Diagnostic OutOfMemory(SourceRange const &place, MemoryLimit const &limit) {
     Diagnostic diagnostic;
     diagnostic.place = place;
     diagnostic.message = limit.GetSize() == 0

@@ -57,7 +57,7 @@ std::function<std::string(char const *)> EndMessages(ReportStyle style, char con
                                                      char const *consequence);
 
 /// The memory did not do, at a place of a command file. The limit must be lifted by now.
-Diagnostic OutOfMemory(Place const &place, MemoryLimit const &limit);
+Diagnostic OutOfMemory(SourceRange const &place, MemoryLimit const &limit);
 
 /// Something about a file as a whole.
 Diagnostic About(std::string const &file, std::string const &message);

@@ -256,7 +256,7 @@ private:
     OutputFiles outputs;
     Progress progress;
     MemoryLimit memory;
-    Place place; ///< of the line that runs, or a file that is written
+    SourceRange place; ///< of the line that runs, or a file that is written
     Session *session = nullptr;
 };
 

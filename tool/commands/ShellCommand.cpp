@@ -239,7 +239,7 @@ private:
     MemoryLimit memory;
     std::string outputDir; ///< empty for the current folder
     Reporter reporter;
-    Place place{"<shell>"};
+    SourceRange place{"<shell>"};
 };
 
 } // namespace

@@ -5,7 +5,7 @@
 #include <vector>
 
 /// A place in a command file.
-struct Place {
+struct SourceRange {
     std::string file;       ///< as the user named it, "<stdin>" for standard input
     unsigned long line = 0; ///< from 1; 0 is the file as a whole
     unsigned column = 0;    ///< from 1, in bytes; 0 is the line as a whole
@@ -18,12 +18,12 @@ enum class Severity { ERROR, WARNING };
 /// written, a finding of `check`.
 struct Diagnostic {
     struct Note {
-        Place place;
+        SourceRange place;
         std::string text;
     };
 
     Severity severity = Severity::ERROR;
-    Place place;
+    SourceRange place;
     std::string message; ///< without an end of line; of a refused line the library's own text
     std::string source;  ///< the line that the place is in, shown with a caret; may be empty
     std::size_t sourceBegin = 0;    ///< bytes of the line in front of `source`, if that is a part

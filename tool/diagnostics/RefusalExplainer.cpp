@@ -24,7 +24,7 @@ namespace {
 /// A diagnostic of a line without its message, and the marking of what is wrong in the line.
 class LineDiagnostic {
 public:
-    LineDiagnostic(std::string const &line, Place const &place) : tokens(line) {
+    LineDiagnostic(std::string const &line, SourceRange const &place) : tokens(line) {
         diagnostic.place = place;
         diagnostic.source = line;
     }
@@ -54,8 +54,8 @@ protected:
 /// Explains a line that was refused. `refusal.getSubject()` is what the refusal is about.
 class RefusalExplainer : LineDiagnostic {
 public:
-    RefusalExplainer(std::string const &line, Place const &place, Basis::Exception const &refused,
-                     Model const &onModel, bool wantHints)
+    RefusalExplainer(std::string const &line, SourceRange const &place,
+                     Basis::Exception const &refused, Model const &onModel, bool wantHints)
         : LineDiagnostic(line, place), refusal(refused), model(onModel), withHints(wantHints),
           command(CommandReference::FindFor(tokens.GetTokens())) {
         // Messages of the library end in a line feed, which is not part of what is shown.
@@ -281,7 +281,7 @@ public:
 
 } // namespace
 
-Diagnostic ExplainRefusal(std::string const &line, Place const &place,
+Diagnostic ExplainRefusal(std::string const &line, SourceRange const &place,
                           Basis::Exception const &refusal, Model const &model, bool withHints) {
     return RefusalExplainer(line, place, refusal, model, withHints).Explain();
 }
@@ -290,10 +290,11 @@ std::string FailureOf(WriteStatus const &write) {
     return write.reason.IsEmpty() ? std::strerror(write.error) : write.reason.GetText();
 }
 
-Diagnostic ExplainWrite(std::string const &line, Place const &place, WriteStatus const &write) {
+Diagnostic ExplainWrite(std::string const &line, SourceRange const &place,
+                        WriteStatus const &write) {
     return FaultExplainer(line, place).ExplainWrite(write);
 }
 
-Diagnostic ExplainNul(std::string const &line, Place const &place, std::size_t at) {
+Diagnostic ExplainNul(std::string const &line, SourceRange const &place, std::size_t at) {
     return FaultExplainer(line, place).ExplainNul(at);
 }

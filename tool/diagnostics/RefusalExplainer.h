@@ -10,7 +10,7 @@
 
 /// A line that the model refused. Without hints, those that search the design are left out; the
 /// place is the same.
-Diagnostic ExplainRefusal(std::string const &line, Place const &place,
+Diagnostic ExplainRefusal(std::string const &line, SourceRange const &place,
                           Basis::Exception const &refusal, Vesk_Hdl::Model const &model,
                           bool withHints = true);
 
@@ -18,8 +18,8 @@ Diagnostic ExplainRefusal(std::string const &line, Place const &place,
 std::string FailureOf(Vesk_Hdl::WriteStatus const &write);
 
 /// A write command whose file did not reach the disk whole.
-Diagnostic ExplainWrite(std::string const &line, Place const &place,
+Diagnostic ExplainWrite(std::string const &line, SourceRange const &place,
                         Vesk_Hdl::WriteStatus const &write);
 
 /// A line with a NUL byte at the index.
-Diagnostic ExplainNul(std::string const &line, Place const &place, std::size_t at);
+Diagnostic ExplainNul(std::string const &line, SourceRange const &place, std::size_t at);

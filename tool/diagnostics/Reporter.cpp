@@ -99,7 +99,7 @@ public:
         return stream;
     }
     void Text(char const *name, std::string_view text) { Name(name) << JsonString(text); }
-    void Put(Place const &place) {
+    void Put(SourceRange const &place) {
         Text("file", place.file);
         Name("line") << place.line;
         Name("column") << place.column;
@@ -176,7 +176,7 @@ void Reporter::Put(Diagnostic const &diagnostic) {
 
 void Reporter::ReportText(Diagnostic const &diagnostic) {
     auto const colour = [this](char const *code) { return reportStyle.colour ? code : ""; };
-    auto const head = [&](Place const &place, Word const &word, std::string_view text) {
+    auto const head = [&](SourceRange const &place, Word const &word, std::string_view text) {
         stream << colour(BOLD) << SanitizeForTerminal(place.file);
         for (unsigned long const number : {place.line, static_cast<unsigned long>(place.column)})
             if (number > 0)

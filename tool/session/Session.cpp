@@ -13,7 +13,7 @@ Session::Session(std::string const &modelName) {
 }
 
 std::optional<Diagnostic> Session::RunLine(std::string const &line, StringArray const *tokens,
-                                           Place const &place) {
+                                           SourceRange const &place) {
     // The library takes the line as a C string and would run what is in front of the NUL.
     if (std::size_t const at = line.find('\0'); at != std::string::npos)
         return ExplainNul(line, place, at);

@@ -13,12 +13,12 @@ public:
 
     /// Runs a line. The result is a diagnostic if the line was refused, or if a file that it writes
     /// did not reach the disk whole; its place has the column of the token that is wrong.
-    std::optional<Diagnostic> RunLine(std::string const &line, Place const &place) {
+    std::optional<Diagnostic> RunLine(std::string const &line, SourceRange const &place) {
         return RunLine(line, nullptr, place);
     }
     /// The same with the line's tokens, where the caller has them already.
     std::optional<Diagnostic> RunLine(std::string const &line, Vesk_Hdl::StringArray const &tokens,
-                                      Place const &place) {
+                                      SourceRange const &place) {
         return RunLine(line, &tokens, place);
     }
 
@@ -33,7 +33,7 @@ public:
 
 private:
     std::optional<Diagnostic> RunLine(std::string const &line, Vesk_Hdl::StringArray const *tokens,
-                                      Place const &place);
+                                      SourceRange const &place);
 
     Vesk_Hdl::Engine engine;
     Vesk_Hdl::Model *model; ///< the engine's current one

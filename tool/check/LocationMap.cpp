@@ -1,11 +1,11 @@
-#include "tool/check/Places.h"
+#include "tool/check/LocationMap.h"
 
 #include <algorithm>
 #include <tuple>
 
 namespace Checks {
 
-Spot SpotOf(LineTokens const &tokens, int token, std::uint32_t line) {
+CompactLocation LocationOf(LineTokens const &tokens, int token, std::uint32_t line) {
     constexpr unsigned MOST = 0xFFFF;
     unsigned const column = tokens.GetColumn(token);
     unsigned const length = std::min(tokens.GetLength(token), MOST);
@@ -14,13 +14,13 @@ Spot SpotOf(LineTokens const &tokens, int token, std::uint32_t line) {
     return {line, static_cast<std::uint16_t>(column), static_cast<std::uint16_t>(length)};
 }
 
-void Places::BeginFile(std::string const &path, std::string const &shownName) {
+void LocationMap::BeginFile(std::string const &path, std::string const &shownName) {
     files.push_back({path, shownName, lineCount, nullptr});
     if (!LineReader::CanReadAgain(path))
         files.back().lines = std::make_unique<LineStore>();
 }
 
-std::uint32_t Places::NextLine(std::string const &text) {
+std::uint32_t LocationMap::NextLine(std::string const &text) {
     if (!files.empty() && files.back().lines)
         files.back().lines->Add(text);
     return ++lineCount;
@@ -28,12 +28,12 @@ std::uint32_t Places::NextLine(std::string const &text) {
 
 /// The tokens of a line are put from left to right, so that the last one put comes after the
 /// others.
-bool Places::Less::operator()(Entry const &left, Entry const &right) const {
+bool LocationMap::Less::operator()(Entry const &left, Entry const &right) const {
     return std::tie(left.key, left.spot.line, left.spot.column) <
            std::tie(right.key, right.spot.line, right.spot.column);
 }
 
-void Places::Sort() const {
+void LocationMap::Sort() const {
     auto const middle = entries.begin() + static_cast<std::ptrdiff_t>(sortedCount);
     std::sort(middle, entries.end(), Less());
     std::inplace_merge(entries.begin(), middle, entries.end(), Less());
@@ -42,7 +42,7 @@ void Places::Sort() const {
 }
 
 /// A clean design asks for few places, for which a walk costs less than sorting them all.
-Spot Places::Find(Event event, void const *object, std::uint32_t before) const {
+CompactLocation LocationMap::Find(Event event, void const *object, std::uint32_t before) const {
     if (sortedCount < entries.size() && ++walks > MAX_WALKS)
         Sort();
     Entry const end{KeyOf(event, object), {before, 0, 0}};
@@ -57,15 +57,15 @@ Spot Places::Find(Event event, void const *object, std::uint32_t before) const {
 }
 
 /// The last file that begins before the line.
-std::size_t Places::FileOf(std::uint32_t line) const {
+std::size_t LocationMap::FileOf(std::uint32_t line) const {
     auto const after =
         std::partition_point(files.begin() + 1, files.end(),
                              [line](File const &file) { return file.linesBefore < line; });
     return static_cast<std::size_t>(after - files.begin()) - 1;
 }
 
-Place Places::GetPlace(Spot spot) const {
-    Place place;
+SourceRange LocationMap::GetPlace(CompactLocation spot) const {
+    SourceRange place;
     if (files.empty())
         return place;
     File const &file = files[spot.line == 0 ? 0 : FileOf(spot.line)];
@@ -76,7 +76,7 @@ Place Places::GetPlace(Spot spot) const {
     return place;
 }
 
-std::string const *Places::SourceReader::Get(std::uint32_t line) {
+std::string const *LocationMap::SourceReader::Get(std::uint32_t line) {
     if (line == 0 || places.files.empty())
         return nullptr;
     std::size_t const wanted = places.FileOf(line);

@@ -14,19 +14,19 @@
 
 namespace Checks {
 
-/// A place in the command files, whose lines are counted through: small, since a large design has
-/// as many of them as it has objects and connections.
-struct Spot {
+/// A place in the command files, whose lines have one count over all files. It is small, since a
+/// large design has as many of them as it has objects and connections.
+struct CompactLocation {
     std::uint32_t line = 0; ///< from 1; 0 is unknown
     std::uint16_t column = 0;
     std::uint16_t length = 0;
 };
 
-/// The place of a token, or its line as a whole if that is too far to the right for a spot.
-Spot SpotOf(LineTokens const &tokens, int token, std::uint32_t line);
+/// The place of a token, or its whole line if the column is too large for a CompactLocation.
+CompactLocation LocationOf(LineTokens const &tokens, int token, std::uint32_t line);
 
-/// Who was made, connected, or given a constant or a text where.
-class Places {
+/// Which line made an object, connected it, or gave it a constant or a text.
+class LocationMap {
 public:
     enum Event : std::uintptr_t { MADE = 0, CONNECTED = 1, CONSTANT = 2, ASSIGNED = 3, TEXT = 4 };
     static constexpr std::uint32_t EVER = UINT32_MAX;
@@ -36,12 +36,12 @@ public:
     /// Counts a line and gives its number. Of an input that cannot be read again the text is kept.
     std::uint32_t NextLine(std::string const &text);
 
-    void Put(Event event, void const *object, Spot spot) {
+    void Put(Event event, void const *object, CompactLocation spot) {
         entries.push_back({KeyOf(event, object), spot});
     }
     /// The last place that was put before a line. An object that died may have left its address to
     /// another: ask for the former one with the line at which it was alive.
-    Spot Find(Event event, void const *object, std::uint32_t before = EVER) const;
+    CompactLocation Find(Event event, void const *object, std::uint32_t before = EVER) const;
 
     /// A net that a write gave to an open pin has no place, and no check looks at it.
     void PutOpen(void const *net) { openNets.insert(net); }
@@ -50,17 +50,17 @@ public:
     /// When a line speaks of the net, it becomes one of that line's. Whether it was open.
     bool TakeOpen(void const *net) { return !openNets.empty() && openNets.erase(net) > 0; }
 
-    Place GetPlace(Spot spot) const;
+    SourceRange GetPlace(CompactLocation spot) const;
 
     /// Reads lines again, one at a time.
     class SourceReader {
     public:
-        explicit SourceReader(Places const &readPlaces) : places(readPlaces) {}
+        explicit SourceReader(LocationMap const &readPlaces) : places(readPlaces) {}
         /// The text of a line, null if it cannot be read. Lines are asked for in ascending order.
         std::string const *Get(std::uint32_t line);
 
     private:
-        Places const &places;
+        LocationMap const &places;
         std::size_t file = 0;
         std::unique_ptr<LineReader> reader; ///< of the file
         std::uint32_t lineRead = 0;
@@ -70,7 +70,7 @@ public:
 private:
     struct Entry {
         std::uintptr_t key;
-        Spot spot;
+        CompactLocation spot;
     };
     struct File {
         std::string path;

@@ -1,6 +1,6 @@
 // The least that could do the tool's work on a plain design: it reads the same commands and writes
-// about the same text, but checks nothing, sorts nothing and does not distinguish a bus from a scalar. The
-// difference to the tool is the cost of the tool's rules.
+// about the same text, but checks nothing, sorts nothing and does not distinguish a bus from a
+// scalar. The difference to the tool is the cost of the tool's rules.
 
 #include <cstdio>
 #include <cstdlib>

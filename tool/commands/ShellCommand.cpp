@@ -44,7 +44,7 @@ std::string HistoryFile() {
     char const *const home = std::getenv("HOME");
     if (!(state && *state) && !(home && *home))
         return "";
-    // The XDG base directory specification has this folder for data that outlasts a run and is no
+    // The XDG base directories have this folder for data that outlasts a run and is no
     // configuration.
     fs::path const folder =
         (state && *state ? fs::path(state) : fs::path(home) / ".local" / "state") / "vesk-hdl";

@@ -123,8 +123,9 @@ public:
 
     /// Gives a dummy signal to each out port that is read inside, each in port that is driven
     /// inside, and each out port with several drivers: VHDL forbids the first two (IEEE 1076-1993,
-    /// 1.1.1.2 and 4.3.2), and the third has no single source. The connections move to the dummy,
-    /// and one assignment joins port and dummy. Both writers call it.
+    /// 1.1.1.2 and 4.3.2), and several drivers meet on a net inside, not on the port. The
+    /// connections move to the dummy, and one assignment joins port and dummy. Both writers call
+    /// it.
     void CreateVhdlDummySignals();
     /// The part of it for in ports. Neither writer calls it; it is for clients.
     void CreateVerilogDummySignals();

@@ -208,7 +208,7 @@ public:
     static bool ParseBusName(Basis::StringBase<char> const &name, Basis::StringBase<char> &base,
                              int &left, int &right);
     /// Appends the name of each bit, BASE(INDEX), from left to right to `bits`. These are as many
-    /// as the bus is wide, which a name of a few characters can make two thousand million. False,
+    /// as the bus is wide, which can be 2,147,483,647 bits with a name of a few characters. False,
     /// and nothing is appended, if it is no bus name.
     static bool ParseBusName(Basis::StringBase<char> const &name, StringArray &bits);
     /// The name of `count` bits from position `start` on, counted from 0 at the left bound: an

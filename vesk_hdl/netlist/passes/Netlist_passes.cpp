@@ -1,6 +1,7 @@
 // The rewriting before a write. A drawing may read an out port, drive an in port and join several
-// drivers on an out port; VHDL forbids the first two (IEEE 1076-1993, 1.1.1.2 and 4.3.2) and gives
-// the third no single source. These passes change the netlist for good and know nothing of text.
+// drivers on an out port; VHDL forbids the first two (IEEE 1076-1993, 1.1.1.2 and 4.3.2), and
+// several drivers meet on a net inside, not on the port. These passes change the netlist for good
+// and know nothing of text.
 
 #include "vesk_hdl/netlist/Netlist.h"
 

@@ -49,8 +49,8 @@ private:
     bool isIndexed = false;
 };
 
-/// Makes the dummy signals of the steps, which were decided for the netlist as it is now. The name of
-/// each scalar and bus is looked up again at its turn, and that lookup decides. With
+/// Makes the dummy signals of the steps, which were decided for the netlist as it is now. The name
+/// of each scalar and bus is looked up again at its turn, and that lookup decides. With
 /// `portTakesDummy` each net is assigned from its dummy, otherwise the dummy from the net.
 void ApplyDummySteps(Netlist &netlist, DummySteps const &plan, bool portTakesDummy);
 
